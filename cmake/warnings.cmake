@@ -1,0 +1,22 @@
+# What every target of ours is compiled with.
+add_library(tolvaris_options INTERFACE)
+target_include_directories(tolvaris_options INTERFACE ${PROJECT_SOURCE_DIR})
+target_compile_features(tolvaris_options INTERFACE cxx_std_20)
+target_compile_options(tolvaris_options INTERFACE
+  $<$<COMPILE_LANGUAGE:CXX>:-Wall -Wextra -Wpedantic -Wshadow -Wconversion -Werror>)
+if(TOLVARIS_SANITIZE)
+  target_compile_options(tolvaris_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
+    -fno-omit-frame-pointer)
+  target_link_options(tolvaris_options INTERFACE -fsanitize=address,undefined)
+endif()
+if(WIN32)
+  target_compile_options(tolvaris_options INTERFACE $<$<COMPILE_LANGUAGE:CXX>:-ffunction-sections -fdata-sections>)
+  target_link_options(tolvaris_options INTERFACE -static -Wl,--gc-sections $<$<NOT:$<CONFIG:Debug>>:-s>)
+endif()
+
+# A static library of all sources of one folder: tolvaris_folder(NAME FOLDER LIBRARIES...).
+function(tolvaris_folder name folder)
+  file(GLOB sources CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/${folder}/*.cpp)
+  add_library(${name} STATIC ${sources})
+  target_link_libraries(${name} PUBLIC tolvaris_options ${ARGN})
+endfunction()

@@ -1,0 +1,21 @@
+// The event pump of the window thread.
+#pragma once
+
+#include <cstdint>
+
+namespace platform {
+
+// Handles every event that waits, and returns at once when none does.
+void RunPendingEvents();
+
+// Handles events until the main window (the first one created) is closed.
+void RunEventLoop();
+
+// Does nothing for so many milliseconds.
+void Sleep(std::uint32_t milliseconds);
+
+// Size of the screen's work area in twips.
+int ScreenWidth();
+int ScreenHeight();
+
+}  // namespace platform

@@ -1,0 +1,16 @@
+// Initialisation files: sections in brackets, one key=value a line.
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+namespace platform {
+
+// The value of a key, at most `bufferSize` - 1 characters of it, or `defaultValue` when the file, the section or the
+// key is missing. Section and key match without regard to letter case; blanks around key and value are dropped, and
+// one pair of quotes around the value.
+std::string GetPrivateProfileStringA(const std::string& section, const std::string& key,
+                                     const std::string& defaultValue, std::size_t bufferSize,
+                                     const std::string& file);
+
+}  // namespace platform

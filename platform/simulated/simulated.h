@@ -1,0 +1,125 @@
+// The test's side of the machine in memory: what stands on its disks and in its registry, what its user does, and what
+// goes wrong. Only tests include this. Reset() first: every test starts on a fresh machine.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/controls.h"
+#include "platform/messages.h"
+
+namespace platform::simulated {
+
+// A machine with an empty disk C: (10 GB free), the program in C:\Tolvaris, no drive A:, an empty registry and a user
+// with no answers queued. Nothing fails.
+void Reset();
+
+// --- Disks. Paths match without regard to letter case; attribute sets are those of platform/files.h.
+
+void AddDisk(char letter, std::uint64_t freeBytes);  // an empty disk; also "a disk is put into the drive"
+void RemoveDisk(char letter);                        // with all that is on it
+void SetFreeSpace(char letter, std::uint64_t bytes);
+void SetProgramDirectory(const std::string& directory);
+
+void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);  // with its parents
+void PutFile(const std::string& path, std::string_view content, std::uint32_t attributes = 0x20);  // with its parents
+void SetAttributes(const std::string& path, std::uint32_t attributes);
+void LockFile(const std::string& path, bool locked = true);  // as if another program held it: cannot be opened, replaced, deleted
+void RemoveFile(const std::string& path);
+std::optional<std::string> Content(const std::string& path);  // of a file; nothing when there is none
+bool DirectoryStands(const std::string& path);
+std::vector<std::string> AllFiles();               // full paths, ascending
+std::uint64_t WriteCount(const std::string& path);  // how often the file's content was changed or replaced, ever
+std::uint64_t WritesEver();                         // all files together
+
+// Everything that was not flushed to the disk (File::Flush, MoveFileExA, CopyFileA) is as it was before; open files are
+// closed. A file that was created but never flushed is empty or half written.
+void CutPower();
+
+// --- Registry, below HKEY_CURRENT_USER.
+
+struct RegistryValue {
+  std::uint32_t Type;
+  std::string Data;  // the stored bytes
+};
+void PutValue(const std::string& key, const std::string& name, std::uint32_t type, std::string_view data);
+void PutText(const std::string& key, const std::string& name, const std::string& text);  // REG_SZ with its zero
+std::optional<RegistryValue> StoredValue(const std::string& key, const std::string& name);
+std::optional<std::string> StoredText(const std::string& key, const std::string& name);  // a REG_SZ without its zero
+std::vector<std::string> Keys();                                                          // every key's full path
+void DenyKey(const std::string& key, bool denied = true);  // can no longer be opened
+
+// --- Faults.
+
+// The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry and processes. Writes that
+// fail have written half of their bytes. 0: none. Reset by Reset().
+void FailCall(int n);
+bool CallFailed();  // whether the fault has been reached
+
+// --- Other programs.
+
+struct StartedProcess {
+  std::string CommandLine, Directory;
+  std::uint32_t CreationFlags;
+};
+const std::vector<StartedProcess>& StartedProcesses();
+
+// What happens when a command line that starts with `program` is started: `run` is called when the process is waited
+// for the `waits`-th time (or at its start when 0), and then it has ended. A program that is not a file on a disk does
+// not start; one that is, but was not given a behaviour, runs for ever.
+void OnProcess(const std::string& program, int waits, std::function<void()> run);
+void RefuseToStart(const std::string& program);
+
+// --- The user.
+
+struct ShownMessage {
+  std::string Text, Title;
+  Buttons Choice;
+  Icon Symbol;
+  bool operator==(const ShownMessage&) const = default;
+};
+// Answers to message boxes, in order. With none queued a message gets Ok, or Cancel where there is no Ok.
+void QueueAnswer(Answer answer);
+void QueueAnswer(Answer answer, std::function<void()> meanwhile);  // what happens before the answer is given
+const std::vector<ShownMessage>& ShownMessages();
+void ForgetMessages();
+
+void QueueFileDialog(const std::string& path);  // what the next file dialog ends with; empty, or none queued: Cancel
+const std::vector<OpenFileName>& ShownFileDialogs();  // as they were asked
+
+// Runs when the next modal window is shown, as the user in front of it. The window closes afterwards if the script did
+// not close it. With none queued a modal window is closed at once.
+void QueueModal(std::function<void(Window&)> script);
+
+// Events that wait: each runs the next time that the program lets pending events run (all that wait at that moment,
+// in order). Pending() tells how many are left.
+void QueueEvent(std::function<void()> event);
+int Pending();
+int PendingEventRuns();  // how often the program has let pending events run since Reset
+
+// What a user's hand does; nothing on a control or window that is disabled or hidden.
+void Click(Button& button);
+void Click(ImageButton& button);
+void Click(CheckBox& box);                     // changes its value
+void Choose(ListBox& list, int index);         // selects and clicks
+void Choose(ComboBox& box, int index);
+void DoubleClick(ListBox& list);
+void PressKey(ListBox& list, int keyCode);
+void CloseWindow(Window& window);              // its close box
+void Tick(Timer& timer);                       // one tick, when the timer is enabled
+
+// --- What stands on the screen.
+
+bool IsShown(const Window& window);
+const Control* Focused();        // the control that has the keyboard focus, or null
+int IconOf(const Button& button);  // its icon's number, 0: none
+int ResourceOf(const Picture& picture);            // the resource it came from, 0: none
+std::string ContentOf(const Picture& picture);     // the file content it came from
+std::uint64_t SleptMilliseconds();                 // since Reset; time passes only by sleeping and waiting
+void SetScreen(int widthTwips, int heightTwips);   // 15360 x 11520 after Reset
+
+}  // namespace platform::simulated
