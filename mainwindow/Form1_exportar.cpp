@@ -1,0 +1,112 @@
+// The export command: the selected game as a plain copy of its ROM file, or as a package.
+#include "mainwindow/Form1.h"
+#include "mainwindow/arquivos_de_jogos.h"
+#include "mainwindow/mensagens.h"
+#include "package/pacote.h"
+#include "platform/events.h"
+#include "platform/text.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_CommonDialog.h"
+#include "support/mod_Traducao.h"
+
+namespace {
+
+using platform::RunPendingEvents;
+
+enum class Desfecho { Salvo, Desistencia, ErroDeLeitura, ErroDeGravacao, ErroInesperado };
+
+struct Oferta {
+  std::string Filtro, ExtensaoPadrao;  // as the save dialog takes them
+};
+
+void Oferecer(Oferta& Ofertas, const std::string& Rotulo, const std::string& Padrao) {
+  Ofertas.Filtro.append(Rotulo).append(1, '\0').append(Padrao).append(1, '\0');
+}
+
+// What the game can be saved as. A package needs a picture and a catalogue entry.
+Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
+  Oferta Ofertas;
+  if (TemImagem && Escolhido.Catalogado) {
+    Oferecer(Ofertas, Traduzir("Arquivo Tolvaris (*.tvk)"), "*.tvk");
+    Ofertas.ExtensaoPadrao = "tvk;";
+  }
+  const std::string Tipo = TipoDoArquivo(Escolhido.Arquivo);
+  if (Tipo == "ZIP") {
+    Oferecer(Ofertas, Traduzir("Arquivo ZIP (*.zip)"), "*.zip");
+    Ofertas.ExtensaoPadrao += "zip";
+  } else if (Tipo == "SMC") {
+    Oferecer(Ofertas, Traduzir("Arquivo SMC (*.smc)"), "*.smc");
+    Ofertas.ExtensaoPadrao += "smc";
+  } else {
+    Oferecer(Ofertas, Tipo, "*.*");
+    Ofertas.ExtensaoPadrao += Escolhido.Arquivo.substr(Escolhido.Arquivo.size() - Tipo.size());
+  }
+  return Ofertas;
+}
+
+std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemImagem) {
+  Oferta Ofertas = TiposOferecidos(Escolhido, TemImagem);
+  return SalvarArquivo(Dono, "", Traduzir("Salvar como..."), Ofertas.ExtensaoPadrao, Escolhido.Nome, Ofertas.Filtro,
+                       platform::HideReadOnly);
+}
+
+Desfecho SalvarCopia(const Jogo& Escolhido, const std::string& Destino) {
+  const std::string Conteudo = LerArquivo(Escolhido.Arquivo);
+  if (Conteudo.empty()) return Desfecho::ErroDeLeitura;
+  RunPendingEvents();
+  return GravarInteiro(Destino, Conteudo) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
+}
+
+Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const std::string& Destino) {
+  const auto Soma = CRCDoArquivo(Escolhido.Arquivo);
+  if (!Soma) return Desfecho::ErroInesperado;
+  RunPendingEvents();
+  const std::string Pacote =
+      MontarPacote(Escolhido.Nome, Escolhido.DOSName, *Soma, TamanhoArquivo(ArquivoImagem),
+                   TamanhoArquivo(Escolhido.Arquivo), LerArquivo(ArquivoImagem), LerArquivo(Escolhido.Arquivo));
+  RunPendingEvents();
+  return GravarInteiro(Destino, Pacote) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
+}
+
+Desfecho Salvar(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
+  const std::string Destino = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
+  if (Destino.empty()) return Desfecho::Desistencia;
+  if (ArquivoExiste(Destino) && !ConfirmarSubstituicao("Arquivo já existente."_ansi)) return Desfecho::Desistencia;
+  RunPendingEvents();
+  return TipoDoArquivo(Destino) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, Destino)
+                                         : SalvarCopia(Escolhido, Destino);
+}
+
+Desfecho SalvarSemExcecao(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
+  try {
+    return Salvar(Dono, Escolhido, ArquivoImagem);
+  } catch (...) {
+    return Desfecho::ErroInesperado;
+  }
+}
+
+void MostrarDesfecho(Desfecho Fim) {
+  switch (Fim) {
+    case Desfecho::Salvo:
+      return MostrarAviso("Arquivo salvo.", "Ok");
+    case Desfecho::ErroDeLeitura:
+      return ErroAoLer();
+    case Desfecho::ErroDeGravacao:
+      return ErroAoGravar();
+    case Desfecho::ErroInesperado:
+      RunPendingEvents();
+      return MostrarErro("Erro ao salvar arquivo.");
+    case Desfecho::Desistencia:
+      return;
+  }
+}
+
+}  // namespace
+
+void Form1::Command5_Click() {
+  const auto Escolhido = JogoSelecionado();
+  if (!Escolhido) return;
+  Desativar(false);
+  MostrarDesfecho(SalvarSemExcecao(*this, *Escolhido, CaminhoImagem(IndiceJogo(Escolhido->Nome))));
+  Ativar(true);
+}

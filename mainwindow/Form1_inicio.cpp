@@ -1,0 +1,130 @@
+// Start-up and shutdown of the main window.
+#include "catalog/cls_DAT.h"
+#include "controller/Form3.h"
+#include "mainwindow/Form1.h"
+#include "mainwindow/ajustes.h"
+#include "mainwindow/mensagens.h"
+#include "platform/events.h"
+#include "platform/files.h"
+#include "platform/registry.h"
+#include "platform/text.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+#include "support/mod_Traducao.h"
+#include "support/mod_exe.h"
+
+namespace {
+
+void DefinirDirPrograma() {
+  DirPrograma = platform::ProgramDirectory();
+  if (!DirPrograma.ends_with('\\')) DirPrograma += '\\';
+}
+
+bool PerguntarPelaConfiguracao() {
+  const std::string Pergunta = Traduzir("O Tolvaris não foi configurado."_ansi) + "\r\n" +
+                               Traduzir("Clique em 'Sim' para rodar o programa de auto-configuração."_ansi);
+  return platform::MessageBoxA(Pergunta, Traduzir("Configuração"_ansi), platform::Buttons::YesNoCancel,
+                               platform::Icon::Information) == platform::Answer::Yes;
+}
+
+void AvisarSemConfiguracao() {
+  const std::string Aviso =
+      Traduzir("Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado."_ansi) +
+      "\r\n" + Traduzir("Reinstale o programa.");
+  platform::MessageBoxA(Aviso, Traduzir("Erro"), platform::Buttons::Ok, platform::Icon::Critical);
+}
+
+}  // namespace
+
+bool Form1::Form_Load() {
+  for (Configuracao Estado = Configuracao::Repetir; Estado == Configuracao::Repetir;) {
+    if (JogoIniciado) {
+      Close();
+      return false;
+    }
+    DefinirDirPrograma();
+    Catalogo().Carregar();
+    EscolherIdioma();
+    RestaurarJanela();
+    LerCaminhos();
+    Estado = VerificarConfiguracao();
+    if (Estado == Configuracao::Desistir) {
+      Close();
+      return false;
+    }
+  }
+  TraduzirControles();
+  platform::RunPendingEvents();
+  CarregarLista(false);
+  platform::RunPendingEvents();
+  MostrarControleNaPrimeiraVez();
+  return true;
+}
+
+void Form1::EscolherIdioma() {
+  ArquivoIdioma = DirPrograma + "language.ini";
+  if (!ArquivoExiste(ArquivoIdioma)) ArquivoIdioma.clear();
+}
+
+void Form1::RestaurarJanela() {
+  Check1.SetValue(EstadoDisquete(LerTexto("Disquete")));
+  if (const auto Esquerda = EsquerdaInicial(LerTexto("pl"), Width(), platform::ScreenWidth())) SetLeft(*Esquerda);
+  if (const auto Topo = TopoInicial(LerTexto("pt"), Height(), platform::ScreenHeight())) SetTop(*Topo);
+}
+
+void Form1::LerCaminhos() {
+  struct Caminho {
+    std::string& Destino;
+    const char* Ajuste;
+    std::string Padrao;
+  };
+  const Caminho Caminhos[] = {
+      {DirRoms, "RomDir", DirPrograma + "Roms\\"}, {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
+      {DirImgs, "ImgDir", DirPrograma + "Imgs\\"}, {ArquivoEmulador, "EmuExe", ""},
+      {ArquivoCfgEmulador, "EmuCFG", ""},
+  };
+  for (const Caminho& Cada : Caminhos) {
+    Cada.Destino = CaminhoConfigurado(LerTexto(Cada.Ajuste), Cada.Padrao, DirPrograma);
+  }
+}
+
+Form1::Configuracao Form1::VerificarConfiguracao() {
+  if (!ArquivoEmulador.empty() && !ArquivoCfgEmulador.empty()) return Configuracao::Pronta;
+  const std::string Configurador = DirPrograma + "tolvariscfg.exe";
+  if (!ArquivoExiste(Configurador)) {
+    AvisarSemConfiguracao();
+    return Configuracao::Desistir;
+  }
+  if (!PerguntarPelaConfiguracao()) return Configuracao::Desistir;
+  std::string Diretorio = DirPrograma;
+  ExecutarPrograma(Configurador, 500, true, 2, Diretorio);
+  platform::RunPendingEvents();
+  return Configuracao::Repetir;
+}
+
+void Form1::TraduzirControles() {
+  Command1.SetCaption(Traduzir(Command1.Caption()));
+  for (platform::Control* Cada :
+       {static_cast<platform::Control*>(&Check1), static_cast<platform::Control*>(&Command2),
+        static_cast<platform::Control*>(&Command3), static_cast<platform::Control*>(&Command4),
+        static_cast<platform::Control*>(&Command5), static_cast<platform::Control*>(&Command6)}) {
+    Cada->SetToolTip(Traduzir(Cada->ToolTip()));
+  }
+}
+
+void Form1::MostrarControleNaPrimeiraVez() {
+  const std::string Mostrado = LerTexto("AvisoControle");
+  if (Mostrado == "1" || Mostrado == "2") return;
+  Form3::ABRIR();
+  GravarAjuste("AvisoControle", "1");
+}
+
+std::string Form1::LerTexto(const std::string& Ajuste) const {
+  return TextoDe(Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, Ajuste));
+}
+
+void Form1::GravarAjuste(const std::string& Ajuste, const std::string& Texto) const {
+  Registro.SetValue(platform::RootCurrentUser, ChaveConfiguracao, Ajuste, Texto);
+}
+
+void Form1::Form_Unload() { Form3::Descarregar(); }

@@ -1,0 +1,102 @@
+// The play command.
+#include "mainwindow/Form1.h"
+#include "mainwindow/configuracao_emulador.h"
+#include "mainwindow/mensagens.h"
+#include "platform/events.h"
+#include "platform/registry.h"
+#include "platform/text.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+#include "support/mod_exe.h"
+
+namespace {
+
+// Points the emulator at the program's directories. When that fails the game starts all the same, with the emulator's
+// old settings.
+void ConfigurarEmulador(const std::string& DirSavesDoJogo) {
+  if (!ArquivoExiste(ArquivoCfgEmulador)) {
+    GravarArquivo(ArquivoCfgEmulador, ConfiguracaoNova(DirSavesDoJogo, DirRoms), 1, true);
+    return;
+  }
+  const auto Nova = ConfiguracaoAtualizada(LerArquivo(ArquivoCfgEmulador, 1, -1), DirSavesDoJogo, DirRoms);
+  if (Nova) GravarArquivo(ArquivoCfgEmulador, *Nova, 1, true);
+}
+
+}  // namespace
+
+void Form1::Command1_Click() {
+  if (List1.Selected() == -1) {
+    List1.SetFocus();
+    return;
+  }
+  const std::string Nome = NomeSelecionado();
+  const auto Escolhido = JogoSelecionado();
+  if (!Escolhido) return;
+  if (!ArquivoExiste(ArquivoEmulador)) {
+    MostrarErro("O emulador ZSnes não foi encontrado."_ansi);
+    return;
+  }
+  platform::RunPendingEvents();
+  const auto DirSavesEscolhido = DirSavesDoJogo();
+  if (!DirSavesEscolhido) return;
+  AvisarALTF4();
+  ConfigurarEmulador(*DirSavesEscolhido);
+  GravarAjustes(Nome);
+  platform::RunPendingEvents();
+  IniciarEmulador(*Escolhido);
+  JogoIniciado = true;
+}
+
+std::optional<Jogo> Form1::JogoSelecionado() const {
+  const int Linha = List1.Selected() == -1 ? -1 : IndiceJogo(NomeSelecionado());
+  if (Linha == -1) {
+    ErroJogoDesconhecido();
+    return std::nullopt;
+  }
+  const Jogo& Selecionado = Jogos[static_cast<std::size_t>(Linha)];
+  if (!ArquivoExiste(Selecionado.Arquivo)) {
+    ErroJogoNaoEncontrado();
+    return std::nullopt;
+  }
+  return Selecionado;
+}
+
+// Where the emulator keeps the saves of this launch. Nothing when the user wanted the floppy and gave up waiting for
+// one.
+std::optional<std::string> Form1::DirSavesDoJogo() {
+  if (Check1.Value() != 1) return DirSaves;
+  if (EsperarDisquete()) return "A:\\";
+  Check1.SetFocus();
+  Ativar(true);
+  if (List1.Selected() != -1) Ativar(false);
+  return std::nullopt;
+}
+
+bool Form1::EsperarDisquete() {
+  while (!DisqueteNoDrive()) {
+    if (!PedirDisquete()) return false;
+  }
+  return true;
+}
+
+void Form1::AvisarALTF4() {
+  if (LerTexto("AvisoALTF4") == "1") return;
+  MostrarAviso("Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'",
+               "Informação"_ansi);
+  GravarAjuste("AvisoALTF4", "1");
+}
+
+void Form1::GravarAjustes(const std::string& UltimoJogo) {
+  GravarAjuste("LRom", UltimoJogo);
+  GravarAjuste("Disquete", std::to_string(Check1.Value()));
+  GravarAjuste("pl", std::to_string(Left()));
+  GravarAjuste("pt", std::to_string(Top()));
+}
+
+// The command line has no quotes: the short form of the ROM's path needs none.
+void Form1::IniciarEmulador(const Jogo& Escolhido) {
+  const auto Barra = ArquivoEmulador.rfind('\\');
+  if (Barra == std::string::npos) return;
+  std::string Diretorio = ArquivoEmulador.substr(0, Barra);
+  ExecutarPrograma(ArquivoEmulador + " " + Escolhido.ArquivoCurto, 100, false, 2, Diretorio);
+}

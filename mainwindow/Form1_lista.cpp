@@ -1,0 +1,140 @@
+// The list of games and the window's busy state.
+#include <initializer_list>
+
+#include "catalog/cls_DAT.h"
+#include "mainwindow/Form1.h"
+#include "platform/events.h"
+#include "platform/files.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+#include "support/mod_Traducao.h"
+
+namespace {
+
+constexpr char PadraoRoms[] = "*.zip;*.smc";
+constexpr int TeclaEnter = 13;
+
+void CriarDiretoriosQueFaltam() {
+  for (const std::string* Diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
+    if (!DiretorioExiste(*Diretorio)) CriarCaminho(*Diretorio);
+  }
+}
+
+// The directory listing carries each file's own short name; asking the disk again, file by file, costs milliseconds
+// each in a large directory.
+Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto) {
+  Jogo Novo;
+  const auto Ponto = Entrada.Name.rfind('.');
+  if (Ponto == std::string::npos) return Novo;
+  std::int16_t Encontrado = 0;
+  Novo.Nome = Catalogo().DefineNome(Entrada.Name.substr(0, Ponto), Encontrado);
+  Novo.Catalogado = Encontrado != 0;
+  if (Novo.Catalogado) Novo.DOSName = Catalogo().DefineDOSName(Novo.Nome);
+  Novo.ArquivoCurto = DirCurto + (Entrada.ShortName.empty() ? Entrada.Name : Entrada.ShortName);
+  Novo.Arquivo = DirRoms + Entrada.Name;
+  return Novo;
+}
+
+void Habilitar(std::initializer_list<platform::Control*> Controles, bool Habilitado) {
+  for (platform::Control* Controle : Controles) {
+    if (Controle->Enabled() != Habilitado) Controle->Enable(Habilitado);
+  }
+}
+
+}  // namespace
+
+void Form1::CarregarLista(bool IgnorarUltimo) {
+  Desativar(true);
+  List1.Select(-1);
+  List1.Clear();
+  SetCaption(Traduzir("Carregando..."));
+  platform::RunPendingEvents();
+  CriarDiretoriosQueFaltam();
+  Catalogo().Atualizar();  // also for an empty list: after the downloader the catalogue is closed until here
+  const auto Arquivos = platform::ListDirectory(DirRoms, PadraoRoms);
+  if (Arquivos.empty()) {
+    SetCaption(TituloPrograma());
+    Image1.SetPicture(Picture1);
+    Ativar(true);
+    return;
+  }
+  EncherLista(Arquivos);
+  if (IgnorarUltimo) {
+    Ativar(true);
+  } else {
+    SelecionarUltimo();
+  }
+  MostrarImagem();
+  SetCaption(TituloPrograma());
+}
+
+void Form1::EncherLista(const std::vector<platform::DirectoryEntry>& Arquivos) {
+  const std::string DirCurto = CaminhoCurto(DirRoms);
+  Jogos.assign(Arquivos.size(), Jogo{});
+  List1.SetRedraw(false);
+  for (std::size_t i = 0; i < Arquivos.size(); ++i) {
+    Jogos[i] = LerJogo(Arquivos[i], DirCurto);
+    if (i % 10 == 0) platform::RunPendingEvents();
+    if (!Jogos[i].Arquivo.empty()) List1.Add(Jogos[i].Nome);
+  }
+  List1.SetRedraw(true);
+}
+
+void Form1::SelecionarUltimo() {
+  const std::string Ultimo = LerTexto("LRom");
+  if (Ultimo.empty()) {
+    Ativar(true);
+    return;
+  }
+  SelecionarNome(Ultimo);
+  Ativar(false);
+}
+
+void Form1::SelecionarNome(const std::string& Nome) {
+  const int Indice = List1.FindExact(Nome);
+  List1.Select(Indice);
+  if (Indice >= 0) List1_Click();
+}
+
+void Form1::Desativar(bool Total) {
+  Habilitar({&Command1, &Command2, &Command3, &Command4, &Command5, &Command6, &Check1}, false);
+  if (Total) {
+    Habilitar({&List1}, false);
+    if (Image1.Visible()) Image1.Show(false);
+  }
+  platform::RunPendingEvents();
+}
+
+void Form1::Ativar(bool NemTudo) {
+  if (List1.Selected() == -1) NemTudo = true;
+  if (!NemTudo) Habilitar({&Command1, &Command5, &Command6}, true);
+  Habilitar({&Command2, &Command3, &Command4, &Check1, &List1}, true);
+  if (!Image1.Visible()) Image1.Show(true);
+  List1.SetFocus();
+  platform::RunPendingEvents();
+}
+
+bool Form1::InList1(const std::string& Entrada) const { return List1.FindExact(Entrada) != -1; }
+
+void Form1::List1_Click() {
+  if (!List1.Enabled()) {
+    Image1.SetPicture(Picture1);
+    return;
+  }
+  MostrarImagem();
+  Ativar(false);
+}
+
+void Form1::List1_DblClick() {
+  if (Command1.Enabled()) Command1_Click();
+}
+
+void Form1::List1_KeyDown(int KeyCode) {
+  if (KeyCode == TeclaEnter && Command1.Enabled()) Command1_Click();
+}
+
+void Form1::Timer1_Tick() {
+  if (!Enabled()) return;
+  Timer1.Enable(false);
+  CarregarLista(false);
+}

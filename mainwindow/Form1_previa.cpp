@@ -1,0 +1,53 @@
+// The preview picture, and small look-ups that several commands share.
+#include "mainwindow/Form1.h"
+#include "platform/text.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+
+namespace {
+
+constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg"};  // the first one present is shown
+
+std::string ImagemDe(const std::string& Nome) {
+  for (const char* Extensao : ExtensoesDeImagem) {
+    std::string Caminho = DirImgs + Nome + Extensao;
+    if (ArquivoExiste(Caminho)) return Caminho;
+  }
+  return {};
+}
+
+}  // namespace
+
+void Form1::MostrarImagem() {
+  const std::string Caminho = List1.Selected() == -1 ? std::string{} : ImagemDe(NomeSelecionado());
+  if (Caminho.empty()) {
+    Image1.SetPicture(Picture1);
+    return;
+  }
+  // A damaged picture leaves the one that is shown.
+  if (const platform::Picture Imagem = platform::LoadPicture(LerArquivo(Caminho, 1, -1))) Image1.SetPicture(Imagem);
+}
+
+std::string Form1::CaminhoImagem(int Linha) const {
+  if (Linha < 0 || static_cast<std::size_t>(Linha) >= Jogos.size()) return {};
+  return ImagemDe(Jogos[static_cast<std::size_t>(Linha)].Nome);
+}
+
+int Form1::IndiceJogo(const std::string& Nome) const {
+  const std::string Procurado = platform::CharUpperBuffA(Nome);
+  for (std::size_t i = 0; i < Jogos.size(); ++i) {
+    if (Jogos[i].Nome.size() == Procurado.size() && platform::CharUpperBuffA(Jogos[i].Nome) == Procurado) {
+      return static_cast<int>(i);
+    }
+  }
+  return -1;
+}
+
+std::string Form1::CaminhoCurto(const std::string& Caminho) {
+  for (const std::size_t Tamanho : {std::size_t{4096}, std::size_t{1023}}) {
+    if (auto Curto = platform::GetShortPathNameA(Caminho, Tamanho); Curto && !Curto->empty()) return *Curto;
+  }
+  return Caminho;
+}
+
+bool Form1::DisqueteNoDrive() { return platform::SetDriveDirectory("a:\\"); }
