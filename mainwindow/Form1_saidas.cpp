@@ -22,7 +22,7 @@ void Form1::Command3_Click() {
   Catalogo().Fechar();
   const std::string Identificadores = std::to_string(Handle()) + "@" + std::to_string(List1.Handle());
   std::string Diretorio = DirPrograma;
-  if (!ExecutarPrograma(Downloader + " " + Identificadores, 100, false, 2, Diretorio)) {
+  if (ExecutarPrograma(Downloader + " " + Identificadores, 100, false, 2, Diretorio)) {
     Timer1.Enable(true);
     return;
   }

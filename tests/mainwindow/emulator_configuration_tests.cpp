@@ -39,7 +39,7 @@ TEST(EmulatorConfiguration, KeepsItsTwoEntriesAndNothingElse) {
   for (const Case& each : cases) {
     const auto after = ConfiguracaoAtualizada(each.Before, Saves, Roms);
     EXPECT_EQ(after.value_or(""), each.After) << each.Name;
-    if (after) EXPECT_EQ(ConfiguracaoAtualizada(*after, Saves, Roms), std::nullopt) << each.Name << ", again";
+    EXPECT_EQ(ConfiguracaoAtualizada(after.value_or(each.Before), Saves, Roms), std::nullopt) << each.Name << ", again";
   }
   EXPECT_EQ(ConfiguracaoNova("A:\\", Roms), "\r\nSaveDirectory = A:\r\n" + RomsLine + "\r\n");
 }
@@ -52,7 +52,7 @@ TEST(EmulatorConfiguration, EveryOtherByteOfALongFileStays) {
   for (int i = 0; i < 120; ++i) {
     std::string& part = i % 2 ? head : middle;
     part += "Opcao" + std::to_string(i) + " = ";
-    for (unsigned length = random() % 30; length > 0; --length) part += static_cast<char>(' ' + random() % 220);
+    for (auto length = random() % 30; length > 0; --length) part += static_cast<char>(' ' + random() % 220);
     part += i % 10 ? "\r\n" : "\r\n\r\n";
   }
   const auto after = ConfiguracaoAtualizada(head + "SaveDirectory = \r\n" + middle + "GameDirectory = .", Saves, Roms);

@@ -73,7 +73,7 @@ TEST_F(Play, RefusalsSayWhyAndLeaveEverythingAsItWas) {
     each.Spoil();
     Click(form->Command1);
     EXPECT_EQ(Messages(), each.Message.empty() ? Texts{} : Texts{each.Message}) << each.Name;
-    EXPECT_EQ(Focused(), &form->List1) << each.Name;
+    EXPECT_EQ(Focused() == &form->List1, each.Message.empty()) << each.Name;
   }
   EXPECT_TRUE(StartedProcesses().empty());
   EXPECT_EQ(StoredText(Key, "LRom"), std::nullopt);

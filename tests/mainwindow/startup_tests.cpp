@@ -169,7 +169,7 @@ TEST_F(Startup, ClosingTheWindowClosesTheControllerHelp) {
   ASSERT_TRUE(Start());
   bool helpClosed = false;
   QueueModal([&](platform::Window& help) {
-    CloseWindow(*form);
+    form->Close();
     helpClosed = help.IsClosed();
   });
   Form3::ABRIR();
