@@ -1,4 +1,5 @@
-// Files, directories and disks. Paths have backslashes; nothing here shows a message or asks for a disk.
+// Files, directories and disks. Paths have backslashes, and one with a NUL in it names nothing; nothing here shows
+// a message or asks for a disk.
 #pragma once
 
 #include <cstddef>

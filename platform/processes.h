@@ -35,7 +35,7 @@ class Process {
 
 // Starts the program at the beginning of the command line, which is passed on as it stands. The new process has the
 // program's environment, inherits its handles, and works in `directory` (empty: the program's own current
-// directory; one that does not exist: nothing is started).
+// directory; one that does not exist: nothing is started). With a NUL in either text nothing is started.
 Process CreateProcessA(const std::string& commandLine, std::uint32_t creationFlags, const std::string& directory);
 
 }  // namespace platform

@@ -1,7 +1,9 @@
 // The test's side of the machine in memory: what stands on its disks and in its registry, what its user does, and what
-// goes wrong. Only tests include this. Reset() first: every test starts on a fresh machine.
+// goes wrong. Only tests include this. Reset() first: every test starts on a fresh machine. A test that puts something
+// on a disk that cannot be there gets a std::logic_error.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <optional>
@@ -25,19 +27,23 @@ void RemoveDisk(char letter);                        // with all that is on it
 void SetFreeSpace(char letter, std::uint64_t bytes);
 void SetProgramDirectory(const std::string& directory);
 
-void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);  // with its parents
+void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);                       // with its parents
 void PutFile(const std::string& path, std::string_view content, std::uint32_t attributes = 0x20);  // with its parents
-void SetAttributes(const std::string& path, std::uint32_t attributes);
-void LockFile(const std::string& path, bool locked = true);  // as if another program held it: cannot be opened, replaced, deleted
+void SetAttributes(const std::string& path, std::uint32_t attributes);                             // if it exists
+// As if another program held it: it cannot be opened, renamed, replaced or deleted.
+void LockFile(const std::string& path, bool locked = true);
 void RemoveFile(const std::string& path);
 std::optional<std::string> Content(const std::string& path);  // of a file; nothing when there is none
 bool DirectoryStands(const std::string& path);
-std::vector<std::string> AllFiles();               // full paths, ascending
+std::vector<std::string> AllFiles();                // full paths, ascending
 std::uint64_t WriteCount(const std::string& path);  // how often the file's content was changed or replaced, ever
 std::uint64_t WritesEver();                         // all files together
 
-// Everything that was not flushed to the disk (File::Flush, MoveFileExA, CopyFileA) is as it was before; open files are
-// closed. A file that was created but never flushed is empty or half written.
+std::size_t OpenFiles();  // how many the program holds open
+
+// Contents that were not flushed to the disk (by File::Flush, or as CopyFileA's whole copy) are as they were before;
+// open files are closed. A file that was created or emptied but never flushed since is half written. Names are always
+// on the disk: what was deleted is gone, and what was renamed has its new name, with whatever content was flushed.
 void CutPower();
 
 // --- Registry, below HKEY_CURRENT_USER.
@@ -50,13 +56,14 @@ void PutValue(const std::string& key, const std::string& name, std::uint32_t typ
 void PutText(const std::string& key, const std::string& name, const std::string& text);  // REG_SZ with its zero
 std::optional<RegistryValue> StoredValue(const std::string& key, const std::string& name);
 std::optional<std::string> StoredText(const std::string& key, const std::string& name);  // a REG_SZ without its zero
-std::vector<std::string> Keys();                                                          // every key's full path
-void DenyKey(const std::string& key, bool denied = true);  // can no longer be opened
+std::vector<std::string> Keys();                                                         // every key's full path
+void DenyKey(const std::string& key, bool denied = true);  // can no longer be opened, or created
+std::size_t OpenRegistryHandles();                         // that the program has not closed yet
 
 // --- Faults.
 
-// The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry and processes. Writes that
-// fail have written half of their bytes. 0: none. Reset by Reset().
+// The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry, initialisation files,
+// pictures and processes. Writes and copies that fail have written half of their bytes. 0: none. Reset by Reset().
 void FailCall(int n);
 bool CallFailed();  // whether the fault has been reached
 
@@ -73,6 +80,7 @@ const std::vector<StartedProcess>& StartedProcesses();
 // not start; one that is, but was not given a behaviour, runs for ever.
 void OnProcess(const std::string& program, int waits, std::function<void()> run);
 void RefuseToStart(const std::string& program);
+std::size_t HeldProcesses();  // how many Process objects still stand for a started program
 
 // --- The user.
 
@@ -82,7 +90,8 @@ struct ShownMessage {
   Icon Symbol;
   bool operator==(const ShownMessage&) const = default;
 };
-// Answers to message boxes, in order. With none queued a message gets Ok, or Cancel where there is no Ok.
+// Answers to message boxes, in order. With none queued, or one that the message has no button for, a message gets Ok,
+// or Cancel where there is no Ok.
 void QueueAnswer(Answer answer);
 void QueueAnswer(Answer answer, std::function<void()> meanwhile);  // what happens before the answer is given
 const std::vector<ShownMessage>& ShownMessages();
@@ -101,25 +110,32 @@ void QueueEvent(std::function<void()> event);
 int Pending();
 int PendingEventRuns();  // how often the program has let pending events run since Reset
 
-// What a user's hand does; nothing on a control or window that is disabled or hidden.
+// What a user's hand does; nothing on a control or window that is disabled, hidden (also: not shown yet), closed, or
+// behind a modal window, a message or a file dialog. A control that is clicked gets the keyboard focus.
 void Click(Button& button);
 void Click(ImageButton& button);
-void Click(CheckBox& box);                     // changes its value
-void Choose(ListBox& list, int index);         // selects and clicks
+void Click(CheckBox& box);              // changes its value
+void Choose(ListBox& list, int index);  // selects and clicks
 void Choose(ComboBox& box, int index);
 void DoubleClick(ListBox& list);
-void PressKey(ListBox& list, int keyCode);
-void CloseWindow(Window& window);              // its close box
-void Tick(Timer& timer);                       // one tick, when the timer is enabled
+void PressKey(ListBox& list, int keyCode);  // up 38, down 40, home 36 and end 35 also move the selection
+void CloseWindow(Window& window);           // its close box
+void Tick(Timer& timer);                    // one tick, when the timer is enabled
 
 // --- What stands on the screen.
 
 bool IsShown(const Window& window);
-const Control* Focused();        // the control that has the keyboard focus, or null
-int IconOf(const Button& button);  // its icon's number, 0: none
-int ResourceOf(const Picture& picture);            // the resource it came from, 0: none
-std::string ContentOf(const Picture& picture);     // the file content it came from
-std::uint64_t SleptMilliseconds();                 // since Reset; time passes only by sleeping and waiting
-void SetScreen(int widthTwips, int heightTwips);   // 15360 x 11520 after Reset
+Window* WindowFromHandle(std::int32_t handle);           // null when there is none
+std::vector<Control*> ControlsOf(const Window& window);  // in order of creation
+Bounds BoundsOf(const Control& control);                 // in the window's client area; a label's size is 0
+const Control* Focused();                                // the control that has the keyboard focus, or null
+int IconOf(const Button& button);                        // its icon's number, 0: none
+int ResourceOf(const Picture& picture);                  // the resource it came from, 0: none
+std::string ContentOf(const Picture& picture);           // the file content it came from
+bool RedrawIsOn(const ListBox& list);
+std::uint32_t IntervalOf(const Timer& timer);     // milliseconds
+int DroppedExceptions();                          // how many have left a handler since Reset
+std::uint64_t SleptMilliseconds();                // since Reset; time passes only by sleeping and waiting
+void SetScreen(int widthTwips, int heightTwips);  // 15360 x 11520 after Reset
 
 }  // namespace platform::simulated

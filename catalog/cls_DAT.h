@@ -1,0 +1,53 @@
+// The catalogue: which name belongs to which DOS name. It is one text file in the program's directory, only ever
+// appended to, which stays open, and which other programs may read and write meanwhile.
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "catalog/indice.h"
+#include "platform/files.h"
+#include "support/mod_Globais.h"
+
+class cls_DAT {
+ public:
+  cls_DAT() = default;
+  cls_DAT(const cls_DAT&) = delete;
+  cls_DAT& operator=(const cls_DAT&) = delete;
+
+  // Opens the file where it is not open yet, and reads it. A missing file is created by Carregar, not by Carregar2;
+  // without a readable file the catalogue is empty.
+  void Carregar();
+  void Carregar2();
+
+  // Reads the file again; a file that has become empty, or cannot be read, leaves the catalogue as it was.
+  void Atualizar();
+
+  // Closes the file and empties the catalogue until it is loaded again.
+  void Fechar();
+
+  // The name of a DOS name, whose letter case does not matter, or the DOS name itself. `Encontrado` says which.
+  std::string DefineNome(const std::string& DOSName, Booleano& Encontrado) const;
+
+  // The DOS name of a name, in upper case, or the name itself. The name's letter case matters.
+  std::string DefineDOSName(const std::string& Nome) const;
+
+  // Appends an entry to the file, unless the catalogue as last read has the very same. Lookups find it after the next
+  // Atualizar. An entry that cannot be written whole leaves the file as it was.
+  void RegistrarRom(const std::string& Nome, const std::string& DOSName);
+
+ private:
+  void AbrirLeitura(const std::string& Caminho);
+  void AbrirLeituraGravacao(const std::string& Caminho);
+  void Ler();
+  void Esquecer();
+  const Indice& IndiceDosDados() const;
+
+  platform::File NumArquivo;
+  std::string Dados;                      // the file as it was last read
+  bool Aberto = false;                    // an open has been tried, whether or not it succeeded
+  mutable std::optional<Indice> indice_;  // of Dados, made at the first lookup after a load
+};
+
+// The program's catalogue, created on first use.
+cls_DAT& Catalogo();

@@ -1,0 +1,52 @@
+// An index over the catalogue's text that answers as the search from the first character does (catalog/busca.h),
+// in a time that does not grow with the text. It keeps positions only; the text must stay as it is meanwhile.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string_view>
+#include <vector>
+
+// Positions of a text under the hash of what follows each of them, in chains that the text's end is put into first, so
+// that each chain is in ascending order.
+class CadeiasDePosicoes {
+ public:
+  void Reservar(std::size_t capacidade);
+  void PorNaFrente(std::uint64_t hash, std::size_t posicao);
+
+  // The first link of the hash's chain, and the one behind a link; Fim: there is none.
+  std::uint32_t Primeiro(std::uint64_t hash) const;
+  std::uint32_t Proximo(std::uint32_t elo) const { return elos_[elo].Proximo; }
+  std::size_t Posicao(std::uint32_t elo) const { return elos_[elo].Posicao; }
+  static constexpr std::uint32_t Fim = 0xFFFFFFFF;
+
+ private:
+  struct Elo {
+    std::uint32_t Posicao, Proximo;
+  };
+  std::size_t Balde(std::uint64_t hash) const;
+
+  std::vector<std::uint32_t> primeiros_;
+  std::vector<Elo> elos_;
+  int deslocamento_ = 64;
+};
+
+class Indice {
+ public:
+  // Takes a time in proportion to the length of the text, whatever is in it. Without the memory for an index, lookups
+  // search the text.
+  explicit Indice(std::string_view Dados);
+
+  // The answers of BuscarNome and BuscarChave.
+  std::optional<std::string_view> Nome(std::string_view Chave) const;
+  std::optional<std::string_view> Chave(std::string_view Nome) const;
+
+ private:
+  void Montar();
+
+  std::string_view dados_;
+  bool montado_ = false;
+  CadeiasDePosicoes chaves_;  // of each "|" that a key follows
+  CadeiasDePosicoes nomes_;   // of each "=" that a name follows
+};

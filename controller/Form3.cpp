@@ -1,0 +1,79 @@
+#include "controller/Form3.h"
+
+#include "controller/teclas.h"
+#include "platform/messages.h"
+#include "platform/text.h"
+#include "resources/ids.h"
+#include "support/mod_Traducao.h"
+
+namespace {
+
+constexpr platform::Bounds LugarCombo1 = {120, 120, 2775, 315};
+constexpr platform::Bounds LugarCommand1 = {6480, 4320, 1935, 495};
+constexpr platform::Font LetraLabel1 = {.TenthsOfPoint = 98, .Bold = true};
+constexpr std::uint32_t IntervaloTimer1 = 100;
+
+platform::WindowStyle Janela() {
+  return {.Caption = "Controle",
+          .ClientWidth = 8490,
+          .ClientHeight = 4905,
+          .CloseOnEscape = true,
+          .Background = FIGURA_CONTROLE};
+}
+
+Form3* aberta = nullptr;  // the window of the ABRIR that is running
+
+}  // namespace
+
+Form3::Form3()
+    : Window(Janela()),
+      Combo1(*this, LugarCombo1),
+      Command1(*this, LugarCommand1, "&Fechar"),
+      Timer1(*this, IntervaloTimer1) {
+  for (const Tecla& tecla : Teclas) Label1.emplace_back(*this, tecla.Left, tecla.Top, LetraLabel1);
+  Combo1.OnClick = [this] { Combo1_Click(); };
+  Command1.OnClick = [this] { Command1_Click(); };
+  Timer1.OnTick = [this] { Timer1_Tick(); };
+  aberta = this;
+}
+
+Form3::~Form3() { aberta = nullptr; }
+
+void Form3::ABRIR() {
+  if (aberta) return;
+  Form3 janela;
+  janela.Preparar();
+  janela.ShowModal();
+}
+
+void Form3::Descarregar() {
+  if (aberta) aberta->Close();
+}
+
+void Form3::Preparar() {
+  Command1.SetCaption(Traduzir(Command1.Caption()));
+  Combo1.Add(Traduzir("Jogador 1"));
+  Combo1.Add(Traduzir("Jogador 2"));
+  Combo1.Select(0);
+  MostrarTeclas();
+  SetCaption(Traduzir(Caption()));
+  Timer1.Enable(true);
+}
+
+void Form3::MostrarTeclas() {
+  const int jogador = Combo1.Selected();
+  if (jogador != 0 && jogador != 1) return;
+  for (std::size_t i = 0; i < Teclas.size(); ++i) {
+    Label1[i].SetCaption(Traduzir(Teclas[i].Nomes[static_cast<std::size_t>(jogador)]));
+  }
+}
+
+void Form3::Combo1_Click() { MostrarTeclas(); }
+
+void Form3::Timer1_Tick() {
+  Timer1.Enable(false);
+  platform::MessageBoxA(Traduzir("Guarde os comandos do controle. Se necessário anote-os."_ansi),
+                        Traduzir("Informação"_ansi), platform::Buttons::Ok, platform::Icon::Information);
+}
+
+void Form3::Command1_Click() { Close(); }

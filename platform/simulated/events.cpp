@@ -1,0 +1,55 @@
+#include "platform/events.h"
+
+#include <utility>
+
+#include "platform/simulated/machine.h"
+
+namespace platform {
+namespace {
+
+using simulated::TheMachine;
+
+void RunNextEvent() {
+  const std::function<void()> run = std::move(TheMachine().Events.front().Run);
+  TheMachine().Events.pop_front();
+  run();
+}
+
+}  // namespace
+
+void RunPendingEvents() {
+  ++TheMachine().PendingRuns;
+  const std::uint64_t last = TheMachine().EventsQueued;
+  while (!TheMachine().Events.empty() && TheMachine().Events.front().Number <= last) RunNextEvent();
+}
+
+void RunEventLoop() {
+  const std::shared_ptr<simulated::WindowFacts> window = TheMachine().MainWindow;
+  while (!(window && window->Closed) && !TheMachine().Events.empty()) RunNextEvent();
+}
+
+void Sleep(std::uint32_t milliseconds) { TheMachine().Slept += milliseconds; }
+
+int ScreenWidth() { return TheMachine().ScreenWidth; }
+int ScreenHeight() { return TheMachine().ScreenHeight; }
+
+}  // namespace platform
+
+namespace platform::simulated {
+
+void QueueEvent(std::function<void()> event) {
+  TheMachine().Events.push_back({++TheMachine().EventsQueued, std::move(event)});
+}
+
+int Pending() { return static_cast<int>(TheMachine().Events.size()); }
+
+int PendingEventRuns() { return TheMachine().PendingRuns; }
+
+std::uint64_t SleptMilliseconds() { return TheMachine().Slept; }
+
+void SetScreen(int widthTwips, int heightTwips) {
+  TheMachine().ScreenWidth = widthTwips;
+  TheMachine().ScreenHeight = heightTwips;
+}
+
+}  // namespace platform::simulated

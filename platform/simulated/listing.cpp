@@ -1,0 +1,68 @@
+// Listings of directories, and the short forms of names.
+#include <algorithm>
+#include <utility>
+
+#include "platform/files.h"
+#include "platform/simulated/machine.h"
+#include "platform/simulated/text_order.h"
+#include "platform/text.h"
+#include "platform/wildcards.h"
+
+namespace platform {
+namespace {
+
+using simulated::Entry;
+using simulated::Fails;
+using simulated::Locate;
+using simulated::Place;
+
+bool IsListed(const Entry& entry) {
+  return (entry.Attributes & (AttributeHidden | AttributeSystem | AttributeDirectory)) == 0;
+}
+
+}  // namespace
+
+std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(directory);
+  if (fault || !place || !place->Found || !place->Found->IsDirectory()) return {};
+  const std::string wanted = CharUpperBuffA(patterns);
+  std::vector<std::pair<std::string, const Entry*>> found;
+  for (const auto& [upperName, entry] : place->Found->Entries) {
+    if (IsListed(*entry) && MatchesAnyPattern(upperName, wanted)) {
+      found.emplace_back(simulated::SortKey(entry->Name), entry.get());
+    }
+  }
+  std::stable_sort(found.begin(), found.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+  std::vector<DirectoryEntry> entries;
+  for (const auto& [key, entry] : found) entries.push_back({entry->Name, entry->ShortName});
+  return entries;
+}
+
+std::optional<DirectoryEntry> ListPath(const std::string& path) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(path);
+  if (fault || !place || !place->Found || place->EndsWithBackslash || !IsListed(*place->Found)) return std::nullopt;
+  return DirectoryEntry{place->Found->Name, place->Found->ShortName};
+}
+
+std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_t bufferLength) {
+  const bool fault = Fails();
+  const std::optional<Place> whole = Locate(path);
+  if (fault || !whole || !whole->Found) return std::nullopt;
+  std::string shortPath;
+  std::size_t start = 0;
+  while (start < path.size()) {
+    const std::size_t end = std::min(path.find('\\', start), path.size());
+    const std::optional<Place> part = Locate(path.substr(0, end));
+    const bool named = part && part->Found && part->Folder && end > start;
+    const std::string written = path.substr(start, end - start);
+    shortPath += named && !part->Found->ShortName.empty() ? part->Found->ShortName : written;
+    if (end < path.size()) shortPath += '\\';
+    start = end + 1;
+  }
+  if (shortPath.size() + 1 > bufferLength) return std::nullopt;
+  return shortPath;
+}
+
+}  // namespace platform

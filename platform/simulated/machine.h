@@ -1,0 +1,101 @@
+// The state of the machine in memory, all of it in one place.
+#pragma once
+
+#include <cstdint>
+#include <deque>
+#include <functional>
+#include <map>
+#include <memory>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "platform/files.h"
+#include "platform/messages.h"
+#include "platform/simulated/disks.h"
+#include "platform/simulated/screen.h"
+#include "platform/simulated/simulated.h"
+
+namespace platform::simulated {
+
+struct RegistryRecord {
+  std::string Name;  // full path as written
+  struct Value {
+    std::string Name;
+    RegistryValue Stored;
+  };
+  std::map<std::string, Value> Values;  // by name in upper case
+};
+
+struct RegistryHandle {
+  std::string Path;  // in upper case
+  std::uint32_t Access;
+};
+
+struct ProcessBehaviour {
+  std::string Program;
+  bool Refuses;
+  int Waits;
+  std::function<void()> Run;
+};
+
+struct RunningProcess {
+  bool RunsForEver, Ended;
+  int WaitsLeft;
+  std::function<void()> Run;
+};
+
+struct QueuedAnswer {
+  Answer Given;
+  std::function<void()> Meanwhile;
+};
+
+struct QueuedEvent {
+  std::uint64_t Number;
+  std::function<void()> Run;
+};
+
+struct Machine {
+  std::map<char, std::shared_ptr<Disk>> Disks;
+  std::string ProgramDirectory = "C:\\";
+  std::map<std::intptr_t, OpenFile> OpenFiles;
+  std::map<std::string, std::uint64_t> Writes;  // by full path in upper case
+  std::uint64_t WritesEver = 0;
+
+  std::map<std::string, RegistryRecord> Registry;  // by full path in upper case
+  std::set<std::string> DeniedKeys;
+  std::map<std::intptr_t, RegistryHandle> RegistryHandles;
+
+  int CallsUntilFault = 0;
+  bool FaultReached = false;
+
+  std::vector<StartedProcess> Started;
+  std::vector<ProcessBehaviour> Behaviours;  // the latest counts
+  std::map<std::intptr_t, RunningProcess> Processes;
+
+  std::deque<QueuedAnswer> Answers;
+  std::vector<ShownMessage> Messages;
+  std::deque<std::string> DialogPaths;
+  std::vector<OpenFileName> Dialogs;
+  std::deque<std::function<void(Window&)>> ModalScripts;
+  std::deque<QueuedEvent> Events;
+  std::uint64_t EventsQueued = 0;
+  int PendingRuns = 0;
+
+  std::vector<std::shared_ptr<WindowFacts>> Windows;  // those that exist, in order of creation
+  std::shared_ptr<WindowFacts> MainWindow;
+  std::vector<const WindowFacts*> Modal;  // the last one alone takes input; null: a message box or a file dialog
+  ControlState* Focus = nullptr;          // the control that last got it, usable or not
+  int DroppedExceptions = 0;
+  std::uint64_t Slept = 0;  // milliseconds
+  int ScreenWidth = 15360, ScreenHeight = 11520;
+
+  std::intptr_t LastHandle = 0;  // of all kinds; goes on over Reset, so that no old handle means something new
+};
+
+Machine& TheMachine();
+
+// Counts a call that can fail; true when it is the one that is to fail.
+bool Fails();
+
+}  // namespace platform::simulated

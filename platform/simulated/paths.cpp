@@ -1,0 +1,122 @@
+// Files and directories by their paths, and what a disk tells of itself.
+#include <algorithm>
+#include <utility>
+
+#include "platform/files.h"
+#include "platform/simulated/machine.h"
+
+namespace platform {
+namespace {
+
+using simulated::Entry;
+using simulated::Fails;
+using simulated::Locate;
+using simulated::Place;
+using simulated::TheMachine;
+
+constexpr std::uint32_t BytesPerSector = 512;
+
+bool InUse(const Entry& entry) { return entry.Locked || entry.TimesOpen > 0; }
+
+bool IsFile(const std::optional<Place>& place) {
+  return place && place->Found && !place->Found->IsDirectory() && !place->EndsWithBackslash;
+}
+
+// Whether another file may take this place.
+bool MayReplace(const std::optional<Place>& place, std::uint32_t protecting) {
+  if (!place || !place->Folder || place->EndsWithBackslash) return false;
+  return !place->Found || (IsFile(place) && !InUse(*place->Found) && (place->Found->Attributes & protecting) == 0);
+}
+
+std::uint32_t Clusters(std::uint64_t bytes) {
+  return static_cast<std::uint32_t>(std::min<std::uint64_t>(bytes / BytesPerSector, 0xFFFFFFFF));
+}
+
+}  // namespace
+
+std::optional<std::uint32_t> GetFileAttributesA(const std::string& path) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(path);
+  if (fault || !place || !place->Found) return std::nullopt;
+  return place->Found->Attributes == 0 ? AttributeNormal : place->Found->Attributes;
+}
+
+std::optional<std::int64_t> FileSize(const std::string& path) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(path);
+  if (fault || !IsFile(place)) return std::nullopt;
+  return static_cast<std::int64_t>(place->Found->Content.size());
+}
+
+bool DeleteFileA(const std::string& path) {
+  const bool fault = Fails();
+  std::optional<Place> place = Locate(path);
+  if (fault || !IsFile(place) || InUse(*place->Found) || (place->Found->Attributes & AttributeReadOnly) != 0) {
+    return false;
+  }
+  simulated::Detach(*place);
+  return true;
+}
+
+// The new name is on the disk at once; contents that were not flushed are no safer under it.
+bool MoveFileExA(const std::string& from, const std::string& to) {
+  const bool fault = Fails();
+  std::optional<Place> source = Locate(from), target = Locate(to);
+  if (fault || !IsFile(source) || InUse(*source->Found) || !target || target->Where != source->Where) return false;
+  const bool same = target->Found == source->Found;
+  if (!same && !MayReplace(target, AttributeReadOnly)) return false;
+  const std::shared_ptr<Entry> moved = source->Found;
+  simulated::Detach(*source);
+  if (target->Found && !same) simulated::Detach(*target);
+  simulated::Attach(*target, moved);
+  simulated::CountWrite(target->Path);
+  return true;
+}
+
+bool CopyFileA(const std::string& from, const std::string& to) {
+  const bool fault = Fails();
+  const std::optional<Place> source = Locate(from);
+  std::optional<Place> target = Locate(to);
+  if (!IsFile(source) || source->Found->Locked || !MayReplace(target, AttributeReadOnly | AttributeHidden))
+    return false;
+  if (target->Found == source->Found) return false;
+  if (target->Found) simulated::Detach(*target);
+  const std::string_view content = source->Found->Content;
+  Entry& copy = *simulated::CreateEntry(*target, source->Found->Attributes | AttributeArchive);
+  simulated::CountWrite(target->Path);
+  const std::size_t tried = fault ? content.size() / 2 : content.size();
+  const std::size_t stored = simulated::Store(*target->Where, copy, 0, content.substr(0, tried));
+  if (fault || stored < content.size()) return false;
+  simulated::MarkFlushed(copy);
+  return true;
+}
+
+bool CreateDirectoryA(const std::string& path) {
+  const bool fault = Fails();
+  std::optional<Place> place = Locate(path);
+  if (fault || !place || place->Found) return false;
+  simulated::MarkFlushed(*simulated::CreateEntry(*place, AttributeDirectory));
+  return true;
+}
+
+std::optional<DiskFreeSpace> GetDiskFreeSpaceA(const std::string& root) {
+  const bool fault = Fails();
+  const bool isRoot = root.size() >= 2 && root[1] == ':' && (root.size() == 2 || root.substr(2) == "\\");
+  const std::optional<Place> place = isRoot ? Locate(root) : std::nullopt;
+  if (fault || !place) return std::nullopt;
+  return DiskFreeSpace{1, BytesPerSector, Clusters(simulated::FreeBytes(*place->Where)),
+                       Clusters(place->Where->Capacity)};
+}
+
+bool SetDriveDirectory(const std::string& directory) {
+  const bool fault = Fails();
+  const bool namesDrive = directory.size() >= 2 && directory[1] == ':';
+  const std::optional<Place> place = namesDrive ? Locate(directory) : std::nullopt;
+  if (fault || !place || !place->Found || !place->Found->IsDirectory()) return false;
+  place->Where->Directory = place->Path.substr(3);
+  return true;
+}
+
+std::string ProgramDirectory() { return TheMachine().ProgramDirectory; }
+
+}  // namespace platform

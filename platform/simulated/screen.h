@@ -1,0 +1,85 @@
+// What the machine in memory knows of windows and controls.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "platform/controls.h"
+
+namespace platform::simulated {
+
+// Of a window; shared with its controls, which may live longer.
+struct WindowFacts {
+  Window* Self = nullptr;
+  std::string Caption;
+  int Left = 0, Top = 0, Width = 0, Height = 0;
+  bool Enabled = true, Shown = false, Closing = false, Closed = false;
+  std::int32_t Handle = 0;
+  std::vector<Control*> Controls;  // in order of creation
+};
+
+struct ListEntry {
+  std::string Text, Key;  // the key as text_order.h makes it
+};
+
+// Whether the user can reach the window: shown, enabled, and not behind a modal one.
+bool TakesInput(const WindowFacts& window);
+bool TakesInput(const ControlState& control);
+
+void CountDroppedException();
+
+// While it lives, only this window takes input; null: none of the program's.
+class ModalTurn {
+ public:
+  explicit ModalTurn(const WindowFacts* window);
+  ~ModalTurn();
+  ModalTurn(const ModalTurn&) = delete;
+  ModalTurn& operator=(const ModalTurn&) = delete;
+};
+
+// Calls a handler as the window thread does: an exception ends here. The handler may replace itself meanwhile.
+template <typename... Arguments>
+void RunHandler(std::function<void(Arguments...)> handler, Arguments... arguments) {
+  if (!handler) return;
+  try {
+    handler(arguments...);
+  } catch (...) {
+    CountDroppedException();
+  }
+}
+
+}  // namespace platform::simulated
+
+namespace platform {
+
+struct WindowState {
+  std::shared_ptr<simulated::WindowFacts> Facts;
+};
+
+// Of every kind of control; each uses its own part.
+struct ControlState {
+  Control* Self = nullptr;
+  std::shared_ptr<simulated::WindowFacts> Window;
+  Bounds Place{};
+  std::string Caption, ToolTip;
+  bool Enabled = true, Visible = true;
+  std::int32_t Handle = 0;
+
+  std::vector<simulated::ListEntry> Entries;
+  bool Sorted = false, Redraw = true;
+  int Selected = -1;
+  int Value = 0;
+  int Icon = 0;
+  Picture Shown;
+};
+
+struct TimerState {
+  std::shared_ptr<simulated::WindowFacts> Window;
+  std::uint32_t Interval = 0;
+  bool Enabled = false;
+};
+
+}  // namespace platform

@@ -1,0 +1,76 @@
+// The machine's code page is 1252, its language Portuguese.
+#include "platform/text.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <iterator>
+
+#include "platform/simulated/text_order.h"
+
+namespace platform {
+namespace {
+
+// What stands at 0x80 to 0x9F; everywhere else the page's numbers are those of Unicode.
+constexpr std::uint16_t Upper32[32] = {0x20AC, 0x81,   0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
+                                       0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x8D,   0x017D, 0x8F,
+                                       0x90,   0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
+                                       0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x9D,   0x017E, 0x0178};
+
+char ToCodePage(char32_t character) {
+  if (character < 0x80 || (character >= 0xA0 && character <= 0xFF)) return static_cast<char>(character);
+  const auto* found = std::find(std::begin(Upper32), std::end(Upper32), character);
+  return found == std::end(Upper32) ? '?' : static_cast<char>(0x80 + (found - std::begin(Upper32)));
+}
+
+// Length in bytes of the sequence that starts with this byte; 0: none does.
+std::size_t SequenceLength(unsigned char first) {
+  if (first < 0x80) return 1;
+  if (first >= 0xC2 && first < 0xE0) return 2;
+  if (first >= 0xE0 && first < 0xF0) return 3;
+  return first >= 0xF0 && first < 0xF5 ? 4 : 0;
+}
+
+// Takes one character off the front; a byte that fits nowhere is one unknown character.
+char32_t TakeCharacter(std::string_view& utf8) {
+  constexpr char32_t unknown = 0xFFFD;
+  const auto first = static_cast<unsigned char>(utf8.front());
+  const std::size_t length = SequenceLength(first);
+  utf8.remove_prefix(1);
+  if (length == 0) return unknown;
+  char32_t character = length == 1 ? first : first & (0x7Fu >> length);
+  for (std::size_t i = 1; i < length; ++i) {
+    if (utf8.empty() || (utf8.front() & 0xC0) != 0x80) return unknown;
+    character = character << 6 | (static_cast<unsigned char>(utf8.front()) & 0x3Fu);
+    utf8.remove_prefix(1);
+  }
+  return character;
+}
+
+char ToUpper(char character) {
+  const auto code = static_cast<unsigned char>(character);
+  if ((code >= 'a' && code <= 'z') || (code >= 0xE0 && code <= 0xFE && code != 0xF7)) {
+    return static_cast<char>(code - 0x20);
+  }
+  if (code == 0x9A || code == 0x9C || code == 0x9E) return static_cast<char>(code - 0x10);
+  return code == 0xFF ? '\x9F' : character;
+}
+
+}  // namespace
+
+std::string FromUtf8(std::string_view utf8) {
+  std::string text;
+  text.reserve(utf8.size());
+  while (!utf8.empty()) text += ToCodePage(TakeCharacter(utf8));
+  return text;
+}
+
+std::string CharUpperBuffA(std::string text) {
+  std::transform(text.begin(), text.end(), text.begin(), ToUpper);
+  return text;
+}
+
+int CompareStringA(std::string_view left, std::string_view right) {
+  return simulated::SortKey(left).compare(simulated::SortKey(right));
+}
+
+}  // namespace platform

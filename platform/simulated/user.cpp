@@ -1,0 +1,100 @@
+// The user's hands, and what the user sees.
+#include <algorithm>
+#include <utility>
+
+#include "platform/simulated/machine.h"
+
+namespace platform::simulated {
+namespace {
+
+// A control that is clicked takes the keyboard focus. False when the user cannot reach it.
+bool Touch(const Control& control) {
+  if (!TakesInput(control.State())) return false;
+  TheMachine().Focus = &control.State();
+  return true;
+}
+
+template <typename List>
+void ChooseEntry(List& list, int index) {
+  if (index < 0 || index >= std::ssize(list.State().Entries) || !Touch(list)) return;
+  list.State().Selected = index;
+  RunHandler(list.OnClick);
+}
+
+// Where the keys that move the selection lead; nothing for other keys.
+std::optional<int> Destination(int keyCode, int selected, int count) {
+  constexpr int end = 35, home = 36, up = 38, down = 40;
+  if (keyCode == end) return count - 1;
+  if (keyCode == home) return 0;
+  if (keyCode == up) return std::max(selected - 1, 0);
+  if (keyCode == down) return std::min(selected + 1, count - 1);
+  return std::nullopt;
+}
+
+}  // namespace
+
+void QueueModal(std::function<void(Window&)> script) { TheMachine().ModalScripts.push_back(std::move(script)); }
+
+void Click(Button& button) {
+  if (Touch(button)) RunHandler(button.OnClick);
+}
+
+void Click(ImageButton& button) {
+  if (Touch(button)) RunHandler(button.OnClick);
+}
+
+void Click(CheckBox& box) {
+  if (Touch(box)) box.SetValue(1 - box.Value());
+}
+
+void Choose(ListBox& list, int index) { ChooseEntry(list, index); }
+
+void Choose(ComboBox& box, int index) { ChooseEntry(box, index); }
+
+void DoubleClick(ListBox& list) {
+  if (Touch(list)) RunHandler(list.OnDoubleClick);
+}
+
+void PressKey(ListBox& list, int keyCode) {
+  if (!Touch(list)) return;
+  RunHandler(list.OnKeyDown, keyCode);
+  const std::optional<int> destination = Destination(keyCode, list.Selected(), list.Count());
+  if (destination && *destination != list.Selected()) ChooseEntry(list, *destination);
+}
+
+void CloseWindow(Window& window) {
+  if (TakesInput(*window.State().Facts)) window.Close();
+}
+
+void Tick(Timer& timer) {
+  if (timer.Enabled() && !timer.State().Window->Closed) RunHandler(timer.OnTick);
+}
+
+bool IsShown(const Window& window) { return window.State().Facts->Shown; }
+
+Window* WindowFromHandle(std::int32_t handle) {
+  for (const auto& window : TheMachine().Windows) {
+    if (window->Handle == handle) return window->Self;
+  }
+  return nullptr;
+}
+
+std::vector<Control*> ControlsOf(const Window& window) { return window.State().Facts->Controls; }
+
+Bounds BoundsOf(const Control& control) { return control.State().Place; }
+
+// A control that is switched off keeps its claim, and has the focus again once it is switched on.
+const Control* Focused() {
+  const ControlState* focus = TheMachine().Focus;
+  return focus && focus->Enabled && focus->Visible ? focus->Self : nullptr;
+}
+
+int IconOf(const Button& button) { return button.State().Icon; }
+
+bool RedrawIsOn(const ListBox& list) { return list.State().Redraw; }
+
+std::uint32_t IntervalOf(const Timer& timer) { return timer.State().Interval; }
+
+int DroppedExceptions() { return TheMachine().DroppedExceptions; }
+
+}  // namespace platform::simulated

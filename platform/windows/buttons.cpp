@@ -1,0 +1,63 @@
+#include "platform/controls.h"
+#include "platform/windows/state.h"
+
+namespace platform {
+namespace {
+
+constexpr int IconSide = 32;
+
+void ShowIcon(ControlState& control, int id) {
+  control.NamedByToolTip = true;
+  SetNativeText(control, control.ToolTip);
+  const LONG_PTR style = ::GetWindowLongPtrA(control.Handle, GWL_STYLE);
+  ::SetWindowLongPtrA(control.Handle, GWL_STYLE, style | BS_ICON);
+  control.LayOut = [&control, id] {
+    IconHandle next = LoadIconFor(id, IconSide, control.Owner->Dpi);
+    ::SendMessageA(control.Handle, BM_SETIMAGE, IMAGE_ICON, reinterpret_cast<LPARAM>(next.get()));
+    control.Icon.swap(next);
+  };
+  control.LayOut();
+}
+
+}  // namespace
+
+void PressOnEnter(ControlState& control) {
+  control.EnterIsKey = true;
+  control.OnKey = [&control](int key, bool repeated) {
+    if (key != VK_RETURN) return false;
+    if (!repeated) ::SendMessageA(control.Handle, BM_CLICK, 0, 0);
+    return true;
+  };
+}
+
+Button::Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font) {
+  CreateControl(*state_, container, bounds, {"BUTTON", WS_TABSTOP | BS_PUSHBUTTON | BS_MULTILINE}, caption, font);
+  PressOnEnter(*state_);
+  state_->OnNotification = [this](int code) {
+    if (IsClick(code)) Raise(OnClick);
+  };
+}
+
+void Button::SetIcon(int id) {
+  if (state_->Handle != nullptr) ShowIcon(*state_, id);
+}
+
+CheckBox::CheckBox(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
+  CreateControl(*state_, container, bounds, {"BUTTON", WS_TABSTOP | BS_AUTOCHECKBOX | BS_PUSHLIKE});
+  PressOnEnter(*state_);
+  ShowIcon(*state_, icon);
+  SetToolTip(toolTip);
+  state_->LastValue = 0;
+  state_->Remember = [this] { state_->LastValue = Value(); };
+}
+
+int CheckBox::Value() const {
+  if (state_->Handle == nullptr) return state_->LastValue;
+  return ::SendMessageA(state_->Handle, BM_GETCHECK, 0, 0) == BST_CHECKED ? 1 : 0;
+}
+
+void CheckBox::SetValue(int value) {
+  ::SendMessageA(state_->Handle, BM_SETCHECK, value == 1 ? BST_CHECKED : BST_UNCHECKED, 0);
+}
+
+}  // namespace platform

@@ -1,0 +1,161 @@
+// clang-format off
+#include <windows.h>
+#include <commctrl.h>
+// clang-format on
+
+#include "platform/windows/state.h"
+
+namespace platform {
+namespace {
+
+constexpr int FirstId = 100;  // above the numbers that the keyboard's rules give a meaning
+
+// Enter is asked for before it is sent to the control.
+bool IsEnter(LPARAM lParam) {
+  const auto* event = reinterpret_cast<const MSG*>(lParam);
+  return event != nullptr && event->wParam == VK_RETURN;
+}
+
+LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR id,
+                                  DWORD_PTR data) {
+  auto& control = *reinterpret_cast<ControlState*>(data);
+  switch (message) {
+    case WM_GETDLGCODE:
+      if (!control.EnterIsKey || !IsEnter(lParam)) break;
+      return ::DefSubclassProc(handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
+    case WM_KEYDOWN:
+      if (control.OnKey && control.OnKey(static_cast<int>(wParam), (HIWORD(lParam) & KF_REPEAT) != 0)) return 0;
+      if (control.Handle == nullptr) return 0;  // the key has closed the window
+      break;
+    case WM_CHAR:
+      if (control.EnterIsKey && wParam == VK_RETURN) return 0;
+      break;
+    case WM_SETFOCUS:
+      if (control.Owner != nullptr) control.Owner->Focus = handle;
+      break;
+    case WM_ERASEBKGND:
+      if (control.Draw) return TRUE;  // it draws all of itself
+      break;
+    case WM_NCDESTROY:
+      control.Handle = nullptr;
+      ::RemoveWindowSubclass(handle, ControlProcedure, id);
+      break;
+    default:
+      break;
+  }
+  return ::DefSubclassProc(handle, message, wParam, lParam);
+}
+
+// Arrow keys move between neighbours of the same kind, Tab between all.
+DWORD GroupStyle(const WindowState& window, const char* nativeClass) {
+  char last[32] = "";
+  if (!window.Controls.empty()) ::GetClassNameA(window.Controls.back()->Handle, last, sizeof last);
+  return ::lstrcmpiA(last, nativeClass) == 0 ? 0UL : DWORD{WS_GROUP};
+}
+
+// The window keeps the keyboard itself when a control loses it by being switched off, and gives it back.
+void KeepFocus(const ControlState& control, bool usable) {
+  const HWND window = control.Owner->Handle;
+  const HWND focus = ::GetFocus();
+  if (::GetActiveWindow() != window || control.Owner->Focus != control.Handle) return;
+  if (usable && focus == window) ::SetFocus(control.Handle);
+  if (!usable && (focus == nullptr || focus == control.Handle)) ::SetFocus(window);
+}
+
+}  // namespace
+
+void CreateControl(ControlState& control, const Container& container, const Bounds& bounds, const NativeControl& native,
+                   const std::string& text, const Font& font) {
+  WindowState& window = container.Parent.State();
+  control.Owner = &window;
+  control.Place = bounds;
+  control.Place.Left += container.Left;
+  control.Place.Top += container.Top;
+  control.Face = font;
+  control.Caption = text;
+  const DWORD group = GroupStyle(window, native.Class);
+  const auto id = static_cast<std::uintptr_t>(FirstId) + window.Controls.size();
+  window.Controls.push_back(&control);
+  if (window.Handle == nullptr) return;
+  control.Handle =
+      ::CreateWindowExA(native.ExtendedStyle, native.Class, text.c_str(), WS_CHILD | WS_VISIBLE | group | native.Style,
+                        0, 0, 0, 0, window.Handle, reinterpret_cast<HMENU>(id), ::GetModuleHandleA(nullptr), nullptr);
+  ::SetWindowSubclass(control.Handle, ControlProcedure, 0, reinterpret_cast<DWORD_PTR>(&control));
+  LayOutControl(control);
+}
+
+void LayOutControl(ControlState& control) {
+  if (control.Handle == nullptr) return;
+  const int dpi = control.Owner->Dpi;
+  ::SendMessageA(control.Handle, WM_SETFONT, reinterpret_cast<WPARAM>(FontFor(control.Face, dpi)), TRUE);
+  const Bounds& place = control.Place;
+  ::SetWindowPos(control.Handle, nullptr, ToPixels(place.Left, dpi), ToPixels(place.Top, dpi),
+                 ToPixels(place.Width, dpi), ToPixels(place.Height, dpi), SWP_NOZORDER | SWP_NOACTIVATE);
+  if (control.LayOut) control.LayOut();
+  UpdateToolTip(control);
+}
+
+void SetNativeText(const ControlState& control, const std::string& text) {
+  ::SetWindowTextA(control.Handle, text.c_str());
+}
+
+Control::Control() : state_(std::make_unique<ControlState>()) {}
+
+Control::~Control() {
+  if (state_->Owner == nullptr) return;
+  state_->OnNotification = nullptr;
+  state_->Remember = nullptr;
+  if (state_->Owner->Focus == state_->Handle) state_->Owner->Focus = nullptr;
+  std::erase(state_->Owner->Controls, state_.get());
+  if (state_->Handle != nullptr) ::DestroyWindow(state_->Handle);
+}
+
+bool Control::Enabled() const { return state_->Enabled; }
+
+void Control::Enable(bool enabled) {
+  if (state_->Handle == nullptr) return;
+  state_->Enabled = enabled;
+  ::EnableWindow(state_->Handle, enabled);
+  KeepFocus(*state_, enabled);
+  UpdateToolTip(*state_);
+}
+
+bool Control::Visible() const { return state_->Visible; }
+
+void Control::Show(bool visible) {
+  if (state_->Handle == nullptr) return;
+  state_->Visible = visible;
+  ::ShowWindow(state_->Handle, visible ? SW_SHOWNA : SW_HIDE);
+  KeepFocus(*state_, visible);
+  UpdateToolTip(*state_);
+}
+
+void Control::SetFocus() {
+  if (state_->Handle == nullptr || !state_->Enabled || !state_->Visible) return;
+  state_->Owner->Focus = state_->Handle;
+  if (::GetActiveWindow() == state_->Owner->Handle) ::SetFocus(state_->Handle);  // else once the window is active
+}
+
+std::string Control::Caption() const { return state_->Caption; }
+
+void Control::SetCaption(const std::string& caption) {
+  if (state_->Handle == nullptr) return;
+  state_->Caption = caption;
+  if (!state_->NamedByToolTip) SetNativeText(*state_, caption);
+  if (state_->LayOut) state_->LayOut();
+}
+
+std::string Control::ToolTip() const { return state_->ToolTip; }
+
+void Control::SetToolTip(const std::string& text) {
+  if (state_->Handle == nullptr) return;
+  state_->ToolTip = text;
+  if (state_->NamedByToolTip) SetNativeText(*state_, text);
+  UpdateToolTip(*state_);
+}
+
+std::int32_t Control::Handle() const {
+  return static_cast<std::int32_t>(reinterpret_cast<std::intptr_t>(state_->Handle));
+}
+
+}  // namespace platform

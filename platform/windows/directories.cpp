@@ -1,0 +1,91 @@
+// Listings of directories.
+#include <windows.h>
+
+#include <algorithm>
+#include <memory>
+#include <utility>
+
+#include "platform/files.h"
+#include "platform/text.h"
+#include "platform/wildcards.h"
+#include "platform/windows/paths.h"
+
+namespace platform {
+namespace {
+
+constexpr DWORD NotListed = FILE_ATTRIBUTE_HIDDEN | FILE_ATTRIBUTE_SYSTEM | FILE_ATTRIBUTE_DIRECTORY;
+
+struct FindCloser {
+  using pointer = HANDLE;
+  void operator()(HANDLE find) const { ::FindClose(find); }
+};
+using FindHandle = std::unique_ptr<void, FindCloser>;  // null: nothing found
+
+FindHandle FindFirst(const std::string& pattern, WIN32_FIND_DATAA& data) {
+  const HANDLE find = ::FindFirstFileExA(WindowsPath(pattern), FindExInfoStandard, &data, FindExSearchNameMatch,
+                                         nullptr, FIND_FIRST_EX_LARGE_FETCH);
+  return FindHandle(find == INVALID_HANDLE_VALUE ? nullptr : find);
+}
+
+DirectoryEntry EntryOf(const WIN32_FIND_DATAA& data) { return {data.cFileName, data.cAlternateFileName}; }
+
+// Bytes that compare as the text does in CompareStringA. One call a name, where comparing would take one a comparison.
+std::string SortKey(const std::string& text) {
+  constexpr DWORD flags = LCMAP_SORTKEY | NORM_IGNORECASE;
+  const auto map = [&](char* buffer, int room) {
+    return ::LCMapStringA(LOCALE_USER_DEFAULT, flags, text.data(), static_cast<int>(text.size()), buffer, room);
+  };
+  std::string key(8 * text.size() + 16, '\0');  // enough for most
+  int length = map(key.data(), static_cast<int>(key.size()));
+  if (length == 0) {
+    key.resize(static_cast<std::size_t>(map(nullptr, 0)));
+    length = map(key.data(), static_cast<int>(key.size()));
+  }
+  key.resize(static_cast<std::size_t>(length));
+  return key;
+}
+
+struct SortedEntry {
+  std::string Key;
+  DirectoryEntry Entry;
+  bool operator<(const SortedEntry& other) const {
+    return Key != other.Key ? Key < other.Key : Entry.Name < other.Entry.Name;
+  }
+};
+
+bool HasWildcard(const std::string& path) {
+  const std::size_t name = path.find_last_of("\\/:") + 1;          // 0 when there is none
+  return path.find_first_of("*?<>\"", name) != std::string::npos;  // the last three are wildcards inside Windows
+}
+
+}  // namespace
+
+// Each name is matched here and not by Windows, whose own search also looks at the 8.3 names, so that "*.zip" would
+// find "a.zipx", and which would read the directory anew for each pattern.
+std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
+  const std::string wanted = CharUpperBuffA(patterns);
+  std::vector<SortedEntry> found;
+  WIN32_FIND_DATAA data;
+  const FindHandle find = FindFirst(directory + "*", data);
+  for (bool more = find != nullptr; more; more = ::FindNextFileA(find.get(), &data) != 0) {
+    if (data.dwFileAttributes & NotListed) continue;
+    DirectoryEntry entry = EntryOf(data);
+    if (!MatchesAnyPattern(CharUpperBuffA(entry.Name), wanted)) continue;
+    found.push_back({SortKey(entry.Name), std::move(entry)});
+  }
+  std::sort(found.begin(), found.end());
+
+  std::vector<DirectoryEntry> entries;
+  entries.reserve(found.size());
+  for (SortedEntry& each : found) entries.push_back(std::move(each.Entry));
+  return entries;
+}
+
+std::optional<DirectoryEntry> ListPath(const std::string& path) {
+  if (HasWildcard(path)) return std::nullopt;
+  WIN32_FIND_DATAA data;
+  if (!FindFirst(path, data) || data.dwFileAttributes & NotListed) return std::nullopt;
+  return EntryOf(data);
+}
+
+}  // namespace platform

@@ -1,0 +1,142 @@
+#include "platform/files.h"
+
+#include <windows.h>
+
+#include <algorithm>
+#include <utility>
+
+#include "platform/windows/paths.h"
+
+namespace platform {
+namespace {
+
+constexpr std::size_t LongestTransfer = std::size_t{1} << 30;  // Windows counts the bytes of one call in 32 bits
+
+HANDLE Handle(std::intptr_t handle) { return reinterpret_cast<HANDLE>(handle); }
+
+OVERLAPPED At(std::int64_t position) {
+  OVERLAPPED place{};
+  place.Offset = static_cast<DWORD>(position);
+  place.OffsetHigh = static_cast<DWORD>(position >> 32);
+  return place;
+}
+
+HANDLE OpenFile(const std::string& path, Access access) {
+  const DWORD rights = access == Access::Read             ? GENERIC_READ
+                       : access == Access::ReplaceContent ? GENERIC_WRITE
+                                                          : GENERIC_READ | GENERIC_WRITE;
+  return ::CreateFileA(WindowsPath(path), rights, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
+                       access == Access::Read ? OPEN_EXISTING : OPEN_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
+}
+
+}  // namespace
+
+File::File(const std::string& path, Access access) : handle_(reinterpret_cast<std::intptr_t>(OpenFile(path, access))) {
+  if (!IsOpen()) return;
+  // Names like "nul" and "com1" open a device, in every directory and with any extension: what is written there is
+  // lost.
+  const bool device = ::GetFileType(Handle(handle_)) != FILE_TYPE_DISK;
+  // CREATE_ALWAYS would empty it too, but refuses hidden files.
+  if (device || (access == Access::ReplaceContent && !SetSize(0))) Close();
+}
+
+File::File(File&& other) noexcept : handle_(std::exchange(other.handle_, -1)) {}
+
+File& File::operator=(File&& other) noexcept {
+  if (this != &other) {
+    Close();
+    handle_ = std::exchange(other.handle_, -1);
+  }
+  return *this;
+}
+
+File::~File() { Close(); }
+
+bool File::IsOpen() const { return handle_ != -1; }
+
+void File::Close() {
+  if (IsOpen()) ::CloseHandle(Handle(std::exchange(handle_, -1)));
+}
+
+std::int64_t File::Size() const {
+  LARGE_INTEGER size;
+  return IsOpen() && ::GetFileSizeEx(Handle(handle_), &size) ? size.QuadPart : -1;
+}
+
+std::int64_t File::Read(std::int64_t position, void* buffer, std::size_t length) {
+  if (!IsOpen() || position < 0) return -1;
+  std::size_t done = 0;
+  while (done < length) {
+    OVERLAPPED place = At(position + static_cast<std::int64_t>(done));
+    DWORD count = 0;
+    const auto wanted = static_cast<DWORD>(std::min(length - done, LongestTransfer));
+    if (!::ReadFile(Handle(handle_), static_cast<char*>(buffer) + done, wanted, &count, &place) &&
+        ::GetLastError() != ERROR_HANDLE_EOF) {
+      return -1;
+    }
+    if (count == 0) break;
+    done += count;
+  }
+  return static_cast<std::int64_t>(done);
+}
+
+bool File::Write(std::int64_t position, std::string_view bytes) {
+  if (!IsOpen() || position < 0) return false;
+  while (!bytes.empty()) {
+    OVERLAPPED place = At(position);
+    DWORD count = 0;
+    const auto wanted = static_cast<DWORD>(std::min(bytes.size(), LongestTransfer));
+    if (!::WriteFile(Handle(handle_), bytes.data(), wanted, &count, &place) || count != wanted) return false;
+    bytes.remove_prefix(count);
+    position += count;
+  }
+  return true;
+}
+
+bool File::SetSize(std::int64_t length) {
+  FILE_END_OF_FILE_INFO end{};
+  end.EndOfFile.QuadPart = length;
+  return IsOpen() && length >= 0 &&
+         ::SetFileInformationByHandle(Handle(handle_), FileEndOfFileInfo, &end, sizeof end) != 0;
+}
+
+bool File::Flush() { return IsOpen() && ::FlushFileBuffers(Handle(handle_)) != 0; }
+
+std::optional<std::uint32_t> GetFileAttributesA(const std::string& path) {
+  const DWORD attributes = ::GetFileAttributesA(WindowsPath(path));
+  if (attributes == INVALID_FILE_ATTRIBUTES) return std::nullopt;
+  return attributes;
+}
+
+std::optional<std::int64_t> FileSize(const std::string& path) {
+  WIN32_FILE_ATTRIBUTE_DATA data;
+  if (!::GetFileAttributesExA(WindowsPath(path), GetFileExInfoStandard, &data)) return std::nullopt;
+  if (data.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) return std::nullopt;
+  return static_cast<std::int64_t>(data.nFileSizeHigh) << 32 | data.nFileSizeLow;
+}
+
+bool DeleteFileA(const std::string& path) { return ::DeleteFileA(WindowsPath(path)) != 0; }
+
+bool MoveFileExA(const std::string& from, const std::string& to) {
+  return ::MoveFileExA(WindowsPath(from), WindowsPath(to), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH) != 0;
+}
+
+bool CopyFileA(const std::string& from, const std::string& to) {
+  if (!::CopyFileA(WindowsPath(from), WindowsPath(to), FALSE)) return false;
+  // Until here the copy may stand in the system's cache only, and a floppy is soon taken out of its drive. The copy of
+  // a read-only file cannot be opened for writing, as flushing demands; the system writes it in its own time.
+  File copy(to, Access::ReadWrite);
+  return !copy.IsOpen() || copy.Flush();
+}
+
+bool CreateDirectoryA(const std::string& path) { return ::CreateDirectoryA(WindowsPath(path), nullptr) != 0; }
+
+std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_t bufferLength) {
+  std::string buffer(bufferLength, '\0');
+  const DWORD length = ::GetShortPathNameA(WindowsPath(path), buffer.data(), static_cast<DWORD>(bufferLength));
+  if (length == 0 || length >= bufferLength) return std::nullopt;
+  buffer.resize(length);
+  return buffer;
+}
+
+}  // namespace platform

@@ -1,0 +1,84 @@
+#include <algorithm>
+#include <vector>
+
+#include "platform/controls.h"
+#include "platform/windows/state.h"
+
+namespace platform {
+namespace {
+
+std::string TextOf(HWND list, int index) {
+  const LRESULT length = ::SendMessageA(list, LB_GETTEXTLEN, static_cast<WPARAM>(index), 0);
+  if (index < 0 || length <= 0) return {};
+  std::string text(static_cast<std::size_t>(length) + 1, '\0');  // with the closing zero
+  const LRESULT copied =
+      ::SendMessageA(list, LB_GETTEXT, static_cast<WPARAM>(index), reinterpret_cast<LPARAM>(text.data()));
+  text.resize(copied > 0 ? static_cast<std::size_t>(copied) : 0);
+  return text;
+}
+
+// What LB_FINDSTRINGEXACT finds, for the list of a closed window.
+int FindExactIn(const std::vector<std::string>& texts, const std::string& text) {
+  const auto same = [&](const std::string& entry) {
+    return ::CompareStringA(LOCALE_USER_DEFAULT, NORM_IGNORECASE, entry.c_str(), -1, text.c_str(), -1) == CSTR_EQUAL;
+  };
+  const auto found = std::find_if(texts.begin(), texts.end(), same);
+  return found == texts.end() ? -1 : static_cast<int>(found - texts.begin());
+}
+
+}  // namespace
+
+ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) {
+  const DWORD sorted = order == Order::Sorted ? LBS_SORT : 0;
+  CreateControl(*state_, container, bounds,
+                {"LISTBOX", WS_TABSTOP | WS_VSCROLL | LBS_NOTIFY | LBS_NOINTEGRALHEIGHT | sorted, WS_EX_CLIENTEDGE});
+  state_->EnterIsKey = true;
+  state_->OnNotification = [this](int code) {
+    if (code == LBN_SELCHANGE) Raise(OnClick);
+    if (code == LBN_DBLCLK) Raise(OnDoubleClick);
+  };
+  state_->OnKey = [this](int key, bool) {
+    Raise(OnKeyDown, key);
+    return false;
+  };
+  state_->Remember = [this] {
+    state_->LastValue = Selected();
+    for (int i = 0, count = Count(); i < count; ++i) state_->LastTexts.push_back(Text(i));
+  };
+}
+
+void ListBox::Add(const std::string& text) {
+  ::SendMessageA(state_->Handle, LB_ADDSTRING, 0, reinterpret_cast<LPARAM>(text.c_str()));
+}
+
+void ListBox::Clear() { ::SendMessageA(state_->Handle, LB_RESETCONTENT, 0, 0); }
+
+int ListBox::Count() const {
+  if (state_->Handle == nullptr) return static_cast<int>(state_->LastTexts.size());
+  return static_cast<int>(::SendMessageA(state_->Handle, LB_GETCOUNT, 0, 0));
+}
+
+std::string ListBox::Text(int index) const {
+  if (state_->Handle != nullptr) return TextOf(state_->Handle, index);
+  return index >= 0 && index < Count() ? state_->LastTexts[static_cast<std::size_t>(index)] : std::string();
+}
+
+int ListBox::Selected() const {
+  if (state_->Handle == nullptr) return state_->LastValue;
+  return static_cast<int>(::SendMessageA(state_->Handle, LB_GETCURSEL, 0, 0));
+}
+
+void ListBox::Select(int index) { ::SendMessageA(state_->Handle, LB_SETCURSEL, static_cast<WPARAM>(index), 0); }
+
+int ListBox::FindExact(const std::string& text) const {
+  if (state_->Handle == nullptr) return FindExactIn(state_->LastTexts, text);
+  return static_cast<int>(::SendMessageA(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
+                                         reinterpret_cast<LPARAM>(text.c_str())));
+}
+
+void ListBox::SetRedraw(bool redraw) {
+  ::SendMessageA(state_->Handle, WM_SETREDRAW, redraw, 0);
+  if (redraw && state_->Handle != nullptr) ::InvalidateRect(state_->Handle, nullptr, TRUE);
+}
+
+}  // namespace platform

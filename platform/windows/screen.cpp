@@ -1,0 +1,82 @@
+#include "platform/windows/screen.h"
+
+#include <utility>
+#include <vector>
+
+#include "platform/windows/system_library.h"
+
+namespace platform {
+namespace {
+
+struct FontDeleter {
+  void operator()(HFONT font) const { ::DeleteObject(font); }
+};
+
+struct KnownFont {
+  Font Wanted;
+  int Dpi;
+  std::unique_ptr<std::remove_pointer_t<HFONT>, FontDeleter> Handle;
+};
+
+// "MS Sans Serif" is a bitmap font of a few sizes, drawn for the usual resolution. Elsewhere its scalable twin serves.
+const char* Face(int dpi) { return dpi == UsualDpi ? "MS Sans Serif" : "Microsoft Sans Serif"; }
+
+HFONT CreateFontFor(const Font& font, int dpi) {
+  const int height = ::MulDiv(font.TenthsOfPoint, dpi, 720);
+  return ::CreateFontA(-height, 0, 0, 0, font.Bold ? FW_BOLD : FW_NORMAL, FALSE, FALSE, FALSE, DEFAULT_CHARSET,
+                       OUT_DEFAULT_PRECIS, CLIP_DEFAULT_PRECIS, DEFAULT_QUALITY, DEFAULT_PITCH | FF_DONTCARE,
+                       Face(dpi));
+}
+
+}  // namespace
+
+int DpiOfScreen() {
+  const HDC screen = ::GetDC(nullptr);
+  const int dpi = ::GetDeviceCaps(screen, LOGPIXELSX);
+  ::ReleaseDC(nullptr, screen);
+  return dpi > 0 ? dpi : UsualDpi;
+}
+
+// The functions that know of a resolution for each monitor came with Windows 10; before it, all windows have the
+// screen's.
+int DpiOfWindow(HWND window) {
+  static const auto getDpiForWindow = SystemFunction<UINT WINAPI(HWND)>("user32.dll", "GetDpiForWindow");
+  const int dpi = getDpiForWindow != nullptr ? static_cast<int>(getDpiForWindow(window)) : 0;
+  return dpi > 0 ? dpi : DpiOfScreen();
+}
+
+DWORD NativeStyle(const WindowStyle& style) {
+  return WS_OVERLAPPED | WS_CAPTION | WS_SYSMENU | (style.MinimizeBox ? WS_MINIMIZEBOX : 0UL);
+}
+
+SIZE WindowSize(const WindowStyle& style, int dpi) {
+  static const auto adjustForDpi =
+      SystemFunction<BOOL WINAPI(LPRECT, DWORD, BOOL, DWORD, UINT)>("user32.dll", "AdjustWindowRectExForDpi");
+  RECT area = {0, 0, ToPixels(style.ClientWidth, dpi), ToPixels(style.ClientHeight, dpi)};
+  if (adjustForDpi != nullptr) {
+    adjustForDpi(&area, NativeStyle(style), FALSE, 0, static_cast<UINT>(dpi));
+  } else {
+    ::AdjustWindowRectEx(&area, NativeStyle(style), FALSE, 0);
+  }
+  return {area.right - area.left, area.bottom - area.top};
+}
+
+HFONT FontFor(const Font& font, int dpi) {
+  static std::vector<KnownFont> known;
+  for (const KnownFont& one : known) {
+    if (one.Dpi == dpi && one.Wanted.TenthsOfPoint == font.TenthsOfPoint && one.Wanted.Bold == font.Bold) {
+      return one.Handle.get();
+    }
+  }
+  known.push_back({font, dpi, {}});
+  known.back().Handle.reset(CreateFontFor(font, dpi));
+  return known.back().Handle.get();
+}
+
+IconHandle LoadIconFor(int id, int side, int dpi) {
+  const int pixels = ::MulDiv(side, dpi, UsualDpi);
+  return IconHandle(static_cast<HICON>(
+      ::LoadImageA(::GetModuleHandleA(nullptr), MAKEINTRESOURCEA(id), IMAGE_ICON, pixels, pixels, LR_DEFAULTCOLOR)));
+}
+
+}  // namespace platform

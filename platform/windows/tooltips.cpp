@@ -1,0 +1,61 @@
+// clang-format off
+#include <windows.h>
+#include <commctrl.h>
+// clang-format on
+
+#include "platform/windows/state.h"
+
+namespace platform {
+namespace {
+
+// The size that every version of the common controls knows.
+TTTOOLINFOA Tool(const ControlState& control) {
+  TTTOOLINFOA tool{};
+  tool.cbSize = TTTOOLINFOA_V2_SIZE;
+  tool.hwnd = control.Owner->Handle;
+  tool.lpszText = const_cast<char*>(control.ToolTip.c_str());  // the structure serves for reading, too
+  return tool;
+}
+
+// The control itself, which gets the mouse's messages while it is enabled.
+TTTOOLINFOA ControlTool(const ControlState& control) {
+  TTTOOLINFOA tool = Tool(control);
+  tool.uFlags = TTF_SUBCLASS | TTF_IDISHWND;
+  tool.uId = reinterpret_cast<UINT_PTR>(control.Handle);
+  return tool;
+}
+
+// Its place in the window, which gets them while the control is disabled.
+TTTOOLINFOA PlaceTool(const ControlState& control) {
+  TTTOOLINFOA tool = Tool(control);
+  tool.uFlags = TTF_SUBCLASS;
+  tool.uId = static_cast<UINT_PTR>(::GetDlgCtrlID(control.Handle));
+  ::GetWindowRect(control.Handle, &tool.rect);
+  ::MapWindowPoints(nullptr, tool.hwnd, reinterpret_cast<POINT*>(&tool.rect), 2);
+  return tool;
+}
+
+HWND CreateToolTips(HWND window) {
+  return ::CreateWindowExA(WS_EX_TOPMOST, TOOLTIPS_CLASSA, nullptr, WS_POPUP | TTS_NOPREFIX | TTS_ALWAYSTIP,
+                           CW_USEDEFAULT, CW_USEDEFAULT, CW_USEDEFAULT, CW_USEDEFAULT, window, nullptr,
+                           ::GetModuleHandleA(nullptr), nullptr);
+}
+
+void Replace(HWND tips, TTTOOLINFOA tool, bool wanted) {
+  ::SendMessageA(tips, TTM_DELTOOLA, 0, reinterpret_cast<LPARAM>(&tool));
+  if (wanted) ::SendMessageA(tips, TTM_ADDTOOLA, 0, reinterpret_cast<LPARAM>(&tool));
+}
+
+}  // namespace
+
+void UpdateToolTip(const ControlState& control) {
+  if (control.Handle == nullptr) return;
+  HWND& tips = control.Owner->ToolTips;
+  const bool wanted = !control.ToolTip.empty();
+  if (tips == nullptr && !wanted) return;
+  if (tips == nullptr) tips = CreateToolTips(control.Owner->Handle);
+  Replace(tips, ControlTool(control), wanted);
+  Replace(tips, PlaceTool(control), wanted && control.Visible && !control.Enabled);
+}
+
+}  // namespace platform

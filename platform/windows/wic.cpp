@@ -1,0 +1,93 @@
+#include "platform/windows/wic.h"
+
+// clang-format off
+#include <windows.h>
+#include <initguid.h>
+#include <objbase.h>
+#include <wincodec.h>
+// clang-format on
+
+#include <memory>
+
+#include "platform/windows/system_library.h"
+
+namespace platform {
+namespace {
+
+struct Releaser {
+  void operator()(IUnknown* object) const { object->Release(); }
+};
+template <typename T>
+using Owned = std::unique_ptr<T, Releaser>;
+
+// The object that `create` puts into the pointer it is given; null when it fails.
+template <typename T, typename Create>
+Owned<T> Obtain(Create create) {
+  T* object = nullptr;
+  return Owned<T>(SUCCEEDED(create(&object)) ? object : nullptr);
+}
+
+Owned<IWICImagingFactory> CreateFactory() {
+  const auto initialize = SystemFunction<HRESULT WINAPI(LPVOID, DWORD)>("ole32.dll", "CoInitializeEx");
+  const auto create =
+      SystemFunction<HRESULT WINAPI(REFCLSID, LPUNKNOWN, DWORD, REFIID, LPVOID*)>("ole32.dll", "CoCreateInstance");
+  if (initialize == nullptr || create == nullptr) return nullptr;
+  initialize(nullptr, COINIT_APARTMENTTHREADED);
+  return Obtain<IWICImagingFactory>([&](IWICImagingFactory** factory) {
+    return create(CLSID_WICImagingFactory, nullptr, CLSCTX_INPROC_SERVER, IID_IWICImagingFactory,
+                  reinterpret_cast<LPVOID*>(factory));
+  });
+}
+
+// Made once, when the first picture needs it, and alive until the process ends.
+IWICImagingFactory* Factory() {
+  static IWICImagingFactory* const factory = CreateFactory().release();
+  return factory;
+}
+
+Owned<IWICBitmapDecoder> OpenDecoder(IWICImagingFactory* factory, IWICStream* stream, std::string_view content) {
+  auto* bytes = reinterpret_cast<BYTE*>(const_cast<char*>(content.data()));  // the stream only reads them
+  if (FAILED(stream->InitializeFromMemory(bytes, static_cast<DWORD>(content.size())))) return nullptr;
+  return Obtain<IWICBitmapDecoder>([&](IWICBitmapDecoder** decoder) {
+    return factory->CreateDecoderFromStream(stream, nullptr, WICDecodeMetadataCacheOnDemand, decoder);
+  });
+}
+
+// A colour multiplied by its opacity, in front of white.
+std::uint32_t OverWhite(std::uint32_t pixel) { return (pixel & 0xFFFFFF) + (0xFF - (pixel >> 24)) * 0x010101; }
+
+std::optional<Pixels> ReadPixels(IWICBitmapSource* frame, IWICFormatConverter* converter) {
+  UINT width = 0, height = 0;
+  if (FAILED(frame->GetSize(&width, &height)) || width == 0 || height == 0) return std::nullopt;
+  if (width > MostPixels || height > MostPixels || std::int64_t{width} * height > MostPixels) return std::nullopt;
+  if (FAILED(converter->Initialize(frame, GUID_WICPixelFormat32bppPBGRA, WICBitmapDitherTypeNone, nullptr, 0,
+                                   WICBitmapPaletteTypeCustom))) {
+    return std::nullopt;
+  }
+  Pixels pixels{static_cast<int>(width), static_cast<int>(height),
+                std::vector<std::uint32_t>(std::size_t{width} * height)};
+  if (FAILED(converter->CopyPixels(nullptr, 4 * width, static_cast<UINT>(4 * pixels.Colours.size()),
+                                   reinterpret_cast<BYTE*>(pixels.Colours.data())))) {
+    return std::nullopt;
+  }
+  for (std::uint32_t& pixel : pixels.Colours) pixel = OverWhite(pixel);
+  return pixels;
+}
+
+}  // namespace
+
+std::optional<Pixels> DecodeWithWic(std::string_view content) {
+  IWICImagingFactory* factory = Factory();
+  if (factory == nullptr || content.size() > MAXDWORD) return std::nullopt;
+  const auto stream = Obtain<IWICStream>([&](IWICStream** made) { return factory->CreateStream(made); });
+  if (!stream) return std::nullopt;
+  const auto decoder = OpenDecoder(factory, stream.get(), content);
+  if (!decoder) return std::nullopt;
+  const auto frame =
+      Obtain<IWICBitmapFrameDecode>([&](IWICBitmapFrameDecode** first) { return decoder->GetFrame(0, first); });
+  const auto converter =
+      Obtain<IWICFormatConverter>([&](IWICFormatConverter** made) { return factory->CreateFormatConverter(made); });
+  return frame && converter ? ReadPixels(frame.get(), converter.get()) : std::nullopt;
+}
+
+}  // namespace platform

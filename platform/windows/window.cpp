@@ -1,0 +1,114 @@
+#include "platform/controls.h"
+#include "platform/windows/drawing.h"
+#include "platform/windows/state.h"
+
+namespace platform {
+namespace {
+
+void Centre(const WindowState& window) {
+  MONITORINFO monitor{};
+  monitor.cbSize = sizeof monitor;
+  ::GetMonitorInfoA(::MonitorFromWindow(window.Handle, MONITOR_DEFAULTTOPRIMARY), &monitor);
+  const SIZE size = WindowSize(window.Style, window.Dpi);
+  const RECT& area = monitor.rcWork;
+  ::SetWindowPos(window.Handle, nullptr, area.left + (area.right - area.left - size.cx) / 2,
+                 area.top + (area.bottom - area.top - size.cy) / 2, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
+}
+
+// Where the window is in screen pixels; of a minimized window, where it will be again.
+RECT PlaceOf(const WindowState& window) {
+  if (window.Handle == nullptr) return window.LastPlace;
+  RECT place = {};
+  if (!::IsIconic(window.Handle)) {
+    ::GetWindowRect(window.Handle, &place);
+    return place;
+  }
+  WINDOWPLACEMENT placement{};
+  placement.length = sizeof placement;
+  ::GetWindowPlacement(window.Handle, &placement);
+  place = placement.rcNormalPosition;  // relative to the work area
+  MONITORINFO monitor{};
+  monitor.cbSize = sizeof monitor;
+  ::GetMonitorInfoA(::MonitorFromRect(&place, MONITOR_DEFAULTTONEAREST), &monitor);
+  ::OffsetRect(&place, monitor.rcWork.left - monitor.rcMonitor.left, monitor.rcWork.top - monitor.rcMonitor.top);
+  return place;
+}
+
+void MoveTo(const WindowState& window, int left, int top) {
+  ::SetWindowPos(window.Handle, nullptr, left, top, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
+}
+
+}  // namespace
+
+Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(*this, style)) {
+  RegisterWindowClass();
+  AllWindows().push_back(state_.get());
+  if (style.Background != 0) state_->Background = LoadPictureResource(style.Background);
+  ::CreateWindowExA(0, WindowClass, style.Caption.c_str(), NativeStyle(style), CW_USEDEFAULT, CW_USEDEFAULT, 0, 0,
+                    nullptr, nullptr, ::GetModuleHandleA(nullptr), state_.get());
+  if (state_->Handle == nullptr) return;
+  state_->Dpi = DpiOfWindow(state_->Handle);
+  Centre(*state_);
+  LayOutWindow(*state_);
+}
+
+Window::~Window() {
+  if (state_->Handle != nullptr) {
+    PrepareToClose(*state_, false);
+    ::DestroyWindow(state_->Handle);
+  }
+  for (ControlState* control : state_->Controls) control->Owner = nullptr;
+  for (TimerState* timer : state_->Timers) timer->Owner = nullptr;
+  std::erase(AllWindows(), state_.get());
+}
+
+void Window::Show() {
+  ::ShowWindow(state_->Handle, SW_SHOWNORMAL);
+  ::UpdateWindow(state_->Handle);
+}
+
+void Window::Close() {
+  if (state_->Handle == nullptr || state_->Closing) return;
+  PrepareToClose(*state_, true);
+  ::DestroyWindow(state_->Handle);
+}
+
+bool Window::IsClosed() const { return state_->Handle == nullptr; }
+
+std::string Window::Caption() const { return state_->Style.Caption; }
+
+void Window::SetCaption(const std::string& caption) {
+  if (state_->Handle == nullptr) return;
+  state_->Style.Caption = caption;
+  ::SetWindowTextA(state_->Handle, caption.c_str());
+}
+
+int Window::Left() const { return ToTwips(PlaceOf(*state_).left, state_->Dpi); }
+
+int Window::Top() const { return ToTwips(PlaceOf(*state_).top, state_->Dpi); }
+
+int Window::Width() const {
+  const RECT place = PlaceOf(*state_);
+  return ToTwips(place.right - place.left, state_->Dpi);
+}
+
+int Window::Height() const {
+  const RECT place = PlaceOf(*state_);
+  return ToTwips(place.bottom - place.top, state_->Dpi);
+}
+
+void Window::SetLeft(int left) { MoveTo(*state_, ToPixels(left, state_->Dpi), PlaceOf(*state_).top); }
+
+void Window::SetTop(int top) { MoveTo(*state_, PlaceOf(*state_).left, ToPixels(top, state_->Dpi)); }
+
+bool Window::Enabled() const {
+  return state_->Handle != nullptr ? ::IsWindowEnabled(state_->Handle) != FALSE : state_->LastEnabled;
+}
+
+void Window::Enable(bool enabled) { ::EnableWindow(state_->Handle, enabled); }
+
+std::int32_t Window::Handle() const {
+  return static_cast<std::int32_t>(reinterpret_cast<std::intptr_t>(state_->Handle));
+}
+
+}  // namespace platform

@@ -1,0 +1,167 @@
+#include <algorithm>
+#include <utility>
+
+#include "platform/windows/drawing.h"
+#include "platform/windows/state.h"
+#include "resources/ids.h"
+
+namespace platform {
+namespace {
+
+constexpr int LargeIconSide = 32, SmallIconSide = 16;
+
+ControlState* FindControl(const WindowState& window, HWND handle) {
+  const auto found = std::find_if(window.Controls.begin(), window.Controls.end(),
+                                  [&](const ControlState* control) { return control->Handle == handle; });
+  return handle != nullptr && found != window.Controls.end() ? *found : nullptr;
+}
+
+void EraseBackground(const WindowState& window, HDC context) {
+  RECT area = {};
+  ::GetClientRect(window.Handle, &area);
+  if (window.Background) {
+    const Pixels& picture = window.Background.Data()->Image;
+    const RECT place = {0, 0, ::MulDiv(picture.Width, window.Dpi, UsualDpi),
+                        ::MulDiv(picture.Height, window.Dpi, UsualDpi)};
+    DrawPicture(context, place, window.Background);
+    ::ExcludeClipRect(context, 0, 0, place.right, place.bottom);
+  }
+  ::FillRect(context, &area, ::GetSysColorBrush(COLOR_BTNFACE));
+}
+
+// The keyboard goes back to the control that had it, and at first to the one that is first in order.
+void PassFocusOn(const WindowState& window) {
+  HWND target = window.Focus;
+  if (target == nullptr) target = ::GetNextDlgTabItem(window.Handle, nullptr, FALSE);
+  if (target != nullptr && ::IsWindowEnabled(target) && ::IsWindowVisible(target)) ::SetFocus(target);
+}
+
+void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
+  window.Dpi = dpi;
+  const SIZE size = WindowSize(window.Style, dpi);
+  ::SetWindowPos(window.Handle, nullptr, suggested.left, suggested.top, size.cx, size.cy,
+                 SWP_NOZORDER | SWP_NOACTIVATE);
+  LayOutWindow(window);
+}
+
+void Tick(const WindowState& window, UINT_PTR id) {
+  for (const TimerState* timer : window.Timers) {
+    if (reinterpret_cast<UINT_PTR>(timer) != id) continue;
+    if (timer->Enabled) Raise(timer->Object.OnTick);
+    return;
+  }
+}
+
+void Command(const WindowState& window, WPARAM wParam, HWND sender) {
+  const ControlState* control = FindControl(window, sender);
+  if (control != nullptr && control->OnNotification) {
+    control->OnNotification(HIWORD(wParam));
+  } else if (LOWORD(wParam) == IDCANCEL && window.Style.CloseOnEscape) {
+    ::SendMessageA(window.Handle, WM_CLOSE, 0, 0);
+  }
+}
+
+// The brush for the ground of a text, or null for the usual one.
+HBRUSH TextGround(const WindowState& window, HDC context, HWND sender) {
+  const ControlState* control = FindControl(window, sender);
+  if (control == nullptr || !control->WhiteGround) return nullptr;
+  ::SetBkColor(context, RGB(255, 255, 255));
+  ::SetTextColor(context, RGB(0, 0, 0));
+  return static_cast<HBRUSH>(::GetStockObject(WHITE_BRUSH));
+}
+
+// Whether the message is answered here, and the answer.
+std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam, LPARAM lParam) {
+  switch (message) {
+    case WM_COMMAND:
+      Command(window, wParam, reinterpret_cast<HWND>(lParam));
+      return {true, 0};
+    case WM_DRAWITEM: {
+      const auto& item = *reinterpret_cast<const DRAWITEMSTRUCT*>(lParam);
+      const ControlState* control = FindControl(window, item.hwndItem);
+      if (control == nullptr || !control->Draw) return {false, 0};
+      control->Draw(item);
+      return {true, TRUE};
+    }
+    case WM_CTLCOLORSTATIC: {
+      const HBRUSH ground = TextGround(window, reinterpret_cast<HDC>(wParam), reinterpret_cast<HWND>(lParam));
+      return {ground != nullptr, reinterpret_cast<LRESULT>(ground)};
+    }
+    case WM_ERASEBKGND:
+      EraseBackground(window, reinterpret_cast<HDC>(wParam));
+      return {true, TRUE};
+    case WM_TIMER:
+      Tick(window, wParam);
+      return {true, 0};
+    case WM_SETFOCUS:
+      PassFocusOn(window);
+      return {true, 0};
+    case WM_DPICHANGED:
+      ChangeDpi(window, HIWORD(wParam), *reinterpret_cast<const RECT*>(lParam));
+      return {true, 0};
+    case WM_CLOSE:  // the close box of a window that takes no input does nothing
+      if (::IsWindowEnabled(window.Handle)) window.Object.Close();
+      return {true, 0};
+    case WM_DESTROY:  // by its owner's end, perhaps
+      PrepareToClose(window, true);
+      return {true, 0};
+    default:
+      return {false, 0};
+  }
+}
+
+LRESULT CALLBACK WindowProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message == WM_NCCREATE) {
+    auto* window = static_cast<WindowState*>(reinterpret_cast<const CREATESTRUCTA*>(lParam)->lpCreateParams);
+    window->Handle = handle;
+    ::SetWindowLongPtrA(handle, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(window));
+  }
+  auto* window = reinterpret_cast<WindowState*>(::GetWindowLongPtrA(handle, GWLP_USERDATA));
+  if (window != nullptr) {
+    if (message == WM_NCDESTROY) {
+      window->Handle = nullptr;
+      ::SetWindowLongPtrA(handle, GWLP_USERDATA, 0);
+    } else if (const auto [answered, result] = Answer(*window, message, wParam, lParam); answered) {
+      return result;
+    }
+  }
+  return ::DefWindowProcA(handle, message, wParam, lParam);
+}
+
+}  // namespace
+
+void RegisterWindowClass() {
+  static const ATOM registered = [] {
+    WNDCLASSEXA description{};
+    description.cbSize = sizeof description;
+    description.lpfnWndProc = WindowProcedure;
+    description.hInstance = ::GetModuleHandleA(nullptr);
+    description.hCursor = ::LoadCursorA(nullptr, MAKEINTRESOURCEA(32512));  // the arrow
+    description.lpszClassName = WindowClass;
+    return ::RegisterClassExA(&description);
+  }();
+  static_cast<void>(registered);
+}
+
+void LayOutWindow(WindowState& window) {
+  window.LargeIcon = LoadIconFor(ICONE_PROGRAMA, LargeIconSide, window.Dpi);
+  window.SmallIcon = LoadIconFor(ICONE_PROGRAMA, SmallIconSide, window.Dpi);
+  ::SendMessageA(window.Handle, WM_SETICON, ICON_BIG, reinterpret_cast<LPARAM>(window.LargeIcon.get()));
+  ::SendMessageA(window.Handle, WM_SETICON, ICON_SMALL, reinterpret_cast<LPARAM>(window.SmallIcon.get()));
+  for (ControlState* control : window.Controls) LayOutControl(*control);
+  ::InvalidateRect(window.Handle, nullptr, TRUE);
+}
+
+void PrepareToClose(WindowState& window, bool unload) {
+  if (window.Closing) return;
+  window.Closing = true;
+  if (unload) Raise(window.Object.OnUnload);
+  for (const HWND other : window.Disabled) ::EnableWindow(other, TRUE);
+  ::GetWindowRect(window.Handle, &window.LastPlace);
+  window.LastEnabled = ::IsWindowEnabled(window.Handle) != FALSE;
+  for (const ControlState* control : window.Controls) {
+    if (control->Remember) control->Remember();
+  }
+}
+
+}  // namespace platform

@@ -1,0 +1,15 @@
+// The free space of a disk as the save-file manager counts it: in 32 bits.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+#include "platform/files.h"
+
+// The free bytes of the disk that the path lies on. What cannot be told, or does not fit 31 bits, is 0; but 0 counts as
+// 1 GiB on every disk other than the floppy ("A", not "a"), so that only a floppy can be found full or missing.
+std::int32_t EspacoLivre(const std::string& caminho);
+
+// The same of a disk whose state is known.
+std::int32_t EspacoLivre(const std::string& caminho, const std::optional<platform::DiskFreeSpace>& disco);

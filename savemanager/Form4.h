@@ -1,0 +1,75 @@
+// The save-file manager: the emulator's save files on the floppy disk and on the computer, copied and deleted under the
+// names of their games.
+#pragma once
+
+#include <array>
+#include <cstdint>
+#include <string>
+
+#include "platform/controls.h"
+
+// Where the picked entry lies, and so which way a copy would go.
+enum class Origem : std::uint8_t { Nenhuma = 0, Disquete = 1, Computador = 2 };
+
+class Form4 : public platform::Window {
+ public:
+  // Opens a fresh window over the program's other ones and returns when it is closed.
+  static void Mostrar();
+
+  Form4(const Form4&) = delete;
+  Form4& operator=(const Form4&) = delete;
+
+  // Read the pane's directory again. Nothing is picked afterwards, whichever pane the entry was in.
+  void ListarDisquete();
+  void ListarComputador();
+
+  void Form_Load();
+  void List1_Click();
+  void List2_Click();
+  void List1_KeyDown(int tecla);
+  void List2_KeyDown(int tecla);
+  void Image1_Click();
+  void Image2_Click();
+  void Command1_Click();
+  void Command2_Click();
+
+  platform::Frame Frame1;
+  platform::ListBox List1;
+  platform::ImageButton Image1;
+  platform::Button Command1;
+  platform::Frame Frame2;
+  platform::ListBox List2;
+  platform::ImageButton Image2;
+  platform::Button Command2;
+
+  std::array<std::string, 2> Diretorios;  // of the floppy's and of the computer's pane
+  Origem Direcao = Origem::Nenhuma;
+  std::string ArquivoAtual;  // the name, without directory, of the file picked last
+
+ private:
+  // What differs between the two panes.
+  struct Painel {
+    Origem Lado;
+    const std::string& Diretorio;
+    platform::ListBox& Lista;
+    platform::ImageButton& Lixeira;
+    int Seta;            // on the copy button: the icon of a copy from here
+    std::string Copiar;  // and its tool tip
+    std::string JaExiste;
+    std::string FimPergunta;
+  };
+
+  Form4();
+  const Painel& Outro(const Painel& painel) const { return painel.Lado == Origem::Disquete ? Computador : Disquete; }
+  std::string CaminhoAtual(const Painel& painel) const;
+
+  void Listar(const Painel& painel);
+  void Preencher(const Painel& painel);
+  void Escolher(const Painel& painel);
+  void Copiar(const Painel& origem, const Painel& destino);
+  void RecolherEscolha();
+  void Deletar(const Painel& painel);
+
+  const Painel Disquete;
+  const Painel Computador;
+};

@@ -1,0 +1,75 @@
+// Copying the picked file to the other side.
+#include "platform/events.h"
+#include "platform/messages.h"
+#include "platform/text.h"
+#include "savemanager/EspacoLivre.h"
+#include "savemanager/Form4.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Traducao.h"
+
+namespace {
+
+using platform::Answer;
+using platform::Buttons;
+using platform::Icon;
+
+// A missing file has length 0: its copy is tried, and fails.
+bool Cabe(const std::string& arquivo, const std::string& destino) {
+  return TamanhoArquivo(arquivo) <= EspacoLivre(destino);
+}
+
+void AvisarDiscoCheio() {
+  platform::MessageBoxA(Traduzir("Não há espaço livre suficiente em disco para completar a operação."_ansi),
+                        Traduzir("Disco cheio"), Buttons::Ok, Icon::Exclamation);
+}
+
+void AvisarErro() {
+  platform::MessageBoxA(Traduzir("Erro ao gravar arquivo."), Traduzir("Erro"), Buttons::Ok, Icon::Critical);
+}
+
+bool ConfirmarSubstituir(const std::string& jaExiste) {
+  const std::string pergunta = Traduzir(jaExiste) + "\r\n" + Traduzir("Você deseja substituí-lo ?"_ansi);
+  return platform::MessageBoxA(pergunta, Traduzir("Salvamento já existente"_ansi), Buttons::YesNoCancel,
+                               Icon::Question) == Answer::Yes;
+}
+
+}  // namespace
+
+void Form4::Command1_Click() {
+  if (Direcao == Origem::Disquete)
+    Copiar(Disquete, Computador);
+  else if (Direcao == Origem::Computador)
+    Copiar(Computador, Disquete);
+}
+
+// The empty text when the pane has no directory.
+std::string Form4::CaminhoAtual(const Painel& painel) const {
+  return painel.Diretorio.empty() ? "" : painel.Diretorio + ArquivoAtual;
+}
+
+// The old file stays until the new one is complete, so there must be room for both. Events run while the title is
+// drawn: what is picked then does not outlive the copy.
+void Form4::Copiar(const Painel& origem, const Painel& destino) {
+  const std::string de = CaminhoAtual(origem);
+  const std::string para = CaminhoAtual(destino);
+  if (de.empty() || para.empty()) return;
+  if (!Cabe(de, para)) return AvisarDiscoCheio();
+  if (ArquivoExiste(para) && !ConfirmarSubstituir(destino.JaExiste)) return;
+  origem.Lista.SetFocus();  // the button that may have the keyboard is about to disappear
+  RecolherEscolha();
+  SetCaption(Traduzir("Copiando..."));
+  platform::RunPendingEvents();
+  if (!CopiarArquivo(de, para)) AvisarErro();
+  Listar(destino);
+  RecolherEscolha();
+  SetCaption(Traduzir("Salvamentos dos jogos"));
+}
+
+void Form4::RecolherEscolha() {
+  Direcao = Origem::Nenhuma;
+  Image1.Show(false);
+  Image2.Show(false);
+  Command1.Show(false);
+  List1.Select(-1);
+  List2.Select(-1);
+}

@@ -1,0 +1,89 @@
+# What the tests of the Windows build run on, and how results are added up. Sourced, never run; needs processes.sh,
+# display.sh and wine.sh, and the project's root as the current directory.
+
+declare -i passed=0 failed=0
+
+# A display and a Wine prefix of the tests' own, which all programs under scripts/wine-run then use.
+prepare_test_machine() {
+  start_display
+  prepare_prefix build/prefixes/tests
+  hold_wine
+  export TOLVARIS_WINE_READY=1
+}
+
+# Keeps Wine's own processes running between the programs. The first program would otherwise start them with its
+# output, and whoever reads that output would wait for their end.
+hold_wine() {
+  local input
+  input=$(mktemp -u)
+  mkfifo "$input"
+  "$wine" cmd.exe <>"$input" >/dev/null 2>&1 &
+  on_exit stop_process $!
+  rm "$input"
+  run_wine cmd.exe /c exit </dev/null >/dev/null 2>&1
+}
+
+# Adds one result to the count: count_result NAME STATUS
+count_result() {
+  if (($2 == 0)); then
+    passed+=1
+    say "passed: $1"
+  else
+    failed+=1
+    say "FAILED: $1"
+  fi
+}
+
+# Runs a check that is one result, showing its output only when it fails: run_check NAME COMMAND...
+run_check() {
+  local name=$1 log status=0
+  shift
+  log=$(mktemp)
+  "$@" >"$log" 2>&1 || status=$?
+  ((status == 0)) || cat "$log" >&2
+  rm -f "$log"
+  count_result "$name" "$status"
+}
+
+# Builds a preset; a build that fails is a failed result: build PRESET
+build() {
+  local log=build/$1.log
+  say "Building $1"
+  mkdir -p build
+  if ! { cmake --preset "$1" && cmake --build --preset "$1"; } >"$log" 2>&1; then
+    grep -E -A 12 'error|Error|FAILED' "$log" | head -n 60 >&2 || cat "$log" >&2
+    count_result "build of $1" 1
+    return 1
+  fi
+}
+
+# Runs the tests of a preset that match the pattern and adds them up; no test at all is a failure:
+# run_tests PRESET PATTERN [CTEST-OPTION...]
+run_tests() {
+  local preset=$1 pattern=$2 report status=0
+  local -i tests failures
+  shift 2
+  report=$PWD/build/$preset.xml
+  rm -f "$report"
+  say "Testing $preset${pattern:+ ($pattern)}"
+  ctest --preset "$preset" --no-tests=error --output-junit "$report" ${pattern:+-R "$pattern"} "$@" >&2 ||
+    status=$?
+  tests=$(junit_count "$report" tests)
+  failures=$(junit_count "$report" failures)
+  # What was to run but did not has not passed.
+  failures+=$(($(junit_count "$report" skipped) + $(junit_count "$report" disabled)))
+  if ((tests == 0 || (status != 0 && failures == 0))); then
+    say "the tests of $preset could not be run"
+    tests+=1
+    failures+=1
+  fi
+  passed+=$((tests - failures))
+  failed+=failures
+}
+
+# A number of the report's first line that has it: junit_count FILE ATTRIBUTE
+junit_count() {
+  local number=
+  if [[ -e $1 ]]; then number=$(sed -n "s/.*[[:space:]]$2=\"\([0-9]*\)\".*/\1/p" "$1" | head -n 1); fi
+  echo "${number:-0}"
+}

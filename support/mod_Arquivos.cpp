@@ -1,0 +1,106 @@
+#include "support/mod_Arquivos.h"
+
+#include <algorithm>
+#include <limits>
+#include <new>
+
+#include "platform/files.h"
+#include "support/gravacao.h"
+
+namespace {
+
+constexpr std::int64_t MaiorTamanho = std::numeric_limits<std::int32_t>::max();
+
+std::optional<std::string> Brancos(std::int64_t tamanho) {
+  try {
+    return std::string(static_cast<std::size_t>(tamanho), ' ');
+  } catch (const std::bad_alloc&) {
+    return std::nullopt;
+  }
+}
+
+// All bytes from a position, counted from 0, to the end of the file.
+std::optional<std::string> LerAteFim(platform::File& arquivo, std::int64_t posicao) {
+  const std::int64_t tamanho = arquivo.Size();
+  if (tamanho < 0 || tamanho > MaiorTamanho) return std::nullopt;
+  auto texto = Brancos(std::max<std::int64_t>(tamanho - posicao, 0));
+  if (!texto || texto->empty()) return texto;
+  const std::int64_t lidos = arquivo.Read(posicao, texto->data(), texto->size());
+  if (lidos < 0) return std::nullopt;
+  texto->resize(static_cast<std::size_t>(lidos));
+  return texto;
+}
+
+// A file that was deleted before writing at a later position begins with zeros.
+bool Substituir(const std::string& caminho, std::string_view texto, std::int64_t posicao) {
+  if (posicao > 0) {
+    try {
+      return Substituir(caminho, std::string(static_cast<std::size_t>(posicao), '\0').append(texto), 0);
+    } catch (const std::bad_alloc&) {
+      return false;
+    }
+  }
+  const Troca troca = TrocarConteudo(caminho, texto);
+  return troca == Troca::Feita || (troca == Troca::SemLugar && GravarNoLugar(caminho, {texto, 0, true}));
+}
+
+// A copy that takes the name only when it is complete.
+bool CopiarAoLado(const std::string& origem, const std::string& destino) {
+  const std::string temporario = NomeTemporario(destino);
+  if (platform::CopyFileA(origem, temporario) && platform::MoveFileExA(temporario, destino)) return true;
+  platform::DeleteFileA(temporario);
+  return false;
+}
+
+}  // namespace
+
+std::string LerArquivo(const std::string& Caminho, std::int32_t Inicio, std::int32_t Tamanho) {
+  platform::File arquivo(Caminho, platform::Access::Read);
+  const std::int64_t posicao = std::max(Inicio, 1) - 1;
+  if (Tamanho < 1) return LerAteFim(arquivo, posicao).value_or("");
+  std::string texto = Brancos(Tamanho).value_or("");
+  arquivo.Read(posicao, texto.data(), texto.size());
+  return texto;
+}
+
+std::optional<std::string> LerInteiro(platform::File& Arquivo) { return LerAteFim(Arquivo, 0); }
+
+int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32_t Posicao, bool ApagarAntes) {
+  if (Posicao < -1) return -1;
+  const std::int64_t posicao = Posicao == 0 ? 0 : Posicao - 1;  // below 0: the end
+  const bool gravado = ApagarAntes ? Substituir(Caminho, Texto, std::max<std::int64_t>(posicao, 0))
+                                   : GravarNoLugar(Caminho, {Texto, posicao, false});
+  return gravado ? 1 : -1;
+}
+
+// A read-only file is not copied beside the other one: the copy would be read-only too, and could not be taken away
+// again. Where there is no room for a copy beside it, its contents are written like any other text.
+bool CopiarArquivo(const std::string& Origem, const std::string& Destino) {
+  const auto atributos = platform::GetFileAttributesA(Origem);
+  if (!atributos) return false;
+  if ((*atributos & platform::AttributeReadOnly) == 0 && CopiarAoLado(Origem, Destino)) return true;
+  platform::File arquivo(Origem, platform::Access::Read);
+  const auto conteudo = LerInteiro(arquivo);
+  return conteudo && Substituir(Destino, *conteudo, 0);
+}
+
+void ApagarArquivo(const std::string& Caminho) { platform::DeleteFileA(Caminho); }
+
+std::int32_t TamanhoArquivo(const std::string& Caminho) {
+  return static_cast<std::int32_t>(std::min(platform::FileSize(Caminho).value_or(0), MaiorTamanho));
+}
+
+bool ArquivoExiste(const std::string& Caminho) { return platform::FileSize(Caminho).value_or(0) != 0; }
+
+bool DiretorioExiste(const std::string& Caminho) {
+  return platform::GetFileAttributesA(Caminho) == platform::AttributeDirectory;
+}
+
+void CriarDiretorio(const std::string& Caminho) { platform::CreateDirectoryA(Caminho); }
+
+void CriarCaminho(const std::string& Caminho) {
+  for (auto barra = Caminho.find('\\'); barra != std::string::npos; barra = Caminho.find('\\', barra + 1)) {
+    const std::string trecho = Caminho.substr(0, barra + 1);
+    if (!DiretorioExiste(trecho)) CriarDiretorio(trecho);
+  }
+}

@@ -1,0 +1,73 @@
+#include "support/mod_CommonDialog.h"
+
+#include <algorithm>
+#include <string_view>
+
+#include "platform/files.h"
+#include "platform/messages.h"
+#include "platform/text.h"
+
+namespace {
+
+using namespace std::string_view_literals;
+
+constexpr std::size_t TamanhoBuffer = 255;  // of the chosen path, with its closing NUL
+constexpr std::string_view TodosOsArquivos = "Todos os arquivos (*.*)\0*.*\0"sv;
+
+using Dialogo = bool (*)(platform::OpenFileName&);
+
+// The name with blanks behind it, so that the buffer is filled.
+std::string ComBrancos(const std::string& nome) {
+  constexpr std::size_t maximo = TamanhoBuffer - 1;
+  return nome + std::string(nome.size() < maximo ? maximo - nome.size() : 1, ' ');
+}
+
+std::string SemBrancos(std::string_view texto) {
+  const auto inicio = texto.find_first_not_of(' ');
+  if (inicio == std::string_view::npos) return "";
+  return std::string(texto.substr(inicio, texto.find_last_not_of(' ') - inicio + 1));
+}
+
+std::string Perguntar(Dialogo dialogo, platform::OpenFileName pedido, std::string& filtro) {
+  if (filtro.empty()) filtro = TodosOsArquivos;
+  pedido.Filter = filtro;
+  pedido.File = ComBrancos(pedido.File);
+  pedido.FileSize = TamanhoBuffer;
+  if (!dialogo(pedido)) return "";
+  const std::string_view escolhido = pedido.File;
+  return SemBrancos(escolhido.substr(0, escolhido.find('\0')));
+}
+
+// True for a file that the disk lists under this name, in whatever letter case.
+bool Listado(const std::string& caminho) {
+  const auto entrada = platform::ListPath(caminho);
+  const std::string nome = caminho.substr(caminho.rfind('\\') + 1);
+  return entrada && platform::CharUpperBuffA(entrada->Name) == platform::CharUpperBuffA(nome);
+}
+
+}  // namespace
+
+std::string AbrirArquivo(const platform::Window& Dono, const std::string& DiretorioInicial, const std::string& Titulo,
+                         const std::string& NomeInicial, std::string& Filtro, std::uint8_t Flags) {
+  platform::OpenFileName pedido;
+  pedido.Owner = &Dono;
+  pedido.InitialDirectory = DiretorioInicial;
+  pedido.Title = Titulo;
+  pedido.File = NomeInicial;
+  pedido.Flags = Flags;
+  const std::string caminho = Perguntar(platform::GetOpenFileNameA, pedido, Filtro);
+  return Listado(caminho) ? caminho : "";
+}
+
+std::string SalvarArquivo(const platform::Window& Dono, const std::string& DiretorioInicial, const std::string& Titulo,
+                          const std::string& ExtensaoPadrao, const std::string& NomeInicial, std::string& Filtro,
+                          std::uint8_t Flags) {
+  platform::OpenFileName pedido;
+  pedido.Owner = &Dono;
+  pedido.InitialDirectory = DiretorioInicial;
+  pedido.Title = Titulo;
+  pedido.DefaultExtension = ExtensaoPadrao;
+  pedido.File = NomeInicial;
+  pedido.Flags = Flags;
+  return Perguntar(platform::GetSaveFileNameA, pedido, Filtro);
+}

@@ -1,0 +1,42 @@
+#!/usr/bin/env python3
+"""Writes the packages that the fuzzer begins with: make-corpus.py DIRECTORY"""
+import sys
+from pathlib import Path
+
+sys.path.insert(0, str(Path(__file__).parent.parent / "package"))
+from pacote import HEADER_LIMIT, build  # noqa: E402
+
+EXAMPLE = build(b"Super Jogo", b"SUPERJOG", b"-873187034", b"GIF89a", b"123456789")
+LONGEST = HEADER_LIMIT - len(build(b"", b"", b"1", b"I", b"R")) + len(b"IR")
+
+SEEDS = {
+    "example": EXAMPLE,
+    "accents": build("Ação|Pão=1".encode("cp1252"), b"ACAO", b"1", b"BM", b"PK\3\4"),
+    "other-case": EXAMPLE[:104].swapcase() + EXAMPLE[104:],
+    "other-order": b"TOLVARIStROM= 9 \r\nIROM=7\r\nTIMG=06\r\nIIMG=1\r\nCRC=\r\nNOMEDOS=\r\nNOME=\r\n"
+                   + EXAMPLE[93:],
+    "empty-names": build(b"", b"", b"", b"I", b"R"),
+    "no-picture": build(b"Jogo", b"JOGO", b"1", b"", b"R"),
+    "key-in-name": build(b"Jogo CRC=5 tROM=1", b"iROM=1", b"1", b"I", b"R"),
+    "marker-in-name": build(b"Jogo |IMGROMDAT|", b"JOGO", b"1", b"I", b"R"),
+    "device": build(b"nul.x", b"COM1", b"1", b"I", b"R"),
+    "elsewhere": build(b"..\\Jogo", b"C:JOGO", b"1", b"I", b"R"),
+    "cut-short": EXAMPLE[:-5],
+    "no-blocks": EXAMPLE[:104],
+    "no-marker": EXAMPLE[:95],
+    "huge-numbers": EXAMPLE.replace(b"tROM=9", b"tROM=2147483647").replace(b"iROM=7", b"iROM=2147483647"),
+    "too-huge": EXAMPLE.replace(b"tROM=9", b"tROM=18446744073709551617"),
+    "longest-header": build(b"x" * LONGEST, b"", b"1", b"I", b"R"),
+    "header-too-long": build(b"x" * (LONGEST + 1), b"", b"1", b"I", b"R"),
+    "pieces": b"Super Jogo\nSUPERJOG\n-873187034\nGIF89a\n123456789",
+    "pieces-odd": b" \xe7.\nLPT0 .a\n\r\r\n\0\n\n",
+}
+
+
+def main(directory):
+    directory.mkdir(parents=True, exist_ok=True)
+    for name, content in SEEDS.items():
+        (directory / name).write_bytes(content)
+
+
+main(Path(sys.argv[1]))

@@ -1,0 +1,222 @@
+#include "tests/windows/driver/window.h"
+
+#include <algorithm>
+#include <array>
+#include <functional>
+#include <utility>
+
+#include "tests/windows/driver/waiting.h"
+
+namespace driver {
+
+namespace {
+
+constexpr char DialogClass[] = "#32770";
+constexpr UINT AnswerLimit = 5000;  // milliseconds that a window may take to answer
+
+int Pixels(int twips) {
+  const HDC screen = GetDC(nullptr);
+  const int pixels = MulDiv(twips, GetDeviceCaps(screen, LOGPIXELSX), 1440);
+  ReleaseDC(nullptr, screen);
+  return pixels;
+}
+
+// Sent as Unicode: Wine hands texts of another process over unconverted otherwise.
+LRESULT Ask(HWND window, UINT message, WPARAM number = 0, LPARAM data = 0) {
+  DWORD_PTR result = 0;
+  return SendMessageTimeoutW(window, message, number, data, SMTO_NORMAL, AnswerLimit, &result) != 0
+             ? static_cast<LRESULT>(result)
+             : -1;
+}
+
+std::string FromWide(const std::wstring& wide) {
+  std::string text(wide.size(), '\0');
+  WideCharToMultiByte(CP_ACP, 0, wide.data(), static_cast<int>(wide.size()), text.data(), static_cast<int>(text.size()),
+                      nullptr, nullptr);
+  return text;
+}
+
+std::string AskText(HWND window, UINT lengthMessage, UINT textMessage, WPARAM number) {
+  const LRESULT length = Ask(window, lengthMessage, number);
+  if (length <= 0) return {};
+  std::wstring text(static_cast<size_t>(length) + 1, L'\0');
+  const WPARAM argument = textMessage == WM_GETTEXT ? text.size() : number;
+  const LRESULT got = Ask(window, textMessage, argument, reinterpret_cast<LPARAM>(text.data()));
+  text.resize(static_cast<size_t>(std::clamp<LRESULT>(got, 0, length)));
+  return FromWide(text);
+}
+
+using Visitor = std::function<bool(HWND)>;  // false ends the visit
+
+BOOL CALLBACK Visit(HWND window, LPARAM visitor) { return (*reinterpret_cast<Visitor*>(visitor))(window); }
+
+Window FirstTopWindow(const Program& program, const std::function<bool(const Window&)>& wanted) {
+  Window found;
+  Visitor visitor = [&](HWND handle) {
+    DWORD owner = 0;
+    GetWindowThreadProcessId(handle, &owner);
+    const Window window(handle);
+    if (owner == program.Id() && window.Visible() && wanted(window)) found = window;
+    return !found;
+  };
+  EnumWindows(Visit, reinterpret_cast<LPARAM>(&visitor));
+  return found;
+}
+
+void SendMouse(POINT place, int times) {
+  SetCursorPos(place.x, place.y);
+  std::vector<INPUT> inputs;
+  for (int i = 0; i < times; ++i) {
+    for (const DWORD flag : {DWORD{MOUSEEVENTF_LEFTDOWN}, DWORD{MOUSEEVENTF_LEFTUP}}) {
+      INPUT input{};
+      input.type = INPUT_MOUSE;
+      input.mi.dwFlags = flag;
+      inputs.push_back(input);
+    }
+  }
+  SendInput(static_cast<UINT>(inputs.size()), inputs.data(), sizeof(INPUT));
+}
+
+}  // namespace
+
+std::string Window::Text() const { return AskText(handle_, WM_GETTEXTLENGTH, WM_GETTEXT, 0); }
+
+std::string Window::Class() const {
+  std::array<char, 64> name{};
+  GetClassNameA(handle_, name.data(), static_cast<int>(name.size()));
+  return name.data();
+}
+
+bool Window::Focused() const {
+  GUITHREADINFO info{};
+  info.cbSize = sizeof info;
+  GetGUIThreadInfo(GetWindowThreadProcessId(handle_, nullptr), &info);
+  return handle_ != nullptr && info.hwndFocus == handle_;
+}
+
+RECT Window::Place() const {
+  RECT place{};
+  GetWindowRect(handle_, &place);
+  return place;
+}
+
+std::vector<Window> Window::Children() const {
+  std::vector<Window> children;
+  Visitor visitor = [&](HWND handle) {
+    children.emplace_back(handle);
+    return true;
+  };
+  EnumChildWindows(handle_, Visit, reinterpret_cast<LPARAM>(&visitor));
+  return children;
+}
+
+Window Window::ChildAt(int left, int top) const {
+  POINT place{Pixels(left), Pixels(top)};
+  ClientToScreen(handle_, &place);
+  for (const Window& child : Children()) {
+    const RECT area = child.Place();
+    if (area.left == place.x && area.top == place.y) return child;
+  }
+  return {};
+}
+
+Window Window::Child(const std::string& text) const {
+  for (const Window& child : Children()) {
+    if (child.Text() == text) return child;
+  }
+  return {};
+}
+
+COLORREF Window::Colour(int left, int top) const {
+  POINT place{Pixels(left), Pixels(top)};
+  ClientToScreen(handle_, &place);
+  const HDC screen = GetDC(nullptr);
+  const COLORREF colour = GetPixel(screen, place.x, place.y);
+  ReleaseDC(nullptr, screen);
+  return colour;
+}
+
+void Window::FinishPainting() const {
+  RedrawWindow(handle_, nullptr, nullptr, RDW_UPDATENOW | RDW_ALLCHILDREN);
+  Ask(handle_, WM_NULL);
+}
+
+void Window::Click() const {
+  const RECT place = Place();
+  SendMouse({(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
+}
+
+void Window::ClickAt(int left, int top, int times) const {
+  POINT place{Pixels(left), Pixels(top)};
+  ClientToScreen(handle_, &place);
+  SendMouse(place, times);
+}
+
+void Window::CloseByUser() const { PostMessageW(handle_, WM_SYSCOMMAND, SC_CLOSE, 0); }
+
+Window FindVisible(const Program& program, const std::string& title) {
+  return FirstTopWindow(program,
+                        [&](const Window& window) { return window.Class() != DialogClass && window.Text() == title; });
+}
+
+Window FindMessage(const Program& program) {
+  return FirstTopWindow(program, [](const Window& window) { return window.Class() == DialogClass; });
+}
+
+void PressKey(WORD key) {
+  std::array<INPUT, 2> inputs{};
+  for (INPUT& input : inputs) {
+    input.type = INPUT_KEYBOARD;
+    input.ki.wVk = key;
+  }
+  inputs[1].ki.dwFlags = KEYEVENTF_KEYUP;
+  SendInput(UINT{inputs.size()}, inputs.data(), sizeof(INPUT));
+}
+
+std::vector<std::string> Entries(const Window& list) {
+  std::vector<std::string> entries;
+  const LRESULT count = Ask(list.Handle(), LB_GETCOUNT);
+  for (LRESULT i = 0; i < count; ++i) {
+    entries.push_back(AskText(list.Handle(), LB_GETTEXTLEN, LB_GETTEXT, static_cast<WPARAM>(i)));
+  }
+  return entries;
+}
+
+int SelectedEntry(const Window& list) { return static_cast<int>(Ask(list.Handle(), LB_GETCURSEL)); }
+
+void ClickEntry(const Window& list, const std::string& text, int times) {
+  const std::vector<std::string> entries = Entries(list);
+  const auto entry = std::find(entries.begin(), entries.end(), text);
+  if (entry == entries.end()) {
+    ADD_FAILURE() << "the list has no entry " << text;
+    return;
+  }
+  RECT area{};
+  Ask(list.Handle(), LB_GETITEMRECT, static_cast<WPARAM>(entry - entries.begin()), reinterpret_cast<LPARAM>(&area));
+  POINT middle{(area.left + area.right) / 2, (area.top + area.bottom) / 2};
+  ClientToScreen(list.Handle(), &middle);
+  SendMouse(middle, times);
+}
+
+void PrintTo(const Message& message, std::ostream* out) {
+  *out << "message \"" << message.Text << "\" titled \"" << message.Title << "\", buttons";
+  for (const int button : message.Buttons) *out << ' ' << button;
+}
+
+Message Answer(const Program& program, int button) {
+  Window dialog;
+  if (!Eventually([&] { return static_cast<bool>(dialog = FindMessage(program)); })) return {};
+  Message message{dialog.Text(), "", {}};
+  Window pressed;
+  for (const Window& child : dialog.Children()) {
+    const int id = GetDlgCtrlID(child.Handle());
+    if (child.Class() == "Static" && !child.Text().empty()) message.Text = child.Text();
+    if (child.Class() != "Button" || !child.Visible()) continue;
+    message.Buttons.push_back(id);
+    if (id == button) pressed = child;
+  }
+  pressed.Click();
+  return pressed && Eventually([&] { return !dialog.Visible(); }) ? message : Message{};
+}
+
+}  // namespace driver

@@ -1,0 +1,70 @@
+// Windows and controls of another program, seen and used as a person does: by their place, class and text, with the
+// mouse and the keyboard. Places are in twips relative to the window's client area, as the program's layouts have them.
+#pragma once
+
+#include <windows.h>
+
+#include <string>
+#include <vector>
+
+#include "tests/windows/driver/program.h"
+
+namespace driver {
+
+class Window {
+ public:
+  Window() = default;
+  explicit Window(HWND handle) : handle_(handle) {}
+
+  explicit operator bool() const { return IsWindow(handle_) != FALSE; }
+  HWND Handle() const { return handle_; }
+
+  std::string Text() const;
+  std::string Class() const;
+  bool Enabled() const { return IsWindowEnabled(handle_) != FALSE; }
+  bool Visible() const { return IsWindowVisible(handle_) != FALSE; }
+  bool Focused() const;
+  RECT Place() const;  // on the screen, pixels
+
+  std::vector<Window> Children() const;  // of all depths, in the order of their creation
+  Window ChildAt(int left, int top) const;
+  Window Child(const std::string& text) const;
+
+  // The colour on the screen at a place of the client area.
+  COLORREF Colour(int left, int top) const;
+  void FinishPainting() const;  // returns when everything that waits to be drawn is on the screen
+
+  void Click() const;  // in its middle
+  void ClickAt(int left, int top, int times = 1) const;
+  void CloseByUser() const;  // as its close box does
+
+ private:
+  HWND handle_ = nullptr;
+};
+
+// The program's visible window with this title; the dialogs of messages excepted. None is a window that is false.
+Window FindVisible(const Program& program, const std::string& title);
+
+// The visible message of the program, or none.
+Window FindMessage(const Program& program);
+
+void PressKey(WORD key);
+
+// Entries of a list box. Positions start at 0.
+std::vector<std::string> Entries(const Window& list);
+int SelectedEntry(const Window& list);  // -1: none
+void ClickEntry(const Window& list, const std::string& text, int times = 1);
+
+// What a message shows.
+struct Message {
+  std::string Title, Text;
+  std::vector<int> Buttons;  // IDOK, IDYES, ...
+  bool operator==(const Message&) const = default;
+};
+void PrintTo(const Message& message, std::ostream* out);
+
+// Waits for a message of the program, presses one of its buttons, waits until it is gone, and tells what it showed.
+// Without a message, or without that button, everything of the result is empty.
+Message Answer(const Program& program, int button);
+
+}  // namespace driver
