@@ -17,9 +17,13 @@ std::uint64_t Juntar(std::uint64_t hash, char caractere) {
   return (hash + static_cast<unsigned char>(caractere) + 1) * Fator;
 }
 
+constexpr std::uint64_t Fator2 = Fator * Fator, Fator3 = Fator2 * Fator, Fator4 = Fator3 * Fator;
 std::uint64_t HashDe(std::string_view texto) {
   std::uint64_t hash = 0;
-  for (auto it = texto.rbegin(); it != texto.rend(); ++it) hash = Juntar(hash, *it);
+  std::size_t n = texto.size();
+  const auto c = [&](std::size_t i) { return static_cast<std::uint64_t>(static_cast<unsigned char>(texto[i])) + 1; };
+  for (; n >= 4; n -= 4) hash = (hash + c(n - 1)) * Fator4 + (c(n - 2) * Fator3 + c(n - 3) * Fator2 + c(n - 4) * Fator);
+  while (n > 0) hash = Juntar(hash, texto[--n]);
   return hash;
 }
 
@@ -32,7 +36,7 @@ bool EstaEm(std::string_view dados, std::size_t posicao, std::string_view texto,
 // The position behind the first mark of a chain that is followed by the text and by "fim".
 std::optional<std::size_t> Achar(const CadeiasDePosicoes& cadeias, std::uint64_t hash, std::string_view dados,
                                  std::string_view texto, char fim) {
-  for (auto elo = cadeias.Primeiro(hash); elo != CadeiasDePosicoes::Fim; elo = cadeias.Proximo(elo)) {
+  for (auto elo = cadeias.Primeiro(hash); elo != CadeiasDePosicoes::Fim; elo = cadeias.Proximo(elo, hash)) {
     const std::size_t inicio = cadeias.Posicao(elo) + 1;
     if (EstaEm(dados, inicio, texto, fim)) return inicio;
   }
@@ -40,7 +44,9 @@ std::optional<std::size_t> Achar(const CadeiasDePosicoes& cadeias, std::uint64_t
 }
 
 std::size_t Contar(std::string_view dados, char caractere) {
-  return static_cast<std::size_t>(std::count(dados.begin(), dados.end(), caractere));
+  std::size_t quantos = 0;
+  for (auto i = dados.find(caractere); i != std::string_view::npos; i = dados.find(caractere, i + 1)) ++quantos;
+  return quantos;
 }
 
 }  // namespace
@@ -59,11 +65,14 @@ std::size_t CadeiasDePosicoes::Balde(std::uint64_t hash) const {
 
 void CadeiasDePosicoes::PorNaFrente(std::uint64_t hash, std::size_t posicao) {
   std::uint32_t& primeiro = primeiros_[Balde(hash)];
-  elos_.push_back({static_cast<std::uint32_t>(posicao), primeiro});
+  elos_.push_back({static_cast<std::uint32_t>(posicao), primeiro, static_cast<std::uint32_t>(hash)});
   primeiro = static_cast<std::uint32_t>(elos_.size() - 1);
 }
 
-std::uint32_t CadeiasDePosicoes::Primeiro(std::uint64_t hash) const { return primeiros_[Balde(hash)]; }
+std::uint32_t CadeiasDePosicoes::Avancar(std::uint32_t elo, std::uint64_t hash) const {
+  while (elo != Fim && elos_[elo].Hash != static_cast<std::uint32_t>(hash)) elo = elos_[elo].Proximo;
+  return elo;
+}
 
 Indice::Indice(std::string_view Dados) : dados_(Dados) {
   if (Dados.size() >= CadeiasDePosicoes::Fim) return;

@@ -15,17 +15,19 @@ class CadeiasDePosicoes {
   void Reservar(std::size_t capacidade);
   void PorNaFrente(std::uint64_t hash, std::size_t posicao);
 
-  // The first link of the hash's chain, and the one behind a link; Fim: there is none.
-  std::uint32_t Primeiro(std::uint64_t hash) const;
-  std::uint32_t Proximo(std::uint32_t elo) const { return elos_[elo].Proximo; }
+  // The first link of the hash, and the next one of the same hash behind a link; Fim: there is none.
+  std::uint32_t Primeiro(std::uint64_t hash) const { return Avancar(primeiros_[Balde(hash)], hash); }
+  std::uint32_t Proximo(std::uint32_t elo, std::uint64_t hash) const { return Avancar(elos_[elo].Proximo, hash); }
   std::size_t Posicao(std::uint32_t elo) const { return elos_[elo].Posicao; }
   static constexpr std::uint32_t Fim = 0xFFFFFFFF;
 
  private:
   struct Elo {
     std::uint32_t Posicao, Proximo;
+    std::uint32_t Hash;  // its lower bits: links of other hashes are passed without a look at the text far away
   };
   std::size_t Balde(std::uint64_t hash) const;
+  std::uint32_t Avancar(std::uint32_t elo, std::uint64_t hash) const;
 
   std::vector<std::uint32_t> primeiros_;
   std::vector<Elo> elos_;

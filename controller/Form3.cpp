@@ -21,7 +21,7 @@ platform::WindowStyle Janela() {
           .Background = FIGURA_CONTROLE};
 }
 
-Form3* aberta = nullptr;  // the window of the ABRIR that is running
+Form3* aberta = nullptr;  // the window, while it is shown
 
 }  // namespace
 
@@ -34,15 +34,14 @@ Form3::Form3()
   Combo1.OnClick = [this] { Combo1_Click(); };
   Command1.OnClick = [this] { Command1_Click(); };
   Timer1.OnTick = [this] { Timer1_Tick(); };
-  aberta = this;
 }
-
-Form3::~Form3() { aberta = nullptr; }
 
 void Form3::ABRIR() {
   if (aberta) return;
   Form3 janela;
   janela.Preparar();
+  janela.OnUnload = [] { aberta = nullptr; };
+  aberta = &janela;
   janela.ShowModal();
 }
 

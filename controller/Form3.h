@@ -13,9 +13,6 @@ class Form3 : public platform::Window {
   // Closes the window, should it be open.
   static void Descarregar();
 
-  Form3(const Form3&) = delete;
-  Form3& operator=(const Form3&) = delete;
-
   // Writes the key names of the chosen player beside the buttons; nothing when no player is chosen.
   void MostrarTeclas();
 
@@ -30,6 +27,5 @@ class Form3 : public platform::Window {
 
  private:
   Form3();
-  ~Form3();
   void Preparar();
 };

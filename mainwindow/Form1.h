@@ -90,9 +90,7 @@ class Form1 : public platform::Window {
  private:
   // Start-up (Form1_inicio.cpp).
   enum class Configuracao { Pronta, Repetir, Desistir };
-  void EscolherIdioma();
   void RestaurarJanela();
-  void LerCaminhos();
   Configuracao VerificarConfiguracao();
   void TraduzirControles();
   void MostrarControleNaPrimeiraVez();

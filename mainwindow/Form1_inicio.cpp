@@ -5,20 +5,15 @@
 #include "mainwindow/ajustes.h"
 #include "mainwindow/mensagens.h"
 #include "platform/events.h"
-#include "platform/files.h"
 #include "platform/registry.h"
 #include "platform/text.h"
 #include "support/mod_Arquivos.h"
+#include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
 #include "support/mod_exe.h"
 
 namespace {
-
-void DefinirDirPrograma() {
-  DirPrograma = platform::ProgramDirectory();
-  if (!DirPrograma.ends_with('\\')) DirPrograma += '\\';
-}
 
 bool PerguntarPelaConfiguracao() {
   const std::string Pergunta = Traduzir("O Tolvaris não foi configurado."_ansi) + "\r\n" +
@@ -46,7 +41,7 @@ bool Form1::Form_Load() {
     Catalogo().Carregar();
     EscolherIdioma();
     RestaurarJanela();
-    LerCaminhos();
+    LerCaminhos(Registro);
     Estado = VerificarConfiguracao();
     if (Estado == Configuracao::Desistir) {
       Close();
@@ -61,31 +56,10 @@ bool Form1::Form_Load() {
   return true;
 }
 
-void Form1::EscolherIdioma() {
-  ArquivoIdioma = DirPrograma + "language.ini";
-  if (!ArquivoExiste(ArquivoIdioma)) ArquivoIdioma.clear();
-}
-
 void Form1::RestaurarJanela() {
   Check1.SetValue(EstadoDisquete(LerTexto("Disquete")));
   if (const auto Esquerda = EsquerdaInicial(LerTexto("pl"), Width(), platform::ScreenWidth())) SetLeft(*Esquerda);
   if (const auto Topo = TopoInicial(LerTexto("pt"), Height(), platform::ScreenHeight())) SetTop(*Topo);
-}
-
-void Form1::LerCaminhos() {
-  struct Caminho {
-    std::string& Destino;
-    const char* Ajuste;
-    std::string Padrao;
-  };
-  const Caminho Caminhos[] = {
-      {DirRoms, "RomDir", DirPrograma + "Roms\\"}, {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
-      {DirImgs, "ImgDir", DirPrograma + "Imgs\\"}, {ArquivoEmulador, "EmuExe", ""},
-      {ArquivoCfgEmulador, "EmuCFG", ""},
-  };
-  for (const Caminho& Cada : Caminhos) {
-    Cada.Destino = CaminhoConfigurado(LerTexto(Cada.Ajuste), Cada.Padrao, DirPrograma);
-  }
 }
 
 Form1::Configuracao Form1::VerificarConfiguracao() {

@@ -35,8 +35,3 @@ std::optional<int> TopoInicial(std::string_view Texto, int AlturaJanela, int Alt
   if (Topo && *Topo > 0 && *Topo < AlturaTela - Margem) return Topo;
   return std::nullopt;
 }
-
-std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao, const std::string& DirPrograma) {
-  const std::string& Caminho = Texto.empty() ? Padrao : Texto;
-  return Caminho.starts_with('\\') ? DirPrograma + Caminho.substr(1) : Caminho;
-}

@@ -19,7 +19,3 @@ std::optional<int> EsquerdaInicial(std::string_view Texto, int LarguraJanela, in
 
 // The same for the top edge, which lies below the screen's top and more than 255 twips above its bottom.
 std::optional<int> TopoInicial(std::string_view Texto, int AlturaJanela, int AlturaTela);
-
-// A path of the settings: the default when it is empty; a leading backslash stands for the program's directory, which
-// ends with one.
-std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao, const std::string& DirPrograma);

@@ -1,3 +1,5 @@
+#include <initializer_list>
+
 #include "package/pacote.h"
 
 std::string MontarPacote(std::string_view Nome, std::string_view DOSName, std::string_view CRC,
@@ -6,15 +8,15 @@ std::string MontarPacote(std::string_view Nome, std::string_view DOSName, std::s
   const std::string tamanhoImagem = std::to_string(TamanhoImagem);
   const std::string inicioRom = std::to_string(TamanhoImagem + 1);
   const std::string tamanhoRom = std::to_string(TamanhoRom);
-  const std::string_view partes[] = {"TOLVARIS\r\n",                         //
-                                     "NOME=",        Nome,          "\r\n",  //
-                                     "NOMEDOS=",     DOSName,       "\r\n",  //
-                                     "CRC=",         CRC,           "\r\n",  //
-                                     "iIMG=1\r\n",                           //
-                                     "tIMG=",        tamanhoImagem, "\r\n",  //
-                                     "iROM=",        inicioRom,     "\r\n",  //
-                                     "tROM=",        tamanhoRom,    "\r\n",  //
-                                     "|IMGROMDAT|",  Imagem,        Rom};
+  const std::initializer_list<std::string_view> partes = {"TOLVARIS\r\n",                         //
+                                                          "NOME=",        Nome,          "\r\n",  //
+                                                          "NOMEDOS=",     DOSName,       "\r\n",  //
+                                                          "CRC=",         CRC,           "\r\n",  //
+                                                          "iIMG=1\r\n",                           //
+                                                          "tIMG=",        tamanhoImagem, "\r\n",  //
+                                                          "iROM=",        inicioRom,     "\r\n",  //
+                                                          "tROM=",        tamanhoRom,    "\r\n",  //
+                                                          "|IMGROMDAT|",  Imagem,        Rom};
   std::size_t total = 0;
   for (const std::string_view parte : partes) total += parte.size();
   std::string pacote;

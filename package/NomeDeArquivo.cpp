@@ -5,15 +5,15 @@
 
 namespace {
 
-// Names that the platform takes for devices in every directory, whatever extension follows. The superscript digits
-// 1, 2 and 3 of the code page (B9, B2, B3) count as digits there.
-constexpr std::array<std::string_view, 6> Dispositivos = {"CON", "PRN", "AUX", "NUL", "CONIN$", "CONOUT$"};
-constexpr std::array<std::string_view, 2> Portas = {"COM", "LPT"};
+// Names that the platform takes for devices in every directory, whatever extension follows; port 1 stands for all
+// ports.
+constexpr std::array<std::string_view, 8> Dispositivos = {"CON",    "PRN",     "AUX",  "NUL",
+                                                          "CONIN$", "CONOUT$", "COM1", "LPT1"};
+
+// A superscript 1, 2 or 3 of the code page (B9, B2, B3) numbers a port as well.
 constexpr std::string_view NumerosDePorta = "0123456789\xB9\xB2\xB3";
 
 char Maiuscula(char letra) { return letra >= 'a' && letra <= 'z' ? static_cast<char>(letra - 'a' + 'A') : letra; }
-
-bool Contem(const auto& nomes, std::string_view nome) { return std::ranges::find(nomes, nome) != nomes.end(); }
 
 // The part before the first dot decides, without the blanks at its end.
 bool NomeiaDispositivo(std::string_view nome) {
@@ -21,9 +21,8 @@ bool NomeiaDispositivo(std::string_view nome) {
   nome = nome.substr(0, nome.find_last_not_of(' ') + 1);
   std::string base(nome);
   std::ranges::transform(base, base.begin(), Maiuscula);
-  if (Contem(Dispositivos, base)) return true;
-  return base.size() == 4 && Contem(Portas, std::string_view(base).substr(0, 3)) &&
-         NumerosDePorta.find(base[3]) != NumerosDePorta.npos;
+  if (base.size() == 4 && NumerosDePorta.find(base[3]) != std::string_view::npos) base[3] = '1';
+  return std::ranges::find(Dispositivos, base) != Dispositivos.end();
 }
 
 }  // namespace

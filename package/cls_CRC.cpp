@@ -1,6 +1,7 @@
 #include "package/cls_CRC.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 #include <memory>
 
@@ -10,7 +11,7 @@ namespace {
 
 // What is read at a time. The platform reads faster into memory that starts at the beginning of a page.
 struct alignas(4096) Pedaco {
-  char Bytes[1'048'576];
+  std::array<char, 1'048'576> Bytes;
 };
 
 }  // namespace
@@ -25,8 +26,8 @@ std::optional<std::int64_t> cls_CRC::CRC(platform::File& Filenr) {
   for (std::int64_t posicao = 0; posicao < tamanho; posicao += cheio) {
     const std::int64_t parte = std::min(cheio, tamanho - posicao);
     const auto quantos = static_cast<std::size_t>(parte);
-    if (Filenr.Read(posicao, pedaco->Bytes, quantos) != parte) return std::nullopt;
-    Registro = CRC32::Atualizar(Registro, {pedaco->Bytes, quantos});
+    if (Filenr.Read(posicao, pedaco->Bytes.data(), quantos) != parte) return std::nullopt;
+    Registro = CRC32::Atualizar(Registro, {pedaco->Bytes.data(), quantos});
     soma += static_cast<std::int32_t>(~Registro);
   }
   return soma;

@@ -1,4 +1,4 @@
-// The way by carry-less multiplication (PCLMULQDQ), for x86 processors that have it.
+// The way by carry-less multiplication (PCLMULQDQ), for x86-64 processors that have it.
 //
 // The bytes of a file are the coefficients of one long polynomial over the bits, the file's first bit the highest one,
 // and the register only depends on that polynomial modulo P. So a block of 128 bits that stands D bits before another
@@ -10,13 +10,14 @@
 // weighs x^(127-k). Read as a block the result is therefore a * b * x, and the factors below have one x less.
 // A factor is below x^32; in a reversed half it lies in the upper 32 bits. The result of one half is below x^96, so
 // it fits into a block.
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <string_view>
 
 #include "package/crc32.h"
 
-#if defined(__x86_64__) || defined(__i386__)
+#if defined(__x86_64__)
 
 #include <emmintrin.h>
 #include <wmmintrin.h>
@@ -28,10 +29,10 @@ constexpr std::size_t Bloco = sizeof(__m128i);  // bytes
 constexpr std::size_t Volta = 4 * Bloco;        // four blocks are folded side by side, so that none waits for another
 
 // x^n modulo P as a half of a block.
-constexpr long long Potencia(int n) {
+constexpr std::uint64_t Potencia(int n) {
   std::uint32_t resto = 0x80000000;  // x^0
   for (; n > 0; --n) resto = VezesX(resto);
-  return static_cast<long long>(std::uint64_t{resto} << 32);
+  return std::uint64_t{resto} << 32;
 }
 
 inline __m128i Ler(const char* bytes) { return _mm_loadu_si128(reinterpret_cast<const __m128i*>(bytes)); }
@@ -39,7 +40,8 @@ inline __m128i Ler(const char* bytes) { return _mm_loadu_si128(reinterpret_cast<
 // The block `seguinte` with `bloco`, which stands `Distancia` bits before it, folded into it.
 template <int Distancia>
 [[gnu::target("pclmul"), gnu::always_inline]] inline __m128i Dobrar(__m128i bloco, __m128i seguinte) {
-  constexpr long long paraPrimeira = Potencia(Distancia + 64 - 1), paraSegunda = Potencia(Distancia - 1);
+  constexpr auto paraPrimeira = static_cast<long long>(Potencia(Distancia + 64 - 1));
+  constexpr auto paraSegunda = static_cast<long long>(Potencia(Distancia - 1));
   const __m128i fatores = _mm_set_epi64x(paraSegunda, paraPrimeira);
   const __m128i primeira = _mm_clmulepi64_si128(bloco, fatores, 0x00);
   const __m128i segunda = _mm_clmulepi64_si128(bloco, fatores, 0x11);
@@ -70,9 +72,9 @@ bool TemMultiplicacao() { return __builtin_cpu_supports("pclmul") != 0; }
 // The register is folded in with the first four bytes, so the block that remains goes through a register of zero.
 std::uint32_t AtualizarPorDobras(std::uint32_t registro, std::string_view bytes) {
   if (bytes.size() < Volta) return AtualizarPorFatias(registro, bytes);
-  char bloco[Bloco];
-  _mm_storeu_si128(reinterpret_cast<__m128i*>(bloco), DobrarTudo(registro, bytes));
-  return AtualizarPorFatias(AtualizarPorFatias(0, {bloco, Bloco}), bytes);
+  std::array<char, Bloco> bloco{};
+  _mm_storeu_si128(reinterpret_cast<__m128i*>(bloco.data()), DobrarTudo(registro, bytes));
+  return AtualizarPorFatias(AtualizarPorFatias(0, {bloco.data(), Bloco}), bytes);
 }
 
 }  // namespace CRC32

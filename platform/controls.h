@@ -180,10 +180,12 @@ class ComboBox : public Control {
   std::function<void()> OnClick;  // the user chose an entry
 };
 
-// A text on a white ground, as large as the text needs; bounds give only its top left corner.
+// A text on a white ground or on the window's own, as large as the text needs; bounds give only its top left corner.
 class Label : public Control {
  public:
-  Label(const Container& container, int left, int top, const Font& font);
+  enum class Ground { White, Window };
+
+  Label(const Container& container, int left, int top, const Font& font, Ground ground = Ground::White);
 };
 
 // A box with a caption around other controls.

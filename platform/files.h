@@ -87,6 +87,10 @@ struct DirectoryEntry {
 // in ascending order of their names as CompareStringA orders them. Empty when the directory cannot be read.
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns);
 
+// The names of the directories in a directory (its path ends with a backslash), in the order of ListDirectory, without
+// hidden and system ones and without "." and "..". Empty when the directory cannot be read.
+std::vector<std::string> ListSubdirectories(const std::string& directory);
+
 // The listing of exactly this path, no wildcards: nothing when it is missing, a directory, hidden or system.
 std::optional<DirectoryEntry> ListPath(const std::string& path);
 
@@ -103,6 +107,9 @@ struct DiskFreeSpace {
 
 // Of the disk that `root` names ("A:" or "C:\"); nothing when there is no such disk or none is in the drive.
 std::optional<DiskFreeSpace> GetDiskFreeSpaceA(const std::string& root);
+
+// The roots ("C:\") of the disks that are built in, neither removable nor in a network, in ascending order.
+std::vector<std::string> FixedDrives();
 
 // Makes `directory` ("a:\") the current directory of its own drive; the current drive stays as it is. False when the
 // drive is absent or has no disk.

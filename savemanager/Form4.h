@@ -16,9 +16,6 @@ class Form4 : public platform::Window {
   // Opens a fresh window over the program's other ones and returns when it is closed.
   static void Mostrar();
 
-  Form4(const Form4&) = delete;
-  Form4& operator=(const Form4&) = delete;
-
   // Read the pane's directory again. Nothing is picked afterwards, whichever pane the entry was in.
   void ListarDisquete();
   void ListarComputador();

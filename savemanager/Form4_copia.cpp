@@ -55,8 +55,8 @@ void Form4::Copiar(const Painel& origem, const Painel& destino) {
   if (de.empty() || para.empty()) return;
   if (!Cabe(de, para)) return AvisarDiscoCheio();
   if (ArquivoExiste(para) && !ConfirmarSubstituir(destino.JaExiste)) return;
-  origem.Lista.SetFocus();  // the button that may have the keyboard is about to disappear
   RecolherEscolha();
+  origem.Lista.SetFocus();  // the copy button, which may have had the keyboard, is hidden now
   SetCaption(Traduzir("Copiando..."));
   platform::RunPendingEvents();
   if (!CopiarArquivo(de, para)) AvisarErro();

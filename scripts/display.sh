@@ -42,7 +42,7 @@ screenshot() {
   import -silent -window "${2:-root}" "$1"
 }
 
-# How many different colours the display, or one window, shows: colours [WINDOW]
+# How many different colours a picture has: colours FILE
 colours() {
-  import -silent -window "${1:-root}" ppm:- 2>/dev/null | identify -format '%k' ppm:- 2>/dev/null || echo 0
+  identify -format '%k' "$1" 2>/dev/null || echo 0
 }

@@ -35,7 +35,7 @@ install_packages() {
   local -a missing=()
   command -v dpkg-query >/dev/null || fail "this machine has no Debian packages; needed are: $*"
   for package in "$@"; do
-    if package_missing "$package"; then missing+=("$package"); fi
+    if [[ " ${missing[*]} " != *" $package "* ]] && package_missing "$package"; then missing+=("$package"); fi
   done
   ((${#missing[@]})) || return 0
   say "Installing ${missing[*]}"

@@ -35,8 +35,11 @@ std::string Guardar(platform::File& arquivo, const Trecho& trecho) {
 }
 
 // The room is reserved before the first byte is written: a full disk says so while the old contents still stand.
+bool Reservar(platform::File& arquivo, const Trecho& trecho) {
+  return trecho.Depois <= trecho.Antes || arquivo.SetSize(trecho.Depois);
+}
+
 bool Escrever(platform::File& arquivo, std::string_view texto, const Trecho& trecho) {
-  if (trecho.Depois > trecho.Antes && !arquivo.SetSize(trecho.Depois)) return false;
   if (!arquivo.Write(trecho.Posicao, texto)) return false;
   if (trecho.Depois < trecho.Antes && !arquivo.SetSize(trecho.Depois)) return false;
   return arquivo.Flush();
@@ -51,6 +54,7 @@ void PorDeVolta(platform::File& arquivo, std::string_view guardado, const Trecho
 bool EscreverOuDesfazer(platform::File& arquivo, const Gravacao& pedido, std::int64_t tamanho) {
   const Trecho trecho = TrechoDe(pedido, tamanho);
   const std::string guardado = Guardar(arquivo, trecho);
+  if (!Reservar(arquivo, trecho)) return false;
   if (Escrever(arquivo, pedido.Texto, trecho)) return true;
   PorDeVolta(arquivo, guardado, trecho);
   return false;

@@ -5,35 +5,7 @@
 .p816
 .smart
 
-INIDISP = $2100
-BGMODE  = $2105
-BG1SC   = $2107
-BG2SC   = $2108
-BG3SC   = $2109
-BG12NBA = $210B
-BG34NBA = $210C
-BG1HOFS = $210D
-BG1VOFS = $210E
-BG2HOFS = $210F
-BG2VOFS = $2110
-BG3HOFS = $2111
-BG3VOFS = $2112
-VMAIN   = $2115
-VMADD   = $2116
-CGADD   = $2121
-CGDATA  = $2122
-TM      = $212C
-NMITIMEN = $4200
-MDMAEN  = $420B
-HDMAEN  = $420C
-RDNMI   = $4210
-HVBJOY  = $4212
-JOY1    = $4218
-DMAP0   = $4300
-BBAD0   = $4301
-A1T0    = $4302
-A1B0    = $4304
-DAS0    = $4305
+.include "console.inc"
 
 SRAM    = $700000
 SIGNATURE = $5654         ; "TV"
@@ -62,29 +34,6 @@ sky:      .res SKY_STRIPS * 5 + 1    ; line count, colour's number twice, colour
 wave:     .res 3 + WAVES * 3 + 4     ; line count, horizontal offset
 
 .code
-
-; Copies COUNT bytes from SOURCE to video memory at the word address TARGET. Display off; A 8 bits, X 16 bits.
-.macro to_vram source, target, count
-  ldx #target
-  stx VMADD
-  ldx #$1801              ; two registers in turn, VMDATAL and VMDATAH
-  stx DMAP0
-  ldx #.loword(source)
-  stx A1T0
-  stz A1B0
-  ldx #count
-  stx DAS0
-  lda #1
-  sta MDMAEN
-.endmacro
-
-; Sets both bytes of a register that takes the low one first. A 8 bits.
-.macro twice register, value
-  lda value
-  sta register
-  lda value + 1
-  sta register
-.endmacro
 
 reset:
   sei
@@ -116,46 +65,7 @@ main:
   jsr wave_title
   bra main
 
-; Power-on leaves anything in the registers.
-clear_registers:
-  ldx #$2101
-@video:
-  stz a:0,x
-  stz a:0,x               ; some take two bytes
-  inx
-  cpx #$2134
-  bne @video
-  lda #$80
-  sta VMAIN               ; the address grows after the high byte
-  ldx #$4200
-@processor:
-  stz a:0,x
-  inx
-  cpx #$420E
-  bne @processor
-  ldx #0
-@memory:
-  stz a:0,x
-  inx
-  cpx #$1F00
-  bne @memory
-  rts
-
-clear_vram:
-  ldx #0
-  stx VMADD
-  ldx #$1809              ; the same byte again and again
-  stx DMAP0
-  ldx #.loword(zero)
-  stx A1T0
-  stz A1B0
-  ldx #0                  ; 64 KiB
-  stx DAS0
-  lda #1
-  sta MDMAEN
-  rts
-zero:
-  .byte 0
+.include "clear.inc"
 
 load_pictures:
   to_vram text_tiles, TEXT_TILES, text_tiles_end - text_tiles

@@ -86,7 +86,7 @@ void CheckBox::SetValue(int value) {
   if (IsAlive(*state_)) state_->Value = value;
 }
 
-Label::Label(const Container& container, int left, int top, const Font&) {
+Label::Label(const Container& container, int left, int top, const Font&, Ground) {
   Join(*state_, container, {left, top, 0, 0});
 }
 

@@ -129,7 +129,7 @@ void Attach(Place& place, std::shared_ptr<Entry> entry) {
   const std::string key = CharUpperBuffA(place.Name);
   entry->Name = place.Name;
   entry->ShortName.clear();
-  if (!IsShortName(place.Name)) {
+  if (TheMachine().ShortNames && !IsShortName(place.Name)) {
     entry->ShortName = MakeShortName(place.Name, [&](const std::string& name) {
       return folder.ShortNames.contains(name) || folder.Entries.contains(name);
     });

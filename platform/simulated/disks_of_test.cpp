@@ -73,6 +73,8 @@ void SetProgramDirectory(const std::string& directory) {
   TheMachine().ProgramDirectory = Demand(directory).Path;
 }
 
+void KeepNoShortNames() { TheMachine().ShortNames = false; }
+
 void PutDirectory(const std::string& path, std::uint32_t attributes) {
   PutParents(path);
   Place place = Demand(path);

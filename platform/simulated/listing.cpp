@@ -16,8 +16,18 @@ using simulated::Fails;
 using simulated::Locate;
 using simulated::Place;
 
+using Found = std::vector<std::pair<std::string, const Entry*>>;  // with their sort keys
+
+void Sort(Found& found) {
+  std::stable_sort(found.begin(), found.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+}
+
 bool IsListed(const Entry& entry) {
   return (entry.Attributes & (AttributeHidden | AttributeSystem | AttributeDirectory)) == 0;
+}
+
+bool IsSeenDirectory(const Entry& entry) {
+  return entry.IsDirectory() && (entry.Attributes & (AttributeHidden | AttributeSystem)) == 0;
 }
 
 }  // namespace
@@ -27,16 +37,30 @@ std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const st
   const std::optional<Place> place = Locate(directory);
   if (fault || !place || !place->Found || !place->Found->IsDirectory()) return {};
   const std::string wanted = CharUpperBuffA(patterns);
-  std::vector<std::pair<std::string, const Entry*>> found;
+  Found found;
   for (const auto& [upperName, entry] : place->Found->Entries) {
     if (IsListed(*entry) && MatchesAnyPattern(upperName, wanted)) {
       found.emplace_back(simulated::SortKey(entry->Name), entry.get());
     }
   }
-  std::stable_sort(found.begin(), found.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+  Sort(found);
   std::vector<DirectoryEntry> entries;
   for (const auto& [key, entry] : found) entries.push_back({entry->Name, entry->ShortName});
   return entries;
+}
+
+std::vector<std::string> ListSubdirectories(const std::string& directory) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(directory);
+  if (fault || !place || !place->Found) return {};
+  Found found;
+  for (const auto& [upperName, entry] : place->Found->Entries) {
+    if (IsSeenDirectory(*entry)) found.emplace_back(simulated::SortKey(entry->Name), entry.get());
+  }
+  Sort(found);
+  std::vector<std::string> names;
+  for (const auto& [key, entry] : found) names.push_back(entry->Name);
+  return names;
 }
 
 std::optional<DirectoryEntry> ListPath(const std::string& path) {

@@ -58,6 +58,7 @@ struct QueuedEvent {
 struct Machine {
   std::map<char, std::shared_ptr<Disk>> Disks;
   std::string ProgramDirectory = "C:\\";
+  bool ShortNames = true;
   std::map<std::intptr_t, OpenFile> OpenFiles;
   std::map<std::string, std::uint64_t> Writes;  // by full path in upper case
   std::uint64_t WritesEver = 0;
@@ -73,6 +74,8 @@ struct Machine {
   std::vector<ProcessBehaviour> Behaviours;  // the latest counts
   std::map<std::intptr_t, RunningProcess> Processes;
 
+  std::map<std::string, std::string> Environment;  // by name in upper case
+
   std::deque<QueuedAnswer> Answers;
   std::vector<ShownMessage> Messages;
   std::deque<std::string> DialogPaths;
@@ -85,7 +88,6 @@ struct Machine {
   std::vector<std::shared_ptr<WindowFacts>> Windows;  // those that exist, in order of creation
   std::shared_ptr<WindowFacts> MainWindow;
   std::vector<const WindowFacts*> Modal;  // the last one alone takes input; null: a message box or a file dialog
-  ControlState* Focus = nullptr;          // the control that last got it, usable or not
   int DroppedExceptions = 0;
   std::uint64_t Slept = 0;  // milliseconds
   int ScreenWidth = 15360, ScreenHeight = 11520;

@@ -108,6 +108,16 @@ std::optional<DiskFreeSpace> GetDiskFreeSpaceA(const std::string& root) {
                        Clusters(place->Where->Capacity)};
 }
 
+// Drives A: and B: take floppy disks.
+std::vector<std::string> FixedDrives() {
+  if (Fails()) return {};
+  std::vector<std::string> roots;
+  for (const auto& [letter, disk] : TheMachine().Disks) {
+    if (letter > 'B') roots.push_back({letter, ':', '\\'});
+  }
+  return roots;
+}
+
 bool SetDriveDirectory(const std::string& directory) {
   const bool fault = Fails();
   const bool namesDrive = directory.size() >= 2 && directory[1] == ':';

@@ -19,6 +19,7 @@ struct WindowFacts {
   bool Enabled = true, Shown = false, Closing = false, Closed = false;
   std::int32_t Handle = 0;
   std::vector<Control*> Controls;  // in order of creation
+  Control* Focus = nullptr;        // the one that last got the keyboard focus, usable or not
 };
 
 struct ListEntry {

@@ -26,6 +26,7 @@ void AddDisk(char letter, std::uint64_t freeBytes);  // an empty disk; also "a d
 void RemoveDisk(char letter);                        // with all that is on it
 void SetFreeSpace(char letter, std::uint64_t bytes);
 void SetProgramDirectory(const std::string& directory);
+void KeepNoShortNames();  // from now on no file and no directory gets one, as on a disk that is set up so
 
 void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);                       // with its parents
 void PutFile(const std::string& path, std::string_view content, std::uint32_t attributes = 0x20);  // with its parents
@@ -82,6 +83,10 @@ void OnProcess(const std::string& program, int waits, std::function<void()> run)
 void RefuseToStart(const std::string& program);
 std::size_t HeldProcesses();  // how many Process objects still stand for a started program
 
+// --- The environment: empty after Reset.
+
+void SetEnvironment(const std::string& name, const std::string& value);
+
 // --- The user.
 
 struct ShownMessage {
@@ -128,10 +133,10 @@ bool IsShown(const Window& window);
 Window* WindowFromHandle(std::int32_t handle);           // null when there is none
 std::vector<Control*> ControlsOf(const Window& window);  // in order of creation
 Bounds BoundsOf(const Control& control);                 // in the window's client area; a label's size is 0
-const Control* Focused();                                // the control that has the keyboard focus, or null
-int IconOf(const Button& button);                        // its icon's number, 0: none
-int ResourceOf(const Picture& picture);                  // the resource it came from, 0: none
-std::string ContentOf(const Picture& picture);           // the file content it came from
+const Control* Focused();                       // the active window's control that has the keyboard focus, or null
+int IconOf(const Button& button);               // its icon's number, 0: none
+int ResourceOf(const Picture& picture);         // the resource it came from, 0: none
+std::string ContentOf(const Picture& picture);  // the file content it came from
 bool RedrawIsOn(const ListBox& list);
 std::uint32_t IntervalOf(const Timer& timer);     // milliseconds
 int DroppedExceptions();                          // how many have left a handler since Reset

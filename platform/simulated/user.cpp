@@ -10,7 +10,7 @@ namespace {
 // A control that is clicked takes the keyboard focus. False when the user cannot reach it.
 bool Touch(const Control& control) {
   if (!TakesInput(control.State())) return false;
-  TheMachine().Focus = &control.State();
+  control.State().Window->Focus = control.State().Self;
   return true;
 }
 
@@ -19,6 +19,19 @@ void ChooseEntry(List& list, int index) {
   if (index < 0 || index >= std::ssize(list.State().Entries) || !Touch(list)) return;
   list.State().Selected = index;
   RunHandler(list.OnClick);
+}
+
+// The modal window, else the last one that is shown, or is to be. Null when there is none.
+const WindowFacts* ActiveWindow() {
+  const Machine& machine = TheMachine();
+  for (auto modal = machine.Modal.rbegin(); modal != machine.Modal.rend(); ++modal) {
+    if (*modal) return *modal;
+  }
+  const WindowFacts* active = nullptr;
+  for (const auto& window : machine.Windows) {
+    if (!window->Closed && (!active || window->Shown || !active->Shown)) active = window.get();
+  }
+  return active;
 }
 
 // Where the keys that move the selection lead; nothing for other keys.
@@ -85,8 +98,9 @@ Bounds BoundsOf(const Control& control) { return control.State().Place; }
 
 // A control that is switched off keeps its claim, and has the focus again once it is switched on.
 const Control* Focused() {
-  const ControlState* focus = TheMachine().Focus;
-  return focus && focus->Enabled && focus->Visible ? focus->Self : nullptr;
+  const WindowFacts* window = ActiveWindow();
+  const Control* focus = window ? window->Focus : nullptr;
+  return focus && focus->Enabled() && focus->Visible() ? focus : nullptr;
 }
 
 int IconOf(const Button& button) { return button.State().Icon; }

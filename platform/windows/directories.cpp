@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <string_view>
 #include <utility>
 
 #include "platform/files.h"
@@ -53,6 +54,28 @@ struct SortedEntry {
   }
 };
 
+// What a directory holds, as far as it is wanted, in the order of the names.
+template <typename Wanted>
+std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& wanted) {
+  std::vector<SortedEntry> found;
+  WIN32_FIND_DATAA data;
+  const FindHandle find = FindFirst(directory + "*", data);
+  for (bool more = find != nullptr; more; more = ::FindNextFileA(find.get(), &data) != 0) {
+    if (wanted(data)) found.push_back({SortKey(data.cFileName), EntryOf(data)});
+  }
+  std::sort(found.begin(), found.end());
+
+  std::vector<DirectoryEntry> entries;
+  entries.reserve(found.size());
+  for (SortedEntry& each : found) entries.push_back(std::move(each.Entry));
+  return entries;
+}
+
+bool IsSubdirectory(const WIN32_FIND_DATAA& data) {
+  const std::string_view name = data.cFileName;
+  return (data.dwFileAttributes & NotListed) == FILE_ATTRIBUTE_DIRECTORY && name != "." && name != "..";
+}
+
 bool HasWildcard(const std::string& path) {
   const std::size_t name = path.find_last_of("\\/:") + 1;          // 0 when there is none
   return path.find_first_of("*?<>\"", name) != std::string::npos;  // the last three are wildcards inside Windows
@@ -64,21 +87,15 @@ bool HasWildcard(const std::string& path) {
 // find "a.zipx", and which would read the directory anew for each pattern.
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
   const std::string wanted = CharUpperBuffA(patterns);
-  std::vector<SortedEntry> found;
-  WIN32_FIND_DATAA data;
-  const FindHandle find = FindFirst(directory + "*", data);
-  for (bool more = find != nullptr; more; more = ::FindNextFileA(find.get(), &data) != 0) {
-    if (data.dwFileAttributes & NotListed) continue;
-    DirectoryEntry entry = EntryOf(data);
-    if (!MatchesAnyPattern(CharUpperBuffA(entry.Name), wanted)) continue;
-    found.push_back({SortKey(entry.Name), std::move(entry)});
-  }
-  std::sort(found.begin(), found.end());
+  return Collect(directory, [&](const WIN32_FIND_DATAA& data) {
+    return (data.dwFileAttributes & NotListed) == 0 && MatchesAnyPattern(CharUpperBuffA(data.cFileName), wanted);
+  });
+}
 
-  std::vector<DirectoryEntry> entries;
-  entries.reserve(found.size());
-  for (SortedEntry& each : found) entries.push_back(std::move(each.Entry));
-  return entries;
+std::vector<std::string> ListSubdirectories(const std::string& directory) {
+  std::vector<std::string> names;
+  for (DirectoryEntry& each : Collect(directory, IsSubdirectory)) names.push_back(std::move(each.Name));
+  return names;
 }
 
 std::optional<DirectoryEntry> ListPath(const std::string& path) {

@@ -23,6 +23,17 @@ std::optional<DiskFreeSpace> GetDiskFreeSpaceA(const std::string& root) {
   return DiskFreeSpace{sectorsPerCluster, bytesPerSector, freeClusters, totalClusters};
 }
 
+std::vector<std::string> FixedDrives() {
+  std::vector<std::string> roots;
+  const DWORD present = ::GetLogicalDrives();  // a bit for each letter
+  for (char letter = 'A'; letter <= 'Z'; ++letter) {
+    const std::string root = {letter, ':', '\\'};
+    if ((present >> (letter - 'A') & 1) != 0 && ::GetDriveTypeA(WindowsPath(root)) == DRIVE_FIXED)
+      roots.push_back(root);
+  }
+  return roots;
+}
+
 // Windows knows one current directory only; that of each other drive stands in the environment variable "=A:".
 // Going to the drive and back would move the current drive for a moment, and fail where the way back has vanished.
 bool SetDriveDirectory(const std::string& directory) {

@@ -10,6 +10,7 @@ namespace {
 constexpr std::uint32_t White = 0xFFFFFF;
 constexpr int MostCodes = 4096;
 constexpr int WidestCode = 12;  // bits
+constexpr int ImageBlock = 0x2C, ExtensionBlock = 0x21, GraphicControl = 0xF9;
 
 // The file's bytes in order. Reading past the end gives zeros and is remembered.
 class Reader {
@@ -227,18 +228,17 @@ std::optional<Pixels> DecodeGif(std::string_view content) {
   const std::string_view table = ColourTable(reader, flags);
 
   int transparent = -1;
-  while (reader.Whole()) {
-    const int block = reader.Byte();
-    if (block == 0x2C) {
+  for (int block = reader.Byte(); block == ExtensionBlock || block == ImageBlock; block = reader.Byte()) {
+    if (block == ImageBlock) {
       const Image image = ReadImage(reader, table);
       return reader.Whole() ? Paint(image, transparent) : std::nullopt;
     }
-    if (block != 0x21) return std::nullopt;
-    const bool control = reader.Byte() == 0xF9;
+    const bool control = reader.Byte() == GraphicControl;
     const std::string data = reader.Pieces();
-    if (control && data.size() >= 4) transparent = (data[0] & 1) != 0 ? static_cast<unsigned char>(data[3]) : -1;
+    if (!control || data.size() < 4) continue;
+    transparent = (data[0] & 1) != 0 ? static_cast<unsigned char>(data[3]) : -1;
   }
-  return std::nullopt;
+  return std::nullopt;  // no image before the trailer, or before the end of a truncated file
 }
 
 }  // namespace platform

@@ -1,5 +1,5 @@
-// GIF pictures. The system's own decoder would take a tenth of the start-up, and shows what a truncated file still
-// holds.
+// GIF pictures. The system's own decoder would add a tenth to the time of the start-up, and need not refuse a truncated
+// file.
 #pragma once
 
 #include <optional>

@@ -46,7 +46,7 @@ int DpiOfWindow(HWND window) {
 }
 
 DWORD NativeStyle(const WindowStyle& style) {
-  return WS_OVERLAPPED | WS_CAPTION | WS_SYSMENU | (style.MinimizeBox ? WS_MINIMIZEBOX : 0UL);
+  return WS_OVERLAPPED | WS_CAPTION | WS_SYSMENU | WS_CLIPCHILDREN | (style.MinimizeBox ? WS_MINIMIZEBOX : 0UL);
 }
 
 SIZE WindowSize(const WindowStyle& style, int dpi) {

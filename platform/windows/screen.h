@@ -21,7 +21,7 @@ inline int ToTwips(int pixels, int dpi) { return ::MulDiv(pixels, TwipsPerInch, 
 
 DWORD NativeStyle(const WindowStyle& style);
 
-// Size in pixels of the whole window, so that its client area is as large as the style asks.
+// Size in pixels of the whole window when its client area is as large as the style asks.
 SIZE WindowSize(const WindowStyle& style, int dpi);
 
 // The font that the controls use; it lives as long as the program.

@@ -71,6 +71,9 @@ HWND OwnerForModal();
 inline constexpr char WindowClass[] = "TolvarisWindow";
 void RegisterWindowClass();
 
+// Moves the window (pixels of the screen) and makes its client area as large as its style asks.
+void PlaceWindow(WindowState& window, int left, int top);
+
 // Everything that depends on the window's resolution, its own size excepted.
 void LayOutWindow(WindowState& window);
 

@@ -5,14 +5,14 @@
 namespace platform {
 namespace {
 
-void Centre(const WindowState& window) {
+void Centre(WindowState& window) {
   MONITORINFO monitor{};
   monitor.cbSize = sizeof monitor;
   ::GetMonitorInfoA(::MonitorFromWindow(window.Handle, MONITOR_DEFAULTTOPRIMARY), &monitor);
   const SIZE size = WindowSize(window.Style, window.Dpi);
   const RECT& area = monitor.rcWork;
-  ::SetWindowPos(window.Handle, nullptr, area.left + (area.right - area.left - size.cx) / 2,
-                 area.top + (area.bottom - area.top - size.cy) / 2, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
+  PlaceWindow(window, area.left + (area.right - area.left - size.cx) / 2,
+              area.top + (area.bottom - area.top - size.cy) / 2);
 }
 
 // Where the window is in screen pixels; of a minimized window, where it will be again.

@@ -16,9 +16,11 @@ ControlState* FindControl(const WindowState& window, HWND handle) {
   return handle != nullptr && found != window.Controls.end() ? *found : nullptr;
 }
 
+// Also draws what lies behind a control, on the control's own context, which is left as it was.
 void EraseBackground(const WindowState& window, HDC context) {
   RECT area = {};
   ::GetClientRect(window.Handle, &area);
+  const int before = ::SaveDC(context);
   if (window.Background) {
     const Pixels& picture = window.Background.Data()->Image;
     const RECT place = {0, 0, ::MulDiv(picture.Width, window.Dpi, UsualDpi),
@@ -27,6 +29,7 @@ void EraseBackground(const WindowState& window, HDC context) {
     ::ExcludeClipRect(context, 0, 0, place.right, place.bottom);
   }
   ::FillRect(context, &area, ::GetSysColorBrush(COLOR_BTNFACE));
+  ::RestoreDC(context, before);
 }
 
 // The keyboard goes back to the control that had it, and at first to the one that is first in order.
@@ -38,9 +41,7 @@ void PassFocusOn(const WindowState& window) {
 
 void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
   window.Dpi = dpi;
-  const SIZE size = WindowSize(window.Style, dpi);
-  ::SetWindowPos(window.Handle, nullptr, suggested.left, suggested.top, size.cx, size.cy,
-                 SWP_NOZORDER | SWP_NOACTIVATE);
+  PlaceWindow(window, suggested.left, suggested.top);
   LayOutWindow(window);
 }
 
@@ -141,6 +142,17 @@ void RegisterWindowClass() {
     return ::RegisterClassExA(&description);
   }();
   static_cast<void>(registered);
+}
+
+void PlaceWindow(WindowState& window, int left, int top) {
+  const SIZE size = WindowSize(window.Style, window.Dpi);
+  ::SetWindowPos(window.Handle, nullptr, left, top, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
+  // Not every version of Windows draws the frame in the window's own resolution.
+  RECT client = {};
+  ::GetClientRect(window.Handle, &client);
+  const int width = size.cx + ToPixels(window.Style.ClientWidth, window.Dpi) - client.right;
+  const int height = size.cy + ToPixels(window.Style.ClientHeight, window.Dpi) - client.bottom;
+  ::SetWindowPos(window.Handle, nullptr, 0, 0, width, height, SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
 void LayOutWindow(WindowState& window) {

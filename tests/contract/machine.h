@@ -35,6 +35,9 @@ class FreshKey {
   std::string path_;
 };
 
+// Of this program, until its end.
+void SetEnvironment(const std::string& name, const std::string& value);
+
 void SetAttributes(const std::string& path, std::uint32_t attributes);
 
 // Where Wine differs from Windows, the tests ask Windows and the twin only:

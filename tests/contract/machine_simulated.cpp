@@ -21,6 +21,8 @@ FreshKey::~FreshKey() { simulated::Reset(); }
 
 void SetAttributes(const std::string& path, std::uint32_t attributes) { simulated::SetAttributes(path, attributes); }
 
+void SetEnvironment(const std::string& name, const std::string& value) { simulated::SetEnvironment(name, value); }
+
 bool ProtectsReadOnlyFiles() { return true; }
 
 bool StartsWithPriority() { return true; }

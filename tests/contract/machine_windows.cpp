@@ -83,6 +83,10 @@ bool ProtectsReadOnlyFiles() { return !IsWine(); }
 
 bool StartsWithPriority() { return !IsWine(); }
 
+void SetEnvironment(const std::string& name, const std::string& value) {
+  ::SetEnvironmentVariableA(name.c_str(), value.c_str());
+}
+
 StandIn::StandIn() {
   SECURITY_ATTRIBUTES inherited{sizeof inherited, nullptr, TRUE};
   signal_ = reinterpret_cast<std::intptr_t>(::CreateEventA(&inherited, TRUE, FALSE, nullptr));

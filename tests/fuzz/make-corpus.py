@@ -3,6 +3,7 @@
 import sys
 from pathlib import Path
 
+sys.dont_write_bytecode = True
 sys.path.insert(0, str(Path(__file__).parent.parent / "package"))
 from pacote import HEADER_LIMIT, build  # noqa: E402
 

@@ -93,9 +93,11 @@ TEST(Gravacao, WhatCannotBeWrittenStaysAndWhatDeletingAndWritingCouldDoIsDone) {
       PutFile("D:\\novo", novo);
       PutFile(Alvo, velho);
       caso.Preparar();
+      const auto escritas = WriteCount(Alvo);
       const bool gravado = copiar ? CopiarArquivo("D:\\novo", Alvo) : GravarArquivo(Alvo, novo, 1, true) == 1;
       EXPECT_EQ(gravado, caso.Gravado);
       EXPECT_EQ(Content(Alvo) == (gravado ? novo : velho), true);
+      EXPECT_EQ(WriteCount(Alvo) != escritas, gravado);  // not even for a moment, when it cannot be
       EXPECT_EQ(Content(AoLado), std::nullopt);
       EXPECT_EQ(Content("D:\\novo") == novo, true);
     }

@@ -125,14 +125,14 @@ void PrintTo(const Call& call, std::ostream* out) { *out << call.CommandLine << 
 
 Call NextCall(const std::string& program) {
   const std::string record = program + ".call";
-  if (!driver::Eventually([&] { return GetFileAttributesA(record.c_str()) != INVALID_FILE_ATTRIBUTES; })) return {};
   Call call;
-  {
+  // The file can be there for a moment before it can be opened: who renamed it still holds it.
+  const auto read = [&] {
     std::ifstream file(record, std::ios::binary);
-    std::getline(file, call.CommandLine);
-    std::getline(file, call.Directory);
-  }
-  DeleteFileA(record.c_str());
+    return std::getline(file, call.CommandLine) && std::getline(file, call.Directory);
+  };
+  EXPECT_SOON(read()) << " of " << program;
+  EXPECT_SOON(DeleteFileA(record.c_str()));
   return call;
 }
 

@@ -20,8 +20,8 @@ Bitmap Screen() {
   header.biWidth = GetSystemMetrics(SM_CXSCREEN);
   header.biHeight = GetSystemMetrics(SM_CYSCREEN);
   header.biPlanes = 1;
-  header.biBitCount = 32;
-  bitmap.Pixels.resize(static_cast<size_t>(header.biWidth) * static_cast<size_t>(header.biHeight) * 4);
+  header.biBitCount = 24;
+  bitmap.Pixels.resize(static_cast<size_t>((header.biWidth * 3 + 3) / 4 * 4 * header.biHeight));
   const HDC screen = GetDC(nullptr);
   const HDC copy = CreateCompatibleDC(screen);
   const HBITMAP seen = CreateCompatibleBitmap(screen, header.biWidth, header.biHeight);

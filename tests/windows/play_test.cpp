@@ -48,7 +48,7 @@ TEST_F(Play, RemembersTheGameAndTheWindow) {
                                                  {"EmuCFG", "\\Emulador\\zsnesw.cfg"},
                                                  {"AvisoControle", "2"},
                                                  {"AvisoALTF4", "1"},
-                                                 {"LRom", "Água Viva"},
+                                                 {"LRom", "Élan"},
                                                  {"Disquete", "0"},
                                                  {"pl", "1500"},
                                                  {"pt", "2250"}};
@@ -57,9 +57,9 @@ TEST_F(Play, RemembersTheGameAndTheWindow) {
     const MainWindow window(program);
     EXPECT_EQ(window.Window.Place().left, 100);
     EXPECT_EQ(window.Window.Place().top, 150);
-    ClickEntry(window.List, "Água Viva");
+    ClickEntry(window.List, "Élan");
     driver::PressKey(VK_RETURN);
-    EXPECT_EQ(NextCall(installation.Emulator), CallFor("agua.smc"));
+    EXPECT_EQ(NextCall(installation.Emulator), CallFor("elan.ZIP"));
     EXPECT_EQ(installation.Settings(), expected);
 
     SetWindowPos(window.Window.Handle(), nullptr, 30, 40, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);

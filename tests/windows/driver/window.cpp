@@ -63,14 +63,28 @@ Window FirstTopWindow(const Program& program, const std::function<bool(const Win
   return found;
 }
 
-void SendMouse(POINT place, int times) {
+// A window that has just come takes what a person does only once it is in front.
+void WaitUntilInFront(HWND window) {
+  const HWND top = GetAncestor(window, GA_ROOT);
+  EXPECT_SOON(GetForegroundWindow() == top) << "\nthe window does not come to the front";
+}
+
+// A coordinate as SendInput wants it: the screen's size is 65536.
+LONG Normalised(LONG pixel, int size) { return MulDiv(pixel, 65536, size) + 32768 / size; }
+
+// Each press and release carries its own place: a window that has just come under the pointer can set it back to where
+// the display had it.
+void SendMouse(HWND window, POINT place, int times) {
+  WaitUntilInFront(window);
   SetCursorPos(place.x, place.y);
   std::vector<INPUT> inputs;
   for (int i = 0; i < times; ++i) {
-    for (const DWORD flag : {DWORD{MOUSEEVENTF_LEFTDOWN}, DWORD{MOUSEEVENTF_LEFTUP}}) {
+    for (const DWORD button : {DWORD{MOUSEEVENTF_LEFTDOWN}, DWORD{MOUSEEVENTF_LEFTUP}}) {
       INPUT input{};
       input.type = INPUT_MOUSE;
-      input.mi.dwFlags = flag;
+      input.mi.dwFlags = button | MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE;
+      input.mi.dx = Normalised(place.x, GetSystemMetrics(SM_CXSCREEN));
+      input.mi.dy = Normalised(place.y, GetSystemMetrics(SM_CYSCREEN));
       inputs.push_back(input);
     }
   }
@@ -143,13 +157,13 @@ void Window::FinishPainting() const {
 
 void Window::Click() const {
   const RECT place = Place();
-  SendMouse({(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
+  SendMouse(handle_, {(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
 }
 
 void Window::ClickAt(int left, int top, int times) const {
   POINT place{Pixels(left), Pixels(top)};
   ClientToScreen(handle_, &place);
-  SendMouse(place, times);
+  SendMouse(handle_, place, times);
 }
 
 void Window::CloseByUser() const { PostMessageW(handle_, WM_SYSCOMMAND, SC_CLOSE, 0); }
@@ -195,7 +209,7 @@ void ClickEntry(const Window& list, const std::string& text, int times) {
   Ask(list.Handle(), LB_GETITEMRECT, static_cast<WPARAM>(entry - entries.begin()), reinterpret_cast<LPARAM>(&area));
   POINT middle{(area.left + area.right) / 2, (area.top + area.bottom) / 2};
   ClientToScreen(list.Handle(), &middle);
-  SendMouse(middle, times);
+  SendMouse(list.Handle(), middle, times);
 }
 
 void PrintTo(const Message& message, std::ostream* out) {

@@ -1,0 +1,38 @@
+#include "support/mod_Configuracao.h"
+
+#include "platform/files.h"
+#include "platform/registry.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+
+void DefinirDirPrograma() {
+  DirPrograma = platform::ProgramDirectory();
+  if (!DirPrograma.ends_with('\\')) DirPrograma += '\\';
+}
+
+void EscolherIdioma() {
+  ArquivoIdioma = DirPrograma + "language.ini";
+  if (!ArquivoExiste(ArquivoIdioma)) ArquivoIdioma.clear();
+}
+
+void LerCaminhos(const cls_REG& Registro) {
+  struct Caminho {
+    std::string& Destino;
+    const char* Ajuste;
+    std::string Padrao;
+  };
+  const Caminho Caminhos[] = {
+      {DirRoms, "RomDir", DirPrograma + "Roms\\"}, {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
+      {DirImgs, "ImgDir", DirPrograma + "Imgs\\"}, {ArquivoEmulador, "EmuExe", ""},
+      {ArquivoCfgEmulador, "EmuCFG", ""},
+  };
+  for (const Caminho& Cada : Caminhos) {
+    const Valor Texto = Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Ajuste);
+    Cada.Destino = CaminhoConfigurado(TextoDe(Texto), Cada.Padrao);
+  }
+}
+
+std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao) {
+  const std::string& Caminho = Texto.empty() ? Padrao : Texto;
+  return Caminho.starts_with('\\') ? DirPrograma + Caminho.substr(1) : Caminho;
+}
