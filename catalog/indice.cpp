@@ -17,13 +17,9 @@ std::uint64_t Juntar(std::uint64_t hash, char caractere) {
   return (hash + static_cast<unsigned char>(caractere) + 1) * Fator;
 }
 
-constexpr std::uint64_t Fator2 = Fator * Fator, Fator3 = Fator2 * Fator, Fator4 = Fator3 * Fator;
 std::uint64_t HashDe(std::string_view texto) {
   std::uint64_t hash = 0;
-  std::size_t n = texto.size();
-  const auto c = [&](std::size_t i) { return static_cast<std::uint64_t>(static_cast<unsigned char>(texto[i])) + 1; };
-  for (; n >= 4; n -= 4) hash = (hash + c(n - 1)) * Fator4 + (c(n - 2) * Fator3 + c(n - 3) * Fator2 + c(n - 4) * Fator);
-  while (n > 0) hash = Juntar(hash, texto[--n]);
+  for (auto it = texto.rbegin(); it != texto.rend(); ++it) hash = Juntar(hash, *it);
   return hash;
 }
 

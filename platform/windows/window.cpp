@@ -1,5 +1,4 @@
 #include "platform/controls.h"
-#include "platform/windows/drawing.h"
 #include "platform/windows/state.h"
 
 namespace platform {

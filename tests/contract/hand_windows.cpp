@@ -138,7 +138,7 @@ void DoubleClick(platform::ListBox& list, int index) {
 void PressKey(platform::ListBox& list, int keyCode) { Press(list.State().Handle, keyCode); }
 
 void UseCloseBox(platform::Window& window) {
-  ::PostMessageA(window.State().Handle, WM_SYSCOMMAND, SC_CLOSE, 0);
+  ::PostMessageA(window.State().Handle, WM_CLOSE, 0, 0);  // what the close box sends in the end
   platform::RunPendingEvents();
 }
 

@@ -8,6 +8,7 @@
 
 #include "platform/pictures.h"
 #include "platform/windows/drawing.h"
+#include "platform/windows/whole_file.h"
 #include "tests/contract/small_pictures.h"
 
 namespace contract {
@@ -27,6 +28,22 @@ TEST(PicturePixels, SmallPicturesAreDecodedOverWhite) {
   EXPECT_EQ(ColoursOf(SmallGif()), (Colours{White, Blue, Blue, White}));
   EXPECT_EQ(ColoursOf(SmallBmp()), Colours(3, 0x404040));
   EXPECT_EQ(ColoursOf(SmallJpeg()), Colours(64, 0x808080));
+}
+
+// Windows' decoders show the beginning of such files; Wine's refuse them, so that only this tells.
+TEST(PicturePixels, TruncationIsSeenBeforeDecoding) {
+  const std::string bmp = SmallBmp(), jpeg = SmallJpeg();
+  std::string runs = bmp;  // run-length coded: the header says how many bytes
+  runs[30] = 1;
+  runs[34] = 5;
+  EXPECT_TRUE(platform::BmpIsWhole(bmp));
+  EXPECT_TRUE(platform::JpegIsWhole(jpeg));
+  EXPECT_FALSE(platform::BmpIsWhole(runs));
+  EXPECT_TRUE(platform::BmpIsWhole(runs + "+"));
+  for (std::size_t length = 2; length < bmp.size(); ++length) EXPECT_FALSE(platform::BmpIsWhole(bmp.substr(0, length)));
+  for (std::size_t length = 2; length < jpeg.size(); ++length) {
+    EXPECT_FALSE(platform::JpegIsWhole(jpeg.substr(0, length))) << length;
+  }
 }
 
 TEST(PicturePixels, DamagedGifIsRefused) {

@@ -80,10 +80,7 @@ void Installation::Put(const std::string& name, const std::string& content) cons
   EXPECT_TRUE(file.flush()) << "cannot write " << name;
 }
 
-std::string Installation::Content(const std::string& name) const {
-  std::ifstream file(Directory + name, std::ios::binary);
-  return {std::istreambuf_iterator<char>(file), {}};
-}
+std::string Installation::Content(const std::string& name) const { return ContentOf(Directory + name); }
 
 void Installation::Remove(const std::string& name) const { DeleteFileA((Directory + name).c_str()); }
 
@@ -136,6 +133,11 @@ Call NextCall(const std::string& program) {
   return call;
 }
 
+std::string ContentOf(const std::string& path) {
+  std::ifstream file(path, std::ios::binary);
+  return {std::istreambuf_iterator<char>(file), {}};
+}
+
 std::string ShortPath(const std::string& path) {
   std::array<char, MAX_PATH> shortPath{};
   GetShortPathNameA(path.c_str(), shortPath.data(), MAX_PATH);
@@ -155,3 +157,8 @@ FloppyDisk::~FloppyDisk() {
 }
 
 bool FloppyDisk::IsReady() { return IsDirectory("a:\\"); }
+
+bool FloppyDisk::IsSmall() {
+  ULARGE_INTEGER size{};
+  return GetDiskFreeSpaceExA("A:\\", nullptr, &size, nullptr) && size.QuadPart <= 1440 * 1024;
+}

@@ -48,6 +48,9 @@ void PrintTo(const Call& call, std::ostream* out);
 // Empty when there is none in time.
 Call NextCall(const std::string& program);
 
+// All bytes of a file; the empty text when it is missing.
+std::string ContentOf(const std::string& path);
+
 // The path with each part in its short form, as the system makes it.
 std::string ShortPath(const std::string& path);
 
@@ -60,4 +63,8 @@ class FloppyDisk {
   FloppyDisk& operator=(const FloppyDisk&) = delete;
 
   static bool IsReady();
+
+  // Where a file system as large as a real disk is mounted, on machines that let us.
+  static constexpr char SmallDirectory[] = "C:\\Disquete1440";
+  static bool IsSmall();  // whether such a disk is in the drive
 };
