@@ -3,6 +3,7 @@
 #include "mainwindow/Form1.h"
 #include "mainwindow/arquivos_de_jogos.h"
 #include "mainwindow/mensagens.h"
+#include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/events.h"
 #include "platform/text.h"
@@ -39,6 +40,8 @@ Importacao ImportarRom(const std::string& Caminho, const std::string& Base) {
 // The ROM as it was written must have the package's checksum. A damaged package is told before it can replace
 // anything; a ROM that the disk holds differently is removed again, with its picture.
 Desfecho GravarJogo(const Pacote& Novo) {
+  cls_CRC Medida;
+  if (const auto Soma = Medida.CRC(Novo.Rom); Soma && TextoCRC(*Soma) != Novo.CRC) return Desfecho::Corrompido;
   const std::string ArquivoImagem = DirImgs + Novo.Nome + ".gif";
   if (!GravarInteiro(ArquivoImagem, Novo.Imagem)) return Desfecho::ErroDeLeitura;
   RunPendingEvents();

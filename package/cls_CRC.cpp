@@ -9,28 +9,44 @@
 
 namespace {
 
+constexpr std::int64_t Cheio = 1'048'576;  // bytes of a chunk
+
 // What is read at a time. The platform reads faster into memory that starts at the beginning of a page.
 struct alignas(4096) Pedaco {
-  std::array<char, 1'048'576> Bytes;
+  std::array<char, Cheio> Bytes;
 };
 
 }  // namespace
 
 std::optional<std::int64_t> cls_CRC::CRC(platform::File& Filenr) {
-  constexpr std::int64_t cheio = sizeof(Pedaco);
   const std::int64_t tamanho = Filenr.Size();
-  if (tamanho < 0 || tamanho % cheio == 0) return std::nullopt;
+  if (tamanho < 0 || tamanho % Cheio == 0) return std::nullopt;
   const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
   std::int64_t soma = 0;
   Registro = CRC32::Inicial;
-  for (std::int64_t posicao = 0; posicao < tamanho; posicao += cheio) {
-    const std::int64_t parte = std::min(cheio, tamanho - posicao);
+  for (std::int64_t posicao = 0; posicao < tamanho; posicao += Cheio) {
+    const std::int64_t parte = std::min(Cheio, tamanho - posicao);
     const auto quantos = static_cast<std::size_t>(parte);
     if (Filenr.Read(posicao, pedaco->Bytes.data(), quantos) != parte) return std::nullopt;
-    Registro = CRC32::Atualizar(Registro, {pedaco->Bytes.data(), quantos});
-    soma += static_cast<std::int32_t>(~Registro);
+    soma += Acrescentar({pedaco->Bytes.data(), quantos});
   }
   return soma;
+}
+
+std::optional<std::int64_t> cls_CRC::CRC(std::string_view Conteudo) {
+  if (Conteudo.size() % Cheio == 0) return std::nullopt;
+  std::int64_t soma = 0;
+  Registro = CRC32::Inicial;
+  for (std::size_t posicao = 0; posicao < Conteudo.size(); posicao += Cheio) {
+    soma += Acrescentar(Conteudo.substr(posicao, Cheio));
+  }
+  return soma;
+}
+
+// The register's value after the next chunk.
+std::int32_t cls_CRC::Acrescentar(std::string_view Bytes) {
+  Registro = CRC32::Atualizar(Registro, Bytes);
+  return static_cast<std::int32_t>(~Registro);
 }
 
 std::string TextoCRC(std::int64_t Valor) { return std::to_string(Valor); }

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 
 #include "platform/files.h"
 
@@ -14,7 +15,12 @@ class cls_CRC {
   // read. Nothing either when its length is a multiple of the chunk's: such a ROM cannot be packed.
   std::optional<std::int64_t> CRC(platform::File& Filenr);
 
+  // The same of a file's content.
+  std::optional<std::int64_t> CRC(std::string_view Conteudo);
+
  private:
+  std::int32_t Acrescentar(std::string_view Bytes);
+
   std::uint32_t Registro = 0;  // carried from chunk to chunk
 };
 

@@ -19,6 +19,7 @@ std::optional<std::string> TextoDe(cls_CRC& soma, const std::string& conteudo) {
   platform::File arquivo(Caminho, platform::Access::Read);
   const std::optional<std::int64_t> valor = soma.CRC(arquivo);
   EXPECT_TRUE(arquivo.IsOpen());
+  EXPECT_EQ(cls_CRC().CRC(conteudo), valor);  // the content's own checksum is its file's
   return valor ? std::optional(TextoCRC(*valor)) : std::nullopt;
 }
 
