@@ -72,7 +72,7 @@ bool TemBranco(const std::string& Caminho) { return Caminho.find(' ') != std::st
 std::string ConfiguracaoDoEmulador(const std::string& Emulador) {
   const std::size_t Nome = Emulador.rfind('\\') + 1;
   const std::string Diretorio = Emulador.substr(0, Nome);
-  const std::string ParaWindows = Diretorio + "zsnesw.cfg", ParaDos = Diretorio + "zsnes.cfg";
+  std::string ParaWindows = Diretorio + "zsnesw.cfg", ParaDos = Diretorio + "zsnes.cfg";
   const std::string Executavel = platform::CharUpperBuffA(Emulador.substr(Nome));
   if (Executavel.starts_with("ZSNESW")) return ParaWindows;
   if (Executavel.starts_with("ZSNES")) return ParaDos;

@@ -1,6 +1,7 @@
 #include "autoconfig/procura.h"
 
 #include <algorithm>
+#include <array>
 #include <iterator>
 #include <utility>
 
@@ -13,10 +14,10 @@
 
 namespace {
 
-constexpr const char* Executaveis[] = {"zsnesw.exe", "zsnes.exe"};
+constexpr std::array Executaveis = {"zsnesw.exe", "zsnes.exe"};
 constexpr int NiveisDoPrograma = 3, NiveisDeProgramas = 2, NiveisDaRaiz = 3;
-constexpr char NomesNaRaiz[] = "ZSNES*;EMU*";
-constexpr const char* VariaveisDeProgramas[] = {"ProgramFiles", "ProgramFiles(x86)", "ProgramW6432"};
+constexpr const char* NomesDeEmuladores = "ZSNES*;EMU*";
+constexpr std::array VariaveisDeProgramas = {"ProgramFiles", "ProgramFiles(x86)", "ProgramW6432"};
 constexpr int MaisDiretorios = 3000;  // at each place
 
 std::string ComBarra(std::string Diretorio) {
@@ -36,6 +37,10 @@ std::vector<std::string> Partes(const std::string& Texto) {
     Inicio = Fim + 1;
   }
   return Achadas;
+}
+
+bool TemUm(const std::string& Nome, const std::string& Padroes) {
+  return platform::MatchesAnyPattern(platform::CharUpperBuffA(Nome), Padroes);
 }
 
 bool ComecaComUm(const std::string& Caminho, const std::vector<std::string>& Raizes) {
@@ -62,7 +67,7 @@ std::vector<Lugar> LugaresUsuais() {
   const std::vector<std::string> Pastas = PastasDeProgramas();
   for (const std::string& Raiz : Raizes) {
     for (const std::string& Pasta : Pastas) Lugares.push_back({Raiz + Pasta, NiveisDeProgramas});
-    Lugares.push_back({Raiz, NiveisDaRaiz, NomesNaRaiz});
+    Lugares.push_back({Raiz, NiveisDaRaiz, NomesDeEmuladores});
   }
   for (const std::string& Parte : Partes(platform::GetEnvironmentVariableA("PATH"))) {
     if (ComecaComUm(Parte, Raizes)) Lugares.push_back({ComBarra(Parte), 0});
@@ -94,10 +99,14 @@ std::vector<std::string> Procura::Passo() {
   return Achados;
 }
 
+// The likeliest names first: where there are very many directories the last ones are not looked into.
 void Procura::Descer(const Lugar& Atual) {
   if (Atual.Niveis == 0) return;
-  for (const std::string& Nome : platform::ListSubdirectories(Atual.Diretorio)) {
-    if (!platform::MatchesAnyPattern(platform::CharUpperBuffA(Nome), Atual.Nomes)) continue;
+  std::vector<std::string> Nomes = platform::ListSubdirectories(Atual.Diretorio);
+  std::stable_partition(Nomes.begin(), Nomes.end(),
+                        [](const std::string& Nome) { return TemUm(Nome, NomesDeEmuladores); });
+  for (const std::string& Nome : Nomes) {
+    if (!TemUm(Nome, Atual.Nomes)) continue;
     if (Resto-- <= 0) return;
     Fila.push_back({Atual.Diretorio + Nome + '\\', Atual.Niveis - 1});
   }

@@ -1,8 +1,8 @@
 #!/usr/bin/env python3
-"""Joins the table of figures with what was measured: report.py TABLE RESULTS...
+"""Joins the table of figures with what was measured: report.py PART TABLE RESULTS...
 
 Results are Google Benchmark's JSON, of which the medians count, or lines of a name, a tab and a number. Prints one line
-a figure; fails when a figure's limit is missed or one was not measured.
+a figure; fails when a figure's limit is missed, or one was not measured though PART is "all".
 """
 import json
 import statistics
@@ -57,8 +57,9 @@ def told(figure, results):
 
 
 def main():
-    results = read_results(sys.argv[2:])
-    lines = [told(figure, results) for figure in read_figures(sys.argv[1])]
+    results = read_results(sys.argv[3:])
+    figures = [each for each in read_figures(sys.argv[2]) if sys.argv[1] == "all" or each[1] in results]
+    lines = [told(figure, results) for figure in figures]
     for line, _ in lines:
         print(line)
     return 0 if lines and all(good for _, good in lines) else 1

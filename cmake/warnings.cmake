@@ -11,7 +11,9 @@ if(TOLVARIS_SANITIZE)
 endif()
 if(WIN32)
   target_compile_options(tolvaris_options INTERFACE $<$<COMPILE_LANGUAGE:CXX>:-ffunction-sections -fdata-sections>)
-  target_link_options(tolvaris_options INTERFACE -static -Wl,--gc-sections $<$<NOT:$<CONFIG:Debug>>:-s>)
+  # The same sources give the same programs: no time of the build goes into them.
+  target_link_options(tolvaris_options INTERFACE -static -Wl,--gc-sections,--no-insert-timestamp
+    $<$<NOT:$<CONFIG:Debug>>:-s>)
 endif()
 
 # A static library of all sources of one folder: tolvaris_folder(NAME FOLDER LIBRARIES...).

@@ -23,6 +23,7 @@ MAY_INCLUDE = {
     "controller": WINDOW,
     "savemanager": WINDOW,
     "mainwindow": WINDOW | {"controller", "savemanager"},
+    "autoconfig": SUPPORT,
     "app": WINDOW | {"controller", "savemanager", "mainwindow"},
 }
 SYSTEM_HEADERS = re.compile(r"(platform|tests|benchmarks)/windows/|tests/contract/\w+_windows\.cpp$")

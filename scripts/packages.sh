@@ -7,6 +7,8 @@ native_packages=(g++ cmake ninja-build libgtest-dev)
 # shellcheck disable=SC2034
 windows_packages=(g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 cmake ninja-build googletest)
 # shellcheck disable=SC2034
+release_packages=(libc-bin nsis zip)
+# shellcheck disable=SC2034
 wine_packages=(wine64 fonts-wine fonts-liberation
   libxcomposite1 libxcursor1 libxfixes3 libxi6 libxinerama1 libxrandr2 libxrender1 libxxf86vm1)
 # shellcheck disable=SC2034

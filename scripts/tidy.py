@@ -9,11 +9,12 @@ import hashlib
 import json
 import os
 import pathlib
+import shlex
 import subprocess
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
-FOLDERS = ("app", "catalog", "controller", "mainwindow", "package", "platform", "savemanager", "support")
+FOLDERS = ("app", "autoconfig", "catalog", "controller", "mainwindow", "package", "platform", "savemanager", "support")
 
 
 def own(path):
@@ -25,7 +26,8 @@ def sources(build):
     for command in json.loads((build / "compile_commands.json").read_text()):
         path = pathlib.Path(command["file"])
         if own(path):
-            yield path, command["output"]
+            words = shlex.split(command["command"])
+            yield path, words[words.index("-o") + 1]
 
 
 def included(build):

@@ -1,5 +1,7 @@
 #include "support/mod_Configuracao.h"
 
+#include <array>
+
 #include "platform/files.h"
 #include "platform/registry.h"
 #include "support/mod_Arquivos.h"
@@ -21,11 +23,11 @@ void LerCaminhos(const cls_REG& Registro) {
     const char* Ajuste;
     std::string Padrao;
   };
-  const Caminho Caminhos[] = {
-      {DirRoms, "RomDir", DirPrograma + "Roms\\"}, {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
-      {DirImgs, "ImgDir", DirPrograma + "Imgs\\"}, {ArquivoEmulador, "EmuExe", ""},
-      {ArquivoCfgEmulador, "EmuCFG", ""},
-  };
+  const std::array<Caminho, 5> Caminhos = {{{DirRoms, "RomDir", DirPrograma + "Roms\\"},
+                                            {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
+                                            {DirImgs, "ImgDir", DirPrograma + "Imgs\\"},
+                                            {ArquivoEmulador, "EmuExe", ""},
+                                            {ArquivoCfgEmulador, "EmuCFG", ""}}};
   for (const Caminho& Cada : Caminhos) {
     const Valor Texto = Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Ajuste);
     Cada.Destino = CaminhoConfigurado(TextoDe(Texto), Cada.Padrao);

@@ -1,7 +1,4 @@
-// clang-format off
 #include <windows.h>
-#include <commctrl.h>
-// clang-format on
 
 #include "platform/windows/state.h"
 
@@ -16,13 +13,13 @@ bool IsEnter(LPARAM lParam) {
   return event != nullptr && event->wParam == VK_RETURN;
 }
 
-LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR id,
-                                  DWORD_PTR data) {
-  auto& control = *reinterpret_cast<ControlState*>(data);
+LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
+  auto& control = *reinterpret_cast<ControlState*>(::GetWindowLongPtrA(handle, GWLP_USERDATA));
+  const WNDPROC native = control.Native;
   switch (message) {
     case WM_GETDLGCODE:
       if (!control.EnterIsKey || !IsEnter(lParam)) break;
-      return ::DefSubclassProc(handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
+      return ::CallWindowProcA(native, handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
     case WM_KEYDOWN:
       if (control.OnKey && control.OnKey(static_cast<int>(wParam), (HIWORD(lParam) & KF_REPEAT) != 0)) return 0;
       if (control.Handle == nullptr) return 0;  // the key has closed the window
@@ -38,12 +35,21 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
       break;
     case WM_NCDESTROY:
       control.Handle = nullptr;
-      ::RemoveWindowSubclass(handle, ControlProcedure, id);
+      ::SetWindowLongPtrA(handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(native));
       break;
     default:
       break;
   }
-  return ::DefSubclassProc(handle, message, wParam, lParam);
+  return ::CallWindowProcA(native, handle, message, wParam, lParam);
+}
+
+// Not with SetWindowSubclass, which looks up a property of the window at each message: under Wine that takes twenty
+// times as long as to add an entry to a list.
+void TakeMessages(ControlState& control) {
+  if (control.Handle == nullptr) return;
+  ::SetWindowLongPtrA(control.Handle, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(&control));
+  control.Native = reinterpret_cast<WNDPROC>(
+      ::SetWindowLongPtrA(control.Handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(ControlProcedure)));
 }
 
 // Arrow keys move between neighbours of the same kind, Tab between all.
@@ -80,7 +86,7 @@ void CreateControl(ControlState& control, const Container& container, const Boun
   control.Handle =
       ::CreateWindowExA(native.ExtendedStyle, native.Class, text.c_str(), WS_CHILD | WS_VISIBLE | group | native.Style,
                         0, 0, 0, 0, window.Handle, reinterpret_cast<HMENU>(id), ::GetModuleHandleA(nullptr), nullptr);
-  ::SetWindowSubclass(control.Handle, ControlProcedure, 0, reinterpret_cast<DWORD_PTR>(&control));
+  TakeMessages(control);
   LayOutControl(control);
 }
 

@@ -32,6 +32,7 @@ struct WindowState {
 struct ControlState {
   WindowState* Owner = nullptr;  // null once the window object is gone
   HWND Handle = nullptr;         // null once the window is closed
+  WNDPROC Native = nullptr;      // what the control's class does with a message
   Bounds Place = {};             // in the window's client area, twips
   Font Face;
   std::string Caption, ToolTip;

@@ -51,7 +51,7 @@ TEST_F(Janela, CancelWritesNothingEvenInTheMiddleOfTheSearch) {
 }
 
 TEST_F(Janela, KeysAndClicksOfTheList) {
-  PutFile("C:\\Tolvaris\\Z\\zsnes.exe", "MZ");
+  PutFile("C:\\Tolvaris\\ZZZ\\zsnes.exe", "MZ");
   AbrirEProcurar();
   const std::vector<platform::Control*> ordem = ControlsOf(*form);
   const auto lugar = [&](const platform::Control& controle) {
@@ -61,14 +61,14 @@ TEST_F(Janela, KeysAndClicksOfTheList) {
   EXPECT_LT(lugar(form->Command3), lugar(form->Command1));
   EXPECT_LT(lugar(form->Command1), lugar(form->Command2));
   PressKey(form->List1, 40);
-  EXPECT_EQ(Mostrados()[1], "C:\\Tolvaris\\Z\\zsnes.cfg");
+  EXPECT_EQ(Mostrados()[1], "C:\\Tolvaris\\ZZZ\\zsnes.cfg");
   PressKey(form->List1, 13);
   EXPECT_TRUE(form->IsClosed());
-  EXPECT_EQ(Gravados()[3], "\\Z\\zsnes.exe");
-  EXPECT_EQ(Gravados()[4], "\\Z\\zsnes.cfg");
+  EXPECT_EQ(Gravados()[3], "\\ZZZ\\zsnes.exe");
+  EXPECT_EQ(Gravados()[4], "\\ZZZ\\zsnes.cfg");
 
   AbrirEProcurar();
-  EXPECT_EQ(form->List1.Text(0), "C:\\Tolvaris\\Z\\zsnes.exe") << "the one that is set comes first";
+  EXPECT_EQ(form->List1.Text(0), "C:\\Tolvaris\\ZZZ\\zsnes.exe") << "the one that is set comes first";
   Choose(form->List1, 1);
   DoubleClick(form->List1);
   EXPECT_EQ(Gravados(), Padroes);
@@ -180,25 +180,21 @@ TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialog) {
 }
 
 TEST_F(Janela, WhatStartUpCouldNotReadIsRefused) {
-  const std::string fundo = "C:\\" + std::string(120, 'a') + "\\" + std::string(110, 'b') + "\\";
-  PutFile(fundo + "zsnesw7890.exe", "MZ");  // 249 characters
-  PutFile(fundo + "zsnesw7890abcdef.exe", "MZ");
-  struct {
-    std::size_t Tamanho;
-    bool Cabe;
-  } const casos[] = {{254, true}, {255, false}};
-  for (const auto& [tamanho, cabe] : casos) EXPECT_EQ(Impedimento(std::string(tamanho, 'x')).empty(), cabe);
-  EXPECT_TRUE(Impedimento("\\Roms\\").empty());
-  EXPECT_FALSE(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe").empty());
+  EXPECT_EQ(Impedimento(std::string(254, 'x')), "");
+  EXPECT_NE(Impedimento(std::string(255, 'x')), "");
+  EXPECT_EQ(Impedimento("\\Roms\\"), "");
+  EXPECT_NE(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), "") << "read as relative to the program's directory";
 
-  const std::string comprido = fundo + std::string(16, 'c') + ".exe";
-  ASSERT_EQ(comprido.size(), 255U);
-  PutFile(comprido, "MZ");
-  PutText(Chave, "EmuExe", "x");
-  Abrir();
-  QueueFileDialog(comprido.substr(0, 254));  // what the dialog can give; there is no such file
+  const std::string diretorio = "C:\\" + std::string(120, 'a') + "\\" + std::string(121, 'b') + "\\";
+  PutFile(diretorio + "z.exe", "MZ");
+  AbrirEProcurar();
+  QueueFileDialog(diretorio + "z.exe");
   Click(form->Command3);
-  EXPECT_EQ(Mostrados()[0], "x");
+  Gravar();
+  EXPECT_EQ(Mensagens(), Textos{"Erro: O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi +
+                                diretorio + "zsnesw.cfg"});
+  EXPECT_EQ(Gravados(), Nada);
+  EXPECT_FALSE(form->IsClosed());
 }
 
 TEST_F(Janela, NothingFoundIsSaidAndNothingCanBeSaved) {
@@ -273,6 +269,7 @@ TEST_F(FormaNovaNaJanela, ItsDirectoriesAreSetOnRequest) {
 // Whatever fails: the file is the old or the new one, whole, and what is not as it was asked for has been said.
 TEST_F(FormaNovaNaJanela, EveryFaultLeavesWholeFilesAndIsSaid) {
   bool fechou = false;
+  std::size_t abertos = 0;
   const int falhas = ComCadaFalha(
       [this] {
         PutFile(Emulador, "MZ");
@@ -280,9 +277,10 @@ TEST_F(FormaNovaNaJanela, EveryFaultLeavesWholeFilesAndIsSaid) {
         AbrirEProcurar();
         QueueAnswer(Answer::Yes);
       },
-      [this, &fechou] {
+      [&] {
         Gravar();
         fechou = form->IsClosed();
+        abertos = OpenFiles() + OpenRegistryHandles();
         CutPower();
       },
       [&] {
@@ -291,9 +289,9 @@ TEST_F(FormaNovaNaJanela, EveryFaultLeavesWholeFilesAndIsSaid) {
         const Textos mensagens = Mensagens();
         const bool errou = !mensagens.empty() && mensagens.back().starts_with("Erro: ");
         EXPECT_EQ(fechou, !errou);
-        if (fechou) EXPECT_EQ(Gravados(), Padroes);
-        if (Gravados()[4] != "-") EXPECT_EQ(Gravados(), Padroes) << "configured is only what is complete";
-        EXPECT_EQ(OpenFiles() + OpenRegistryHandles(), 0U);
+        const bool configurado = Gravados()[4] != "-";
+        EXPECT_TRUE(Gravados() == Padroes || !(configurado || fechou)) << "configured is only what is complete";
+        EXPECT_EQ(abertos, 0U);
       });
   EXPECT_GT(falhas, 20);
 }

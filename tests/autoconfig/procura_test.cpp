@@ -76,6 +76,12 @@ TEST_F(Procurando, EndsInAForestWithoutEndAndReportsNothingTwice) {
   EXPECT_EQ(Tudo({{"Q:\\", 3}, {"C:\\Nada\\", 3}, {"C:\\Z\\7\\zsnes.exe\\", 3}}), Textos());
 }
 
+TEST_F(Procurando, LikelyNamesAreNotLeftOutAmongVeryMany) {
+  for (int i = 0; i < 3100; ++i) PutDirectory("C:\\P\\" + std::to_string(i));
+  PutFile("C:\\P\\Zsnes 1.42\\zsnes.exe", "MZ");
+  EXPECT_EQ(Tudo({{"C:\\P\\", 2}}), Textos{"C:\\P\\Zsnes 1.42\\zsnes.exe"});
+}
+
 // A place that is seen again with more levels is gone into as deep as that.
 TEST_F(Procurando, TheDeeperSearchCounts) {
   PutFile("C:\\P\\Q\\zsnes.exe", "MZ");
