@@ -38,8 +38,13 @@ TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
   EXPECT_FALSE(form->InList1("Jogo"));
 }
 
-TEST_F(List, AnEmptyDirectoryLeavesOnlyTheCommandsThatNeedNoGame) {
+TEST_F(List, AnEmptyOrUnreadableDirectoryLeavesOnlyTheCommandsThatNeedNoGame) {
   PutText(Key, "LRom", "Jogo");
+  PutText(Key, "RomDir", "Q:\\Roms\\");
+  ASSERT_TRUE(Start());
+  EXPECT_EQ(States(), NothingSelected);
+  EXPECT_TRUE(ShownMessages().empty());
+  PutText(Key, "RomDir", "");
   ASSERT_TRUE(Start());
   EXPECT_TRUE(Names().empty());
   EXPECT_EQ(form->Caption(), "Tolvaris");
@@ -141,13 +146,6 @@ TEST_F(List, PreviewTakesTheFirstPicturePresent) {
   Pick("Outro");
   EXPECT_EQ(form->Image1.ShownPicture(), form->Picture1);
   EXPECT_EQ(form->CaminhoImagem(7), "");
-}
-
-TEST_F(List, ADirectoryThatCannotBeReadShowsAnEmptyList) {
-  PutText(Key, "RomDir", "Q:\\Roms\\");
-  ASSERT_TRUE(Start());
-  EXPECT_EQ(States(), NothingSelected);
-  EXPECT_TRUE(ShownMessages().empty());
 }
 
 }  // namespace

@@ -39,7 +39,10 @@ inline std::string Bitmap(char shade) {
 
 class Menu : public testing::Test {
  protected:
-  Menu() {
+  Menu() { SetUpMachine(); }
+  ~Menu() override { End(); }
+
+  static void SetUpMachine() {
     Reset();
     PutText(Key, "EmuExe", Emulator);
     PutText(Key, "EmuCFG", EmulatorConfig);
@@ -47,7 +50,7 @@ class Menu : public testing::Test {
     PutText(Key, "AvisoALTF4", "1");
     PutFile(Emulator, "MZ");
   }
-  ~Menu() override {
+  void End() {
     form.reset();
     Catalogo().Fechar();
   }

@@ -1,4 +1,3 @@
-#include "controller/Form3.h"
 #include "mainwindow/ajustes.h"
 #include "platform/files.h"
 #include "support/mod_Globais.h"
@@ -39,21 +38,17 @@ TEST_F(Startup, SavedPositionKeepsPartOfTheWindowOnTheScreen) {
   EXPECT_EQ(EstadoDisquete("1"), 1);
 }
 
-TEST_F(Startup, RestoresWindowAndFloppyOption) {
+TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   PutText(Key, "pl", "1500");
   PutText(Key, "pt", "3000");
   PutValue(Key, "Disquete", 4, std::string("\1\0\0\0", 4));  // a number, as another program may have stored it
-  ASSERT_TRUE(Start());
-  EXPECT_EQ(form->Left(), 1500);
-  EXPECT_EQ(form->Top(), 3000);
-  EXPECT_EQ(form->Check1.Value(), 1);
-}
-
-TEST_F(Startup, PathsHaveDefaultsAndMayBeRelativeToTheProgram) {
   PutText(Key, "RomDir", "\\Jogos\\");
   PutText(Key, "SaveDir", "D:\\Saves\\");
   PutText(Key, "EmuCFG", "\\Emu\\zsnesw.cfg");
   ASSERT_TRUE(Start());
+  EXPECT_EQ(form->Left(), 1500);
+  EXPECT_EQ(form->Top(), 3000);
+  EXPECT_EQ(form->Check1.Value(), 1);
   EXPECT_EQ(DirPrograma, Home);
   EXPECT_EQ(DirRoms, Home + "Jogos\\");
   EXPECT_EQ(DirSaves, "D:\\Saves\\");
@@ -159,21 +154,9 @@ TEST_F(Startup, SurvivesTheFailureOfAnyOneCall) {
     EXPECT_EQ(Catalogue(), "|JOGOUM=Jogo Um|") << n;
     EXPECT_EQ(Content(Home + "Roms\\JOGOUM.SMC"), "rom") << n;
     ForgetMessages();
-    form.reset();
-    Catalogo().Fechar();
+    End();
     if (!failed) break;
   }
-}
-
-TEST_F(Startup, ClosingTheWindowClosesTheControllerHelp) {
-  ASSERT_TRUE(Start());
-  bool helpClosed = false;
-  QueueModal([&](platform::Window& help) {
-    form->Close();
-    helpClosed = help.IsClosed();
-  });
-  Form3::ABRIR();
-  EXPECT_TRUE(helpClosed);
 }
 
 }  // namespace
