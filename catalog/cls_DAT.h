@@ -14,6 +14,9 @@ class cls_DAT {
   cls_DAT() = default;
   cls_DAT(const cls_DAT&) = delete;
   cls_DAT& operator=(const cls_DAT&) = delete;
+  cls_DAT(cls_DAT&&) = delete;  // the index points into the text
+  cls_DAT& operator=(cls_DAT&&) = delete;
+  ~cls_DAT() = default;
 
   // Opens the file where it is not open yet, and reads it. A missing file is created by Carregar, not by Carregar2;
   // without a readable file the catalogue is empty.

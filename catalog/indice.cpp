@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <bit>
-#include <limits>
 #include <new>
 
 #include "catalog/busca.h"
@@ -19,7 +18,7 @@ std::uint64_t Juntar(std::uint64_t hash, char caractere) {
 
 std::uint64_t HashDe(std::string_view texto) {
   std::uint64_t hash = 0;
-  for (auto it = texto.rbegin(); it != texto.rend(); ++it) hash = Juntar(hash, *it);
+  for (std::size_t i = texto.size(); i-- > 0;) hash = Juntar(hash, texto[i]);
   return hash;
 }
 

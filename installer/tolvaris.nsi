@@ -32,6 +32,7 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
 
 !define MUI_ICON "${RAIZ}/resources/programa.ico"
 !define MUI_UNICON "${RAIZ}/resources/programa.ico"
+!define MUI_WELCOMEFINISHPAGE_BITMAP "${RAIZ}/resources/instalador.bmp"
 !define MUI_ABORTWARNING
 !define MUI_COMPONENTSPAGE_SMALLDESC
 !define MUI_FINISHPAGE_RUN "$INSTDIR\tolvaris.exe"

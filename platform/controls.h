@@ -153,7 +153,8 @@ class Button : public Control {
  public:
   Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font = {});
 
-  // Shows an icon of the program's resources, with the tool tip as the button's name; its size follows the screen's DPI.
+  // Shows an icon of the program's resources, with the tool tip as the button's name; its size follows the screen's
+  // DPI.
   void SetIcon(int id);
 
   std::function<void()> OnClick;
@@ -174,7 +175,7 @@ class ComboBox : public Control {
   ComboBox(const Container& container, const Bounds& bounds);
 
   void Add(const std::string& text);
-  int Selected() const;  // -1: none
+  int Selected() const;    // -1: none
   void Select(int index);  // silent
 
   std::function<void()> OnClick;  // the user chose an entry

@@ -10,7 +10,6 @@ namespace platform {
 // key is missing. Section and key match without regard to letter case; blanks around key and value are dropped, and
 // one pair of quotes around the value.
 std::string GetPrivateProfileStringA(const std::string& section, const std::string& key,
-                                     const std::string& defaultValue, std::size_t bufferSize,
-                                     const std::string& file);
+                                     const std::string& defaultValue, std::size_t bufferSize, const std::string& file);
 
 }  // namespace platform

@@ -20,6 +20,4 @@ int CompareStringA(std::string_view left, std::string_view right);
 }  // namespace platform
 
 // A literal of a source file (UTF-8), in the ANSI code page: "Não"_ansi.
-inline std::string operator""_ansi(const char* utf8, std::size_t length) {
-  return platform::FromUtf8({utf8, length});
-}
+inline std::string operator""_ansi(const char* utf8, std::size_t length) { return platform::FromUtf8({utf8, length}); }

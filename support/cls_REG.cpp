@@ -36,6 +36,8 @@ class ChaveAberta {
   }
   ChaveAberta(const ChaveAberta&) = delete;
   ChaveAberta& operator=(const ChaveAberta&) = delete;
+  ChaveAberta(ChaveAberta&&) = delete;
+  ChaveAberta& operator=(ChaveAberta&&) = delete;
 
   explicit operator bool() const { return chave_ != 0; }
   RegistryKey Numero() const { return chave_; }

@@ -18,7 +18,7 @@ std::string TextoDe(const Valor& Value);
 std::optional<std::int32_t> InteiroDe(const Valor& Value);
 
 // Where the program's settings lie, below platform::RootCurrentUser.
-inline constexpr char ChaveConfiguracao[] = "Software\\Roms\\Tolvaris";
+inline constexpr const char* ChaveConfiguracao = "Software\\Roms\\Tolvaris";
 
 // Key paths may begin with a backslash. A computer's name means the registry of that computer.
 class cls_REG {

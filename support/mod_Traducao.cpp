@@ -1,11 +1,13 @@
 #include "support/mod_Traducao.h"
 
+#include <array>
+
 #include "platform/profile.h"
 #include "support/mod_Globais.h"
 
 namespace {
 
-constexpr char Secao20[] = "TOLVARIS20";
+constexpr const char* Secao20 = "TOLVARIS20";
 constexpr std::size_t TamanhoBuffer = 255;
 
 }  // namespace
@@ -27,7 +29,7 @@ std::string LerIni(const std::string& Secao, const std::string& Chave) {
 }
 
 std::string TituloPrograma() {
-  constexpr unsigned char codigos[] = {84, 111, 108, 118, 97, 114, 105, 115};
+  constexpr std::array<unsigned char, 8> codigos = {84, 111, 108, 118, 97, 114, 105, 115};
   std::string titulo;
   for (const unsigned char codigo : codigos) titulo += static_cast<char>(codigo);
   return titulo;

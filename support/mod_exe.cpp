@@ -27,7 +27,7 @@ bool ComecaCaminho(const std::string& texto, std::size_t posicao) {
 // The command line up to its last backslash. Where that lies in an argument that is an absolute path, the directory is
 // the argument's.
 std::string DiretorioDoComando(const std::string& comando) {
-  const std::string ate = comando.substr(0, comando.rfind('\\') + 1);
+  std::string ate = comando.substr(0, comando.rfind('\\') + 1);
   for (std::size_t i = ate.size(); i-- > 0;) {
     if (ComecaCaminho(ate, i)) return ate.substr(i);
   }

@@ -13,7 +13,8 @@ namespace {
 
 using namespace benchmarks;
 
-constexpr double Limit = 30000;  // milliseconds
+constexpr double Limit = 30000;     // milliseconds
+constexpr DWORD PauseOfSearch = 4;  // the search asks the same server as the program that starts
 
 struct Program {
   std::string Path, Title;
@@ -63,7 +64,7 @@ double Start(const Program& program) {
   HWND window = nullptr;
   while (!window && watch.Milliseconds() < Limit) {
     window = FindWindowOf(process.dwProcessId, program);
-    if (!window) ::Sleep(1);
+    if (!window) ::Sleep(PauseOfSearch);
   }
   const double milliseconds = window ? watch.Milliseconds() : -1;
   std::printf("%s\t%.3f\n", program.Title.c_str(), milliseconds);

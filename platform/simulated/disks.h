@@ -38,7 +38,7 @@ struct OpenFile {
   std::shared_ptr<Disk> Where;
   std::shared_ptr<Entry> Target;
   std::string Path;
-  bool Readable, Writable;
+  bool Readable = false, Writable = false;
 };
 
 // Where a path leads: into a directory that exists.

@@ -29,7 +29,7 @@ struct RegistryRecord {
 
 struct RegistryHandle {
   std::string Path;  // in upper case
-  std::uint32_t Access;
+  std::uint32_t Access = 0;
 };
 
 struct ProcessBehaviour {
@@ -40,8 +40,8 @@ struct ProcessBehaviour {
 };
 
 struct RunningProcess {
-  bool RunsForEver, Ended;
-  int WaitsLeft;
+  bool RunsForEver = false, Ended = false;
+  int WaitsLeft = 0;
   std::function<void()> Run;
 };
 

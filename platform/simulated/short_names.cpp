@@ -65,7 +65,8 @@ std::string MakeShortName(const std::string& name, const std::function<bool(cons
     // From the fifth file of the same beginning on, the name's hash takes the place of most of it.
     if (number == 5) base = base.substr(0, 2) + Hash(name);
     const std::string tail = "~" + std::to_string(number > 4 ? number - 4 : number);
-    const std::string candidate = base.substr(0, 8 - tail.size() < 6 ? 8 - tail.size() : 6) + tail + extension;
+    std::string candidate = base.substr(0, 8 - tail.size() < 6 ? 8 - tail.size() : 6);
+    candidate.append(tail).append(extension);
     if (!taken(candidate)) return candidate;
   }
 }

@@ -50,7 +50,7 @@ void CutPower();
 // --- Registry, below HKEY_CURRENT_USER.
 
 struct RegistryValue {
-  std::uint32_t Type;
+  std::uint32_t Type = 0;
   std::string Data;  // the stored bytes
 };
 void PutValue(const std::string& key, const std::string& name, std::uint32_t type, std::string_view data);

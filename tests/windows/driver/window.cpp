@@ -46,6 +46,15 @@ std::string AskText(HWND window, UINT lengthMessage, UINT textMessage, WPARAM nu
   return FromWide(text);
 }
 
+std::vector<std::string> AskTexts(HWND window, UINT countMessage, UINT lengthMessage, UINT textMessage) {
+  std::vector<std::string> texts;
+  const LRESULT count = Ask(window, countMessage);
+  for (LRESULT i = 0; i < count; ++i) {
+    texts.push_back(AskText(window, lengthMessage, textMessage, static_cast<WPARAM>(i)));
+  }
+  return texts;
+}
+
 using Visitor = std::function<bool(HWND)>;  // false ends the visit
 
 BOOL CALLBACK Visit(HWND window, LPARAM visitor) { return (*reinterpret_cast<Visitor*>(visitor))(window); }
@@ -187,13 +196,28 @@ void PressKey(WORD key) {
   SendInput(UINT{inputs.size()}, inputs.data(), sizeof(INPUT));
 }
 
-std::vector<std::string> Entries(const Window& list) {
-  std::vector<std::string> entries;
-  const LRESULT count = Ask(list.Handle(), LB_GETCOUNT);
-  for (LRESULT i = 0; i < count; ++i) {
-    entries.push_back(AskText(list.Handle(), LB_GETTEXTLEN, LB_GETTEXT, static_cast<WPARAM>(i)));
+void TypeText(const std::string& text) {
+  std::wstring wide(text.size(), L'\0');
+  MultiByteToWideChar(CP_ACP, 0, text.data(), static_cast<int>(text.size()), wide.data(), static_cast<int>(wide.size()));
+  std::vector<INPUT> inputs;
+  for (const wchar_t letter : wide) {
+    for (const DWORD release : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) {
+      INPUT input{};
+      input.type = INPUT_KEYBOARD;
+      input.ki.wScan = letter;
+      input.ki.dwFlags = KEYEVENTF_UNICODE | release;
+      inputs.push_back(input);
+    }
   }
-  return entries;
+  SendInput(static_cast<UINT>(inputs.size()), inputs.data(), sizeof(INPUT));
+}
+
+std::vector<std::string> Entries(const Window& list) {
+  return AskTexts(list.Handle(), LB_GETCOUNT, LB_GETTEXTLEN, LB_GETTEXT);
+}
+
+std::vector<std::string> Choices(const Window& comboBox) {
+  return AskTexts(comboBox.Handle(), CB_GETCOUNT, CB_GETLBTEXTLEN, CB_GETLBTEXT);
 }
 
 int SelectedEntry(const Window& list) { return static_cast<int>(Ask(list.Handle(), LB_GETCURSEL)); }

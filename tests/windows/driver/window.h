@@ -49,11 +49,15 @@ Window FindVisible(const Program& program, const std::string& title);
 Window FindMessage(const Program& program);
 
 void PressKey(WORD key);
+void TypeText(const std::string& text);
 
 // Entries of a list box. Positions start at 0.
 std::vector<std::string> Entries(const Window& list);
 int SelectedEntry(const Window& list);  // -1: none
 void ClickEntry(const Window& list, const std::string& text, int times = 1);
+
+// Entries of a combo box.
+std::vector<std::string> Choices(const Window& comboBox);
 
 // What a message shows.
 struct Message {

@@ -1,5 +1,7 @@
 // From what is downloaded to a game that runs, and back: the installer and the zip on a machine that never saw either.
-#include <functional>
+#include <algorithm>
+#include <array>
+#include <fstream>
 
 #include "tests/windows/installation.h"
 #include "tests/windows/main_window.h"
@@ -7,38 +9,39 @@
 namespace {
 
 using driver::Answer;
-using driver::Message;
 using driver::Program;
 using driver::Window;
 
-constexpr char Uninstall[] = "Software\\Microsoft\\Windows\\CurrentVersion\\Uninstall\\Tolvaris";
-constexpr char Settings[] = "Software\\Roms\\Tolvaris";
+constexpr char UninstallKey[] = "Software\\Microsoft\\Windows\\CurrentVersion\\Uninstall\\Tolvaris";
+constexpr char SettingsKey[] = "Software\\Roms\\Tolvaris";
+constexpr char Downloaded[] = "C:\\setup.exe";
 constexpr char Emulator[] = "C:\\Program Files\\Emulador ZSNES\\zsnesw.exe";
 constexpr char Game[] = "Roms\\Corrida das Nuvens.smc";
 
 // A text of the user's registry; the empty text when it is missing.
 std::string Registered(const char* key, const char* name) {
-  std::string text(1024, '\0');
+  std::array<char, 1024> text{};
   DWORD size = static_cast<DWORD>(text.size());
-  if (RegGetValueA(HKEY_CURRENT_USER, key, name, RRF_RT_REG_SZ, nullptr, text.data(), &size) != ERROR_SUCCESS) return {};
-  return text.c_str();
+  RegGetValueA(HKEY_CURRENT_USER, key, name, RRF_RT_REG_SZ, nullptr, text.data(), &size);
+  return text.data();
 }
 
-// The names in a directory, those in directories of it with their path; empty ones end with a backslash.
-std::vector<std::string> Files(const std::string& directory, const std::string& prefix = "") {
+// The files in a directory and in those below it, sorted; a directory without any is named with a backslash.
+std::vector<std::string> Files(const std::string& directory, const std::string& below = "") {
   std::vector<std::string> files;
   WIN32_FIND_DATAA found{};
-  const HANDLE search = FindFirstFileA((directory + prefix + "*").c_str(), &found);
+  const HANDLE search = FindFirstFileA((directory + below + "*").c_str(), &found);
   if (search == INVALID_HANDLE_VALUE) return files;
   do {
-    const std::string name = prefix + found.cFileName;
-    if (found.cFileName == std::string(".") || found.cFileName == std::string("..")) continue;
-    std::vector<std::string> inside = {name};
-    if ((found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0) {
-      inside = Files(directory, name + "\\");
-      if (inside.empty()) inside = {name + "\\"};
+    const std::string name = found.cFileName;
+    if (name == "." || name == "..") continue;
+    const bool isDirectory = (found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
+    const std::vector<std::string> inside = isDirectory ? Files(directory, below + name + "\\") : files;
+    if (isDirectory && !inside.empty()) {
+      files.insert(files.end(), inside.begin(), inside.end());
+    } else {
+      files.push_back(below + name + (isDirectory ? "\\" : ""));
     }
-    files.insert(files.end(), inside.begin(), inside.end());
   } while (FindNextFileA(search, &found));
   FindClose(search);
   std::sort(files.begin(), files.end());
@@ -51,60 +54,72 @@ std::string Folder(const char* variable) {
   return folder.data();
 }
 
-// Where the start menu has its entry.
-std::string Shortcut() {
-  return Folder("APPDATA") + "\\Microsoft\\Windows\\Start Menu\\Programs\\Tolvaris.lnk";
+std::string Shortcut() { return Folder("APPDATA") + "\\Microsoft\\Windows\\Start Menu\\Programs\\Tolvaris.lnk"; }
+
+void Put(const std::string& path, const std::string& content) {
+  CreateDirectoryA(path.substr(0, path.rfind('\\')).c_str(), nullptr);
+  EXPECT_TRUE((std::ofstream(path, std::ios::binary) << content).flush()) << path;
 }
 
-// Runs an installer or uninstaller to its end.
-void RunSilently(const std::string& commandLine) {
+void RunToItsEnd(const std::string& commandLine) {
   const Program program(commandLine);
-  ASSERT_SOON(program.HasEnded()) << commandLine;
+  EXPECT_SOON(program.HasEnded()) << commandLine;
 }
 
-// The uninstaller goes on as a copy of itself after its own end. It lets what was installed be until the last of it.
-void UninstallFrom(const std::string& directory) {
-  STARTUPINFOA how{};
-  how.cb = sizeof how;
-  PROCESS_INFORMATION process{};
-  std::string commandLine = Registered(Uninstall, "QuietUninstallString");
-  EXPECT_EQ(commandLine, "\"" + directory + "desinstalar.exe\" /S");
-  ASSERT_TRUE(CreateProcessA(nullptr, commandLine.data(), nullptr, nullptr, FALSE, 0, nullptr, "C:\\", &how, &process));
-  CloseHandle(process.hThread);
-  CloseHandle(process.hProcess);
+// As the list of installed programs does it; the uninstaller goes on as a copy of itself.
+void Uninstall() {
+  const Program program(Registered(UninstallKey, "QuietUninstallString"));
+  EXPECT_SOON(Registered(UninstallKey, "DisplayName").empty());
+  EXPECT_EQ(ContentOf(Shortcut()), "");
 }
 
-// What a person sees from the first start to the first game.
+// As a person does it who wants nothing to stay. It goes in place, as one program, and so cannot delete itself.
+void UninstallWithTheSettings(const std::string& directory) {
+  const Program program(directory + "desinstalar.exe _?=" + directory.substr(0, directory.size() - 1));
+  const auto button = [&](int id) { return Window(GetDlgItem(driver::FindMessage(program).Handle(), id)); };
+  ASSERT_SOON(button(IDOK).Visible());
+  button(IDOK).Click();
+  ASSERT_SOON(button(IDYES));
+  EXPECT_EQ(Answer(program, IDYES).Buttons, (std::vector<int>{IDYES, IDNO}));
+  ASSERT_SOON(button(IDOK).Enabled());
+  button(IDOK).Click();
+  EXPECT_SOON(program.HasEnded());
+}
+
+// What a person reads from the first start to the first game.
 struct Words {
-  std::string Configuration, Save, Controller, Close, Play, Information;
+  std::string Configuration, Frame, Save, Controller, Close, Play, Information;
 };
-const Words Portuguese = {"Configuração do Tolvaris", "&Gravar", "Controle", "&Fechar", "Jogar", "Informação"};
-const Words English = {"Tolvaris configuration", "&Save", "Controller", "&Close", "Play", "Information"};
+const Words Portuguese = {
+    "Configuração do Tolvaris", " Configuração ", "&Gravar", "Controle", "&Fechar", "Jogar", "Informação"};
+const Words English = {
+    "Tolvaris configuration", "Configuration", "&Save", "Controller", "&Close", "Play", "Information"};
 
 class Release : public testing::Test {
  protected:
   Release() {
-    RegDeleteTreeA(HKEY_CURRENT_USER, Settings);
+    RegDeleteTreeA(HKEY_CURRENT_USER, SettingsKey);
     CreateDirectoryA("C:\\Program Files\\Emulador ZSNES", nullptr);
     EXPECT_TRUE(CopyFileA(EMULATOR_STANDIN, Emulator, FALSE));
+    EXPECT_TRUE(CopyFileA(INSTALLER, Downloaded, FALSE)) << INSTALLER << " could not be built: is nsis installed?";
   }
 
-  // The auto-configuration program finds the emulator by itself and saves it.
+  // The auto-configuration program finds the emulator by itself.
   static void Configure(const Program& program, const Words& words) {
     EXPECT_EQ(Answer(program, IDYES).Buttons, (std::vector<int>{IDYES, IDNO, IDCANCEL}));
-    Window configuration;
-    ASSERT_SOON(configuration = Window(FindWindowA(nullptr, words.Configuration.c_str())));
-    const Window save = configuration.Child(words.Save);
-    EXPECT_SOON_EQ(std::vector<std::string>{Emulator}, Entries(configuration.ChildAt(120, 375)));
+    Window window;
+    ASSERT_SOON(window = Window(FindWindowA(nullptr, words.Configuration.c_str())));
+    EXPECT_SOON(window.Child(words.Frame));
+    EXPECT_SOON_EQ(std::vector<std::string>{Emulator}, Entries(window.ChildAt(120, 375)));
+    const Window save = window.Child(words.Save);
     ASSERT_SOON(save.Enabled());
     save.Click();
-    EXPECT_SOON(!configuration);
+    EXPECT_SOON(!window);
   }
 
-  // The first start in a directory with one game, and that game.
+  // The first start in a directory, and the game that it holds.
   static void PlayFirstGame(const std::string& directory, const Words& words) {
-    CreateDirectoryA((directory + "Roms").c_str(), nullptr);
-    ASSERT_TRUE(CopyFileA(EMULATOR_STANDIN, (directory + Game).c_str(), FALSE)) << directory;
+    Put(directory + Game, "jogo");
     const Program program(directory + "tolvaris.exe");
     Configure(program, words);
     EXPECT_EQ(Answer(program, IDOK).Title, words.Information);
@@ -117,35 +132,57 @@ class Release : public testing::Test {
     window.Play.Click();
     EXPECT_EQ(Answer(program, IDOK).Title, words.Information);
 
-    // Without quotes, so that no path in it may have blanks.
+    // The command line has no quotes, so neither path may have blanks.
     const std::string emulator = ShortPath(Emulator);
     EXPECT_EQ(emulator.find(' '), std::string::npos);
-    const Call expected = {emulator + " " + ShortPath(directory + Game),
-                           emulator.substr(0, emulator.rfind('\\'))};
+    const Call expected = {emulator + " " + ShortPath(directory + Game), emulator.substr(0, emulator.rfind('\\'))};
     EXPECT_EQ(NextCall(Emulator), expected);
     window.Window.CloseByUser();
     EXPECT_SOON(program.HasEnded());
   }
 };
 
-TEST_F(Release, InstalledPlayedAndRemovedAgain) {
+TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
   const std::string directory = Folder("LOCALAPPDATA") + "\\Programs\\Tolvaris\\";
-  RunSilently(std::string(INSTALLER) + " /S");
+  RunToItsEnd(std::string(Downloaded) + " /S");
   const std::vector<std::string> installed = {"CHANGELOG.txt", "LEIAME.txt", "desinstalar.exe", "tolvaris.exe",
                                               "tolvariscfg.exe"};
   ASSERT_EQ(Files(directory), installed);
-  EXPECT_EQ(Registered(Uninstall, "DisplayName"), "Tolvaris");
-  EXPECT_EQ(Registered(Uninstall, "InstallLocation") + "\\", directory);
-  EXPECT_FALSE(ContentOf(Shortcut()).empty());
-
+  EXPECT_EQ(Registered(UninstallKey, "InstallLocation") + "\\", directory);
+  EXPECT_NE(ContentOf(Shortcut()), "");
   PlayFirstGame(directory, Portuguese);
-  const std::vector<std::string> own = {"Imgs\\", Game, "Saves\\", "tolvaris.dat"};
   {
     const Program program(directory + "tolvaris.exe");
     const MainWindow window(program);
-    UninstallFrom(directory);
-    UninstallFrom(directory);
+    const std::vector<std::string> before = Files(directory);
+    RunToItsEnd("\"" + directory + "desinstalar.exe\" /S _?=" + directory.substr(0, directory.size() - 1));
+    EXPECT_EQ(Files(directory), before) << "nothing goes while the program is open";
   }
+  Put(directory + "Imgs\\Corrida das Nuvens.gif", "figura");
+  Put(directory + "language.ini", "[TOLVARIS20]\r\n");
+  Uninstall();
+  const std::vector<std::string> left = {"Imgs\\Corrida das Nuvens.gif", Game, "language.ini", "tolvaris.dat"};
+  EXPECT_SOON_EQ(left, Files(directory));
+  EXPECT_EQ(Registered(SettingsKey, "LRom"), "Corrida das Nuvens");
 }
+
+TEST_F(Release, InstalledInEnglishWhereThePersonLikes) {
+  const std::string directory = "C:\\Área de Jogos\\";
+  Put(directory + "language.ini", "[TOLVARIS20]\r\nJogar=Jugar\r\n");
+  RunToItsEnd(std::string(Downloaded) + " /S /INGLES /D=C:\\Área de Jogos");
+  PlayFirstGame(directory, English);
+  RunToItsEnd(std::string(Downloaded) + " /S");  // once more, over it
+  const std::vector<std::string> installed = {"CHANGELOG.txt", "Imgs\\",          "LEIAME.txt",          Game,
+                                              "Saves\\",       "desinstalar.exe", "language.antes1.ini", "language.ini",
+                                              "tolvaris.dat",  "tolvaris.exe",    "tolvariscfg.exe"};
+  EXPECT_EQ(Files(directory), installed);
+  UninstallWithTheSettings(directory);
+  const std::vector<std::string> left = {Game, "desinstalar.exe", "language.antes1.ini", "tolvaris.dat"};
+  EXPECT_EQ(Files(directory), left);
+  EXPECT_EQ(Registered(SettingsKey, "LRom"), "");
+}
+
+// Unpacked before the tests run.
+TEST_F(Release, Unzipped) { PlayFirstGame("C:\\Jogos do João\\Tolvaris\\", Portuguese); }
 
 }  // namespace

@@ -1,0 +1,30 @@
+// The system's dialogs that ask for a file, seen and used as a person does.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "tests/windows/driver/window.h"
+
+namespace driver {
+
+class FileDialog {
+ public:
+  // Waits until the program shows one.
+  explicit FileDialog(const Program& program);
+
+  std::string Title() const { return dialog_.Text(); }
+  std::string FileName() const;  // what stands in its box, without the blanks behind it
+  std::vector<std::string> FileTypes() const;
+
+  void ChooseNextType() const;
+  void Type(const std::string& path) const;  // over what stands in the box
+
+  // Presses OK or Cancel, by the identifier of the button, and waits until the dialog is gone.
+  void Press(int button) const;
+
+ private:
+  Window dialog_, name_, types_;
+};
+
+}  // namespace driver
