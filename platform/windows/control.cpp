@@ -13,6 +13,12 @@ bool IsEnter(LPARAM lParam) {
   return event != nullptr && event->wParam == VK_RETURN;
 }
 
+// The keyboard's rules give the button that Tab has reached a thicker frame, and take it back only when Tab leaves it.
+void EndDefault(HWND control) {
+  if ((::SendMessageA(control, WM_GETDLGCODE, 0, 0) & DLGC_DEFPUSHBUTTON) == 0) return;
+  ::SendMessageA(control, BM_SETSTYLE, BS_PUSHBUTTON, TRUE);
+}
+
 LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
   auto& control = *reinterpret_cast<ControlState*>(::GetWindowLongPtrA(handle, GWLP_USERDATA));
   const WNDPROC native = control.Native;
@@ -29,6 +35,9 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
       break;
     case WM_SETFOCUS:
       if (control.Owner != nullptr) control.Owner->Focus = handle;
+      break;
+    case WM_KILLFOCUS:
+      EndDefault(handle);
       break;
     case WM_ERASEBKGND:
       if (control.Draw) return TRUE;  // it draws all of itself
@@ -62,10 +71,22 @@ DWORD GroupStyle(const WindowState& window, const char* nativeClass) {
 // The window keeps the keyboard itself when a control loses it by being switched off, and gives it back.
 void KeepFocus(const ControlState& control, bool usable) {
   const HWND window = control.Owner->Handle;
+  if (control.Owner->Focus != control.Handle || ::GetActiveWindow() != window) return;
   const HWND focus = ::GetFocus();
-  if (::GetActiveWindow() != window || control.Owner->Focus != control.Handle) return;
   if (usable && focus == window) ::SetFocus(control.Handle);
   if (!usable && (focus == nullptr || focus == control.Handle)) ::SetFocus(window);
+}
+
+Bounds PixelsOf(const ControlState& control) {
+  const int dpi = control.Owner->Dpi;
+  const Bounds& place = control.Place;
+  return {ToPixels(place.Left, dpi), ToPixels(place.Top, dpi), ToPixels(place.Width, dpi), ToPixels(place.Height, dpi)};
+}
+
+void Dress(const ControlState& control, bool redraw) {
+  const HFONT font = FontFor(control.Face, control.Owner->Dpi);
+  ::SendMessageA(control.Handle, WM_SETFONT, reinterpret_cast<WPARAM>(font), redraw);
+  if (control.LayOut) control.LayOut();
 }
 
 }  // namespace
@@ -83,21 +104,21 @@ void CreateControl(ControlState& control, const Container& container, const Boun
   const auto id = static_cast<std::uintptr_t>(FirstId) + window.Controls.size();
   window.Controls.push_back(&control);
   if (window.Handle == nullptr) return;
+  const Bounds place = PixelsOf(control);
   control.Handle =
       ::CreateWindowExA(native.ExtendedStyle, native.Class, text.c_str(), WS_CHILD | WS_VISIBLE | group | native.Style,
-                        0, 0, 0, 0, window.Handle, reinterpret_cast<HMENU>(id), ::GetModuleHandleA(nullptr), nullptr);
+                        place.Left, place.Top, place.Width, place.Height, window.Handle, reinterpret_cast<HMENU>(id),
+                        ::GetModuleHandleA(nullptr), nullptr);
   TakeMessages(control);
-  LayOutControl(control);
+  Dress(control, false);
 }
 
 void LayOutControl(ControlState& control) {
   if (control.Handle == nullptr) return;
-  const int dpi = control.Owner->Dpi;
-  ::SendMessageA(control.Handle, WM_SETFONT, reinterpret_cast<WPARAM>(FontFor(control.Face, dpi)), TRUE);
-  const Bounds& place = control.Place;
-  ::SetWindowPos(control.Handle, nullptr, ToPixels(place.Left, dpi), ToPixels(place.Top, dpi),
-                 ToPixels(place.Width, dpi), ToPixels(place.Height, dpi), SWP_NOZORDER | SWP_NOACTIVATE);
-  if (control.LayOut) control.LayOut();
+  const Bounds place = PixelsOf(control);
+  ::SetWindowPos(control.Handle, nullptr, place.Left, place.Top, place.Width, place.Height,
+                 SWP_NOZORDER | SWP_NOACTIVATE);
+  Dress(control, true);
   UpdateToolTip(control);
 }
 

@@ -29,9 +29,11 @@ class KeptDirectory {
 
 const char* OrNull(const std::string& text) { return text.empty() ? nullptr : text.c_str(); }
 
-// The file buffer as it is first shown: as much of the name as leaves room for the closing zero.
+// The file buffer as it is first shown: as much of the name as leaves room for the closing zero. Blanks behind a name
+// are no part of it; Wine's dialog would take them into the path, and ends the program when that becomes too long.
 std::string FileBuffer(const OpenFileName& request) {
   std::string buffer = request.File.substr(0, request.FileSize - 1);
+  buffer.resize(buffer.find_last_not_of(' ') + 1);
   buffer.resize(request.FileSize, '\0');
   return buffer;
 }

@@ -5,12 +5,20 @@
 namespace platform {
 namespace {
 
+// The usual line of dots would be lost in a picture this small.
+void DrawFocus(HDC context, RECT place) {
+  for (LONG width = (place.right - place.left) / 6; width > 0; --width) {
+    ::FrameRect(context, &place, ::GetSysColorBrush(COLOR_HIGHLIGHT));
+    ::InflateRect(&place, -1, -1);
+  }
+}
+
 void DrawImageButton(const DRAWITEMSTRUCT& item, const Picture& picture) {
   RECT place = item.rcItem;
   ::FillRect(item.hDC, &place, ::GetSysColorBrush(COLOR_BTNFACE));
   if ((item.itemState & ODS_SELECTED) != 0) ::OffsetRect(&place, 1, 1);
   DrawPicture(item.hDC, place, picture);
-  if ((item.itemState & ODS_FOCUS) != 0) ::DrawFocusRect(item.hDC, &item.rcItem);
+  if ((item.itemState & ODS_FOCUS) != 0) DrawFocus(item.hDC, item.rcItem);
 }
 
 }  // namespace

@@ -22,7 +22,7 @@ struct WindowState {
   std::vector<ControlState*> Controls;  // in the order of creation
   std::vector<TimerState*> Timers;
   HWND Focus = nullptr;        // the control that has the keyboard while the window is active
-  HWND ToolTips = nullptr;     // made with the first tool tip
+  HWND ToolTips = nullptr;     // made when the mouse first comes
   std::vector<HWND> Disabled;  // the windows that this modal one has disabled
   IconHandle LargeIcon, SmallIcon;
   RECT LastPlace = {};  // once closed
@@ -101,6 +101,10 @@ void SetNativeText(const ControlState& control, const std::string& text);
 
 // Tells the tool tips what the control's tip is, and where the control lies while it is disabled.
 void UpdateToolTip(const ControlState& control);
+
+// From now on the window has tool tips. They cost the start of the program more than its controls, so they wait for the
+// mouse.
+void StartToolTips(WindowState& window);
 
 // Enter presses the button that has the keyboard; a key that is held down does so once.
 void PressOnEnter(ControlState& button);

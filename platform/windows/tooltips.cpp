@@ -50,12 +50,17 @@ void Replace(HWND tips, TTTOOLINFOA tool, bool wanted) {
 
 void UpdateToolTip(const ControlState& control) {
   if (control.Handle == nullptr) return;
-  HWND& tips = control.Owner->ToolTips;
+  const HWND tips = control.Owner->ToolTips;
+  if (tips == nullptr) return;
   const bool wanted = !control.ToolTip.empty();
-  if (tips == nullptr && !wanted) return;
-  if (tips == nullptr) tips = CreateToolTips(control.Owner->Handle);
   Replace(tips, ControlTool(control), wanted);
   Replace(tips, PlaceTool(control), wanted && control.Visible && !control.Enabled);
+}
+
+void StartToolTips(WindowState& window) {
+  if (window.ToolTips != nullptr) return;
+  window.ToolTips = CreateToolTips(window.Handle);
+  for (const ControlState* control : window.Controls) UpdateToolTip(*control);
 }
 
 }  // namespace platform

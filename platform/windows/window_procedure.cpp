@@ -91,6 +91,9 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
     case WM_ERASEBKGND:
       EraseBackground(window, reinterpret_cast<HDC>(wParam));
       return {true, TRUE};
+    case WM_SETCURSOR:  // also for its controls
+      StartToolTips(window);
+      return {false, 0};
     case WM_TIMER:
       Tick(window, wParam);
       return {true, 0};
@@ -150,9 +153,11 @@ void PlaceWindow(WindowState& window, int left, int top) {
   // Not every version of Windows draws the frame in the window's own resolution.
   RECT client = {};
   ::GetClientRect(window.Handle, &client);
-  const int width = size.cx + ToPixels(window.Style.ClientWidth, window.Dpi) - client.right;
-  const int height = size.cy + ToPixels(window.Style.ClientHeight, window.Dpi) - client.bottom;
-  ::SetWindowPos(window.Handle, nullptr, 0, 0, width, height, SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
+  const int wider = ToPixels(window.Style.ClientWidth, window.Dpi) - client.right;
+  const int higher = ToPixels(window.Style.ClientHeight, window.Dpi) - client.bottom;
+  if (wider == 0 && higher == 0) return;
+  ::SetWindowPos(window.Handle, nullptr, 0, 0, size.cx + wider, size.cy + higher,
+                 SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
 void LayOutWindow(WindowState& window) {

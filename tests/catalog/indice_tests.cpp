@@ -32,7 +32,6 @@ TEST(IndiceDoCatalogo, AnswersAsThePlainSearchDoes) {
       for (const bool achado : {nome.has_value(), chave.has_value()}) (achado ? achados : semResposta) += 1;
     }
   }
-  EXPECT_EQ(achados + semResposta, 240000);
   EXPECT_GT(achados, 20000);
   EXPECT_GT(semResposta, 20000);
 }

@@ -65,6 +65,7 @@ TEST(Profile, FindsValues) {
       {"Comentado", "none"},
       {"Joga", "none"},
       {"Jogar ", "Play"},
+      {" Jogar ", "Play"},
       {"Last", "no line end"},
   };
   for (const auto& each : cases) {

@@ -51,14 +51,15 @@ TEST_F(Registros, AValueIsReadByItsTypeAndKeepsItWhenItIsSet) {
 TEST_F(Registros, SetValueLeavesTheOldOrTheNewValueWhicheverCallFails) {
   for (const auto& antes : {std::optional<std::string>(), std::optional("velho"s)}) {
     std::optional<std::string> texto;
-    const int falhas = ComCadaFalha([&] { antes ? PutText(Chave, "LRom", *antes) : void(); },
-                                    [] { EXPECT_TRUE(Registro.SetValue(Raiz, Chave, "LRom", "novo")); },
-                                    [&] {
-                                      texto = StoredText(Chave, "LRom");
-                                      EXPECT_TRUE(texto == "novo" || texto == antes);
-                                    });
+    const auto preparar = [&] { antes ? PutText(Chave, "LRom", *antes) : void(); };
+    const auto conferir = [&] {
+      texto = StoredText(Chave, "LRom");
+      EXPECT_TRUE(texto == "novo" || texto == antes);
+    };
+    EXPECT_GE(ComCadaFalha(
+                  preparar, [] { EXPECT_TRUE(Registro.SetValue(Raiz, Chave, "LRom", "novo")); }, conferir),
+              3);
     EXPECT_EQ(texto, "novo");
-    EXPECT_GE(falhas, 3);
   }
 }
 

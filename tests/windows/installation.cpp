@@ -40,8 +40,7 @@ void CopyProgram(const char* from, const std::string& to) {
   ASSERT_TRUE(CopyFileA(from, to.c_str(), FALSE)) << from << ": error " << GetLastError();
 }
 
-// The host's name for a path of ours.
-std::string HostPath(const std::wstring& path) {
+std::string HostPathOf(const std::wstring& path) {
   using Translate = char*(CDECL*)(const wchar_t*);
   const auto translate = reinterpret_cast<Translate>(
       reinterpret_cast<void*>(GetProcAddress(GetModuleHandleA("kernel32"), "wine_get_unix_file_name")));
@@ -53,7 +52,7 @@ std::string HostDriveA() {
   std::array<wchar_t, MAX_PATH> prefix{};
   GetEnvironmentVariableW(L"WINECONFIGDIR", prefix.data(), MAX_PATH);
   // The variable holds the path as the kernel names it: "\??\Z:\...".
-  return HostPath(std::wstring(prefix.data()).substr(4) + L"\\dosdevices") + "/a:";
+  return HostPathOf(std::wstring(prefix.data()).substr(4) + L"\\dosdevices") + "/a:";
 }
 
 }  // namespace
@@ -138,6 +137,29 @@ std::string ContentOf(const std::string& path) {
   return {std::istreambuf_iterator<char>(file), {}};
 }
 
+Files FilesIn(const std::string& directory) {
+  Files files;
+  WIN32_FIND_DATAA found{};
+  const HANDLE search = FindFirstFileA((directory + "*").c_str(), &found);
+  if (search == INVALID_HANDLE_VALUE) return files;
+  do {
+    if ((found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0) continue;
+    files[found.cFileName] = ContentOf(directory + found.cFileName);
+  } while (FindNextFileA(search, &found));
+  FindClose(search);
+  return files;
+}
+
+std::string Bytes(unsigned kind, size_t size) {
+  std::string bytes;
+  for (unsigned i = 0; i < size; ++i) bytes += static_cast<char>(i * (2 * kind + 1) + i / 256);
+  return bytes;
+}
+
+std::string HostPath(const std::string& path) {
+  return HostPathOf(std::wstring(path.begin(), path.end()));  // plain ASCII
+}
+
 std::string ShortPath(const std::string& path) {
   std::array<char, MAX_PATH> shortPath{};
   GetShortPathNameA(path.c_str(), shortPath.data(), MAX_PATH);
@@ -146,8 +168,7 @@ std::string ShortPath(const std::string& path) {
 
 FloppyDisk::FloppyDisk(const std::string& directory) {
   CreateDirectoryA(directory.c_str(), nullptr);
-  const std::wstring wide(directory.begin(), directory.end());  // plain ASCII
-  driver::StartOnHost("/bin/ln -sfn " + HostPath(wide) + " " + HostDriveA());
+  driver::StartOnHost("/bin/ln -sfn " + HostPath(directory) + " " + HostDriveA());
   EXPECT_SOON(IsReady());
 }
 

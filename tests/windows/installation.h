@@ -51,6 +51,18 @@ Call NextCall(const std::string& program);
 // All bytes of a file; the empty text when it is missing.
 std::string ContentOf(const std::string& path);
 
+// Contents by name.
+using Files = std::map<std::string, std::string>;
+
+// The files in a directory, whose path ends with a backslash.
+Files FilesIn(const std::string& directory);
+
+// Every byte there is, and no two contents of different kinds alike by chance.
+std::string Bytes(unsigned kind, size_t size);
+
+// The host's name for a path of ours; empty without a host.
+std::string HostPath(const std::string& path);
+
 // The path with each part in its short form, as the system makes it.
 std::string ShortPath(const std::string& path);
 

@@ -25,11 +25,6 @@ FileDialog::FileDialog(const Program& program) {
   EXPECT_SOON(name_.Focused());
 }
 
-std::string FileDialog::FileName() const {
-  const std::string text = name_.Text();
-  return text.substr(0, text.find_last_not_of(' ') + 1);
-}
-
 std::vector<std::string> FileDialog::FileTypes() const { return Choices(types_); }
 
 void FileDialog::ChooseNextType() const {
@@ -41,7 +36,7 @@ void FileDialog::ChooseNextType() const {
 }
 
 void FileDialog::Type(const std::string& path) const {
-  name_.Click();
+  if (!name_.Focused()) name_.Click();
   EXPECT_SOON(name_.Focused());
   SendMessageA(name_.Handle(), EM_SETSEL, 0, -1);
   TypeText(path);

@@ -14,7 +14,7 @@ class FileDialog {
   explicit FileDialog(const Program& program);
 
   std::string Title() const { return dialog_.Text(); }
-  std::string FileName() const;  // what stands in its box, without the blanks behind it
+  std::string FileName() const { return name_.Text(); }  // what stands in its box
   std::vector<std::string> FileTypes() const;
 
   void ChooseNextType() const;

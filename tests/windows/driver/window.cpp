@@ -198,7 +198,8 @@ void PressKey(WORD key) {
 
 void TypeText(const std::string& text) {
   std::wstring wide(text.size(), L'\0');
-  MultiByteToWideChar(CP_ACP, 0, text.data(), static_cast<int>(text.size()), wide.data(), static_cast<int>(wide.size()));
+  MultiByteToWideChar(CP_ACP, 0, text.data(), static_cast<int>(text.size()), wide.data(),
+                      static_cast<int>(wide.size()));
   std::vector<INPUT> inputs;
   for (const wchar_t letter : wide) {
     for (const DWORD release : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) {

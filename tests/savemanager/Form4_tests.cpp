@@ -1,0 +1,277 @@
+// The save-file manager's window: its two panes, picking in them, copying to the other side and deleting.
+#include <gtest/gtest.h>
+
+#include "catalog/cls_DAT.h"
+#include "platform/simulated/simulated.h"
+#include "platform/text.h"
+#include "resources/ids.h"
+#include "savemanager/Form4.h"
+#include "support/mod_Globais.h"
+
+namespace {
+
+using namespace platform;
+using namespace platform::simulated;
+using Mensagens = std::vector<ShownMessage>;
+
+const std::string NosDois = "Corrida 2 [State 0]", Velho = "velho no disquete", Novo = "novo no computador";
+const std::string SemNome = "SEMNOME [State 2]", Fonte = "C:\\Saves\\SEMNOME.zs2", Alvo = "A:\\SEMNOME.zs2";
+
+const ShownMessage Erro = {"Erro ao gravar arquivo.", "Erro", Buttons::Ok, Icon::Critical};
+const ShownMessage DiscoCheio = {"Não há espaço livre suficiente em disco para completar a operação."_ansi,
+                                 "Disco cheio", Buttons::Ok, Icon::Exclamation};
+
+ShownMessage Deletar(const std::string& pergunta) {
+  return {pergunta, "Confirmar deleção"_ansi, Buttons::YesNoCancel, Icon::Question};
+}
+
+ShownMessage JaExiste(const std::string& lado) {
+  return {"O salvamento selecionado já se encontra no "_ansi + lado + ".\r\nVocê deseja substituí-lo ?"_ansi,
+          "Salvamento já existente"_ansi, Buttons::YesNoCancel, Icon::Question};
+}
+
+// Saves: one on the floppy, one on the computer, and one on both.
+struct Salvamentos : testing::Test {
+  void SetUp() override { Preparar(); }
+
+  static void Preparar() {
+    Reset();
+    AddDisk('A', 1457664);
+    DirPrograma = "C:\\Tolvaris\\";
+    DirSaves = "C:\\Saves\\";
+    ArquivoIdioma.clear();
+    PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||DOIS=Corrida 2|");
+    PutFile("A:\\UM.srm", "um no disquete");
+    PutFile("A:\\DOIS.zst", Velho);
+    PutFile("C:\\Saves\\DOIS.zst", Novo);
+    PutFile(Fonte, "sem nome");
+    Catalogo().Fechar();
+    Catalogo().Carregar();
+  }
+
+  // Opens the window with this user in front of it.
+  static void Abrir(const std::function<void(Form4&)>& usuario) {
+    int vezes = 0;
+    QueueModal([&](Window& janela) { ++vezes, usuario(static_cast<Form4&>(janela)); });
+    Form4::Mostrar();
+    EXPECT_EQ(vezes, 1);
+  }
+
+  static std::string Textos(const ListBox& lista) {
+    std::string textos;
+    for (int i = 0; i < lista.Count(); ++i) textos += lista.Text(i) + "|";
+    return textos;
+  }
+
+  static void Escolher(ListBox& lista, const std::string& texto) {
+    ASSERT_GE(lista.FindExact(texto), 0) << texto;
+    Choose(lista, lista.FindExact(texto));
+  }
+
+  // The direction, the selections of both lists, which delete pictures are seen, the copy button, and the file.
+  static std::string Escolha(const Form4& janela) {
+    std::string texto = std::to_string(static_cast<int>(janela.Direcao));
+    for (const ListBox* lista : {&janela.List1, &janela.List2}) texto += " " + std::to_string(lista->Selected());
+    texto += std::string(janela.Image1.Visible() ? " left" : "") + (janela.Image2.Visible() ? " right" : "");
+    if (!janela.Command1.Visible()) return texto;
+    texto += IconOf(janela.Command1) == ICONE_SETA_DIREITA ? " -> " : " <- ";
+    return texto + janela.Command1.ToolTip() + ": " + janela.ArquivoAtual;
+  }
+  static bool NadaEscolhido(const Form4& janela) { return Escolha(janela) == "0 -1 -1"; }
+};
+
+TEST_F(Salvamentos, AreListedUnderTheNamesOfTheirGames) {
+  for (const char* const arquivo : {"A:\\UM.ZS3", "A:\\um.zst", "A:\\UM.txt"}) PutFile(arquivo, "x");
+  Abrir([](Form4& janela) {
+    EXPECT_EQ(Textos(janela.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
+    EXPECT_EQ(Textos(janela.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
+    EXPECT_TRUE(RedrawIsOn(janela.List1) && RedrawIsOn(janela.List2));
+    Click(janela.Command2);
+    EXPECT_TRUE(janela.IsClosed());
+  });
+}
+
+TEST_F(Salvamentos, OfADirectoryThatIsEmptyOrCannotBeReadLeaveThePaneEmptyAndEnabled) {
+  PutDirectory("C:\\Vazio");
+  RemoveDisk('A');
+  for (const char* const diretorio : {"C:\\Vazio\\", "C:\\Nenhum\\", "Z:\\", ""}) {
+    DirSaves = diretorio;
+    Abrir([](Form4& janela) {
+      EXPECT_EQ(Textos(janela.List1) + Textos(janela.List2), "") << DirSaves;
+      EXPECT_TRUE(janela.List1.Enabled() && janela.List2.Enabled()) << DirSaves;
+      janela.List2_Click();
+      janela.Command1_Click();
+      EXPECT_TRUE(NadaEscolhido(janela)) << "nothing can be picked";
+    });
+  }
+}
+
+TEST_F(Salvamentos, PickedDecideTheDirectionAndTheFile) {
+  const std::tuple<ListBox Form4::*, int, const char*> passos[] = {
+      {&Form4::List1, 1, "1 1 -1 left -> Copiar do disquete para o computador: UM.srm"},
+      {&Form4::List1, 0, "1 0 -1 left -> Copiar do disquete para o computador: DOIS.zst"},
+      {&Form4::List2, 1, "2 -1 1 right <- Copiar do computador para o disquete: SEMNOME.zs2"},
+      {&Form4::List1, 1, "1 1 -1 left -> Copiar do disquete para o computador: UM.srm"},
+  };
+  Abrir([&](Form4& janela) {
+    for (const auto& [lista, indice, depois] : passos) {
+      Choose(janela.*lista, indice);
+      EXPECT_EQ(Escolha(janela), depois);
+    }
+  });
+}
+
+TEST_F(Salvamentos, AreCopiedWhateverIsPickedOrClosedMeanwhile) {
+  for (const bool fechar : {false, true}) {
+    Preparar();
+    Abrir([&](Form4& janela) {
+      Escolher(janela.List1, "Jogo Um");
+      QueueEvent([&] {
+        EXPECT_EQ(janela.Caption(), "Copiando...");
+        EXPECT_EQ(Focused(), &janela.List1) << "the keyboard stays where the copy comes from";
+        PressKey(janela.List1, 46);
+        Escolher(janela.List1, NosDois);
+        PutFile("A:\\UM.zst", "x");
+        if (fechar) CloseWindow(janela);
+      });
+      Click(janela.Command1);
+      EXPECT_EQ(Pending(), 0);
+      EXPECT_EQ(janela.IsClosed(), fechar);
+      if (fechar) return;
+      EXPECT_TRUE(NadaEscolhido(janela));
+      EXPECT_EQ(Textos(janela.List1), "Corrida 2 [State 0]|Jogo Um|") << "the pane of the source is not filled again";
+      EXPECT_EQ(Textos(janela.List2), "Corrida 2 [State 0]|Jogo Um|SEMNOME [State 2]|");
+      Escolher(janela.List1, "Jogo Um");
+      janela.Diretorios[1].clear();
+      Click(janela.Command1);
+      EXPECT_FALSE(NadaEscolhido(janela)) << "there is nowhere to copy to";
+    });
+    EXPECT_EQ(Content("C:\\Saves\\UM.srm"), "um no disquete");
+    EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), Novo);
+    EXPECT_TRUE(ShownMessages().empty());
+  }
+}
+
+// The save that is on both sides: the other one of it is copied over it, or it is deleted.
+TEST_F(Salvamentos, AreReplacedAndDeletedOnlyAfterYes) {
+  for (int caso = 0; caso < 12; ++caso) {
+    const bool disquete = caso % 2 == 0, apagar = caso % 4 < 2;
+    const Answer resposta = std::array{Answer::Yes, Answer::No, Answer::Cancel}[static_cast<std::size_t>(caso / 4)];
+    const bool sim = resposta == Answer::Yes;
+    SCOPED_TRACE(caso);
+    Preparar();
+    QueueAnswer(resposta);
+    Abrir([&](Form4& janela) {
+      ListBox &lista = disquete ? janela.List1 : janela.List2, &outra = disquete ? janela.List2 : janela.List1;
+      Escolher(outra, NosDois);
+      if (apagar) Escolher(lista, NosDois);
+      PressKey(outra, apagar ? 46 : 13);  // nothing is picked there any more; Enter does nothing
+      apagar ? Click(disquete ? janela.Image1 : janela.Image2) : Click(janela.Command1);
+      EXPECT_EQ(NadaEscolhido(janela), sim);
+      EXPECT_EQ(janela.Command1.Visible() && (apagar ? lista : outra).Selected() == 0, !sim);
+      EXPECT_EQ(lista.Count(), sim && apagar ? 1 : 2);
+      EXPECT_EQ(Focused() == (apagar ? &lista : &outra), sim);
+    });
+    const auto resto = apagar ? std::nullopt : std::optional(disquete ? Novo : Velho);
+    EXPECT_EQ(Content("A:\\DOIS.zst"), sim && disquete ? resto : Velho);
+    EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), sim && !disquete ? resto : Novo);
+    const std::string lado = disquete ? "Disquete (A:)" : "Computador";
+    const std::string pergunta = "Deletar o salvamento do jogo '" + NosDois + "' que está no "_ansi + lado + " ?";
+    EXPECT_EQ(ShownMessages(), Mensagens{apagar ? Deletar(pergunta) : JaExiste(lado)});
+  }
+}
+
+TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
+  using Fazer = std::function<void()>;
+  const auto livres = [](std::uint64_t bytes) { return [=] { SetFreeSpace('A', bytes); }; };
+  const auto por = [](const std::string& caminho, const char* texto) { return [=] { PutFile(caminho, texto); }; };
+  const Fazer nada = [] {}, tirar = [] { RemoveDisk('A'); };
+  const ShownMessage existe = JaExiste("Disquete (A:)");
+  const struct {
+    const char* Nome;
+    Fazer Antes, Durante;  // what happens before the copy button is pressed, and during the copy
+    Mensagens Ditas;
+    std::optional<std::string> NoDisquete;
+  } casos[] = {
+      {"just room", livres(512), nada, {}, "sem nome"},
+      {"no room", livres(0), nada, {DiscoCheio}, {}},
+      {"no disk", tirar, nada, {DiscoCheio}, {}},
+      {"nothing to copy, no disk", [] { PutFile(Fonte, ""), RemoveDisk('A'); }, nada, {Erro}, {}},
+      {"an empty save", por(Fonte, ""), nada, {}, ""},
+      {"over an empty save", por(Alvo, ""), nada, {}, "sem nome"},
+      {"source gone", [] { RemoveFile(Fonte); }, nada, {Erro}, {}},
+      {"full half-way", nada, livres(2), {Erro}, {}},
+      {"full half-way over an old save", por(Alvo, "velho"), livres(2), {existe, Erro}, "velho"},
+      {"disk taken out", nada, tirar, {Erro}, {}},
+      {"old save in use", por(Alvo, "velho"), [] { LockFile(Alvo); }, {existe, Erro}, "velho"},
+  };
+  for (const auto& caso : casos) {
+    SCOPED_TRACE(caso.Nome);
+    Preparar();
+    if (caso.Ditas.size() == 2) QueueAnswer(Answer::Yes);
+    Abrir([&](Form4& janela) {
+      Escolher(janela.List2, SemNome);
+      caso.Antes();
+      QueueEvent(caso.Durante);
+      Click(janela.Command1);
+      const bool tentado = caso.Ditas != Mensagens{DiscoCheio};
+      EXPECT_EQ(NadaEscolhido(janela), tentado);
+      EXPECT_EQ(janela.List1.FindExact(SemNome) >= 0, tentado && caso.NoDisquete);
+      EXPECT_EQ(janela.Caption(), "Salvamentos dos jogos");
+    });
+    EXPECT_EQ(ShownMessages(), caso.Ditas);
+    EXPECT_EQ(Content(Alvo), caso.NoDisquete);
+  }
+}
+
+// The save of the computer that is on both sides is copied over the floppy's one, or the floppy's one is deleted.
+TEST_F(Salvamentos, AreOldOrNewButWholeWhateverCallOfThePlatformFails) {
+  for (const bool copiar : {true, false}) {
+    int avisos = 0;
+    bool falhou = true;
+    for (int n = 1; falhou; ++n) {
+      SCOPED_TRACE(n);
+      Preparar();
+      std::vector<std::string> arquivos = AllFiles();
+      QueueAnswer(Answer::Yes);
+      Abrir([&](Form4& janela) {
+        Escolher(copiar ? janela.List2 : janela.List1, NosDois);
+        FailCall(n);
+        copiar ? Click(janela.Command1) : Click(janela.Image1);
+        falhou = CallFailed();
+        FailCall(0);
+        EXPECT_TRUE(janela.List1.Enabled());
+      });
+      const ShownMessage ultima = ShownMessages().empty() ? ShownMessage{} : ShownMessages().back();
+      const bool avisado = ultima == Erro || ultima == DiscoCheio;
+      const bool apagado = !copiar && !(falhou && n == 1);  // only the first call deletes
+      if (apagado) std::erase(arquivos, "A:\\DOIS.zst");
+      EXPECT_EQ(AllFiles(), arquivos) << "a temporary file is left, or a file is gone";
+      EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), Novo);
+      EXPECT_TRUE(apagado || Content("A:\\DOIS.zst") == (copiar && !avisado ? Novo : Velho));
+      avisos += avisado ? 1 : 0;
+    }
+    EXPECT_EQ(avisos > 0, copiar);
+  }
+}
+
+TEST_F(Salvamentos, AreShownAndDeletedInTheLanguageOfTheTranslation) {
+  ArquivoIdioma = "C:\\Tolvaris\\language.ini";
+  PutFile(
+      ArquivoIdioma,
+      "[TOLVARIS20]\r\nSalvamentos dos jogos=Saves\r\nExcluir=Delete\r\n Disquete =| Floppy |\r\n Computador =PC\r\n"
+      "&Fechar=&Close\r\nCopiar do computador para o disquete=To the floppy\r\nSEMNOME [State 2]=X\r\n"
+      "Deletar o salvamento do jogo '=|Delete '|\r\n' que está no Computador ?=|' here?|"_ansi);
+  QueueAnswer(Answer::Yes);
+  Abrir([](Form4& janela) {
+    Escolher(janela.List2, SemNome);
+    EXPECT_EQ(janela.Caption() + janela.Frame1.Caption() + janela.Frame2.Caption() + janela.Command2.Caption() +
+                  janela.Image1.ToolTip() + janela.Image2.ToolTip() + janela.Command1.ToolTip(),
+              "Saves Floppy PC&CloseDeleteDeleteTo the floppy");
+    for (int vez = 0; vez < 2; ++vez) PressKey(janela.List2, 46);
+    EXPECT_EQ(Textos(janela.List2), "Corrida 2 [State 0]|");
+  });
+  EXPECT_EQ(ShownMessages(), Mensagens{Deletar("Delete 'SEMNOME [State 2]' here?")});
+}
+
+}  // namespace

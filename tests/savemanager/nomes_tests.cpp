@@ -1,0 +1,50 @@
+#include <gtest/gtest.h>
+
+#include "catalog/cls_DAT.h"
+#include "platform/simulated/simulated.h"
+#include "platform/text.h"
+#include "savemanager/nomes.h"
+
+namespace {
+
+struct Nomes : testing::Test {
+  void SetUp() override {
+    platform::simulated::Reset();
+    DirPrograma = "C:\\Tolvaris\\";
+    platform::simulated::PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||A=Igual||B=Igual||ACAO=Ação|"_ansi);
+    Catalogo.Carregar();
+  }
+  cls_DAT Catalogo;
+};
+
+TEST_F(Nomes, AreInverseOnAllElevenExtensions) {
+  const std::string jogos[][2] = {{"UM", "Jogo Um"}, {"ACAO", "Ação"_ansi}, {"NADA", "NADA"}, {"A.B", "A.B"}, {"", ""}};
+  std::string padrao;
+  for (const std::string extensao : {"srm", "zst", "zs1", "zs2", "zs3", "zs4", "zs5", "zs6", "zs7", "zs8", "zs9"}) {
+    const char estado = extensao == "zst" ? '0' : extensao.back();
+    const std::string fim = extensao == "srm" ? "" : std::string(" [State ") + estado + "]";
+    for (const auto& [jogo, nome] : jogos) {
+      EXPECT_EQ(NomeExibido(jogo + "." + extensao, Catalogo), nome + fim);
+      EXPECT_EQ(NomeArquivo(nome + fim, Catalogo), jogo + "." + extensao);
+    }
+    padrao += (padrao.empty() ? "*." : ";*.") + extensao;
+  }
+  EXPECT_EQ(padrao, PadraoSalvamentos);
+}
+
+// A file, the text shown for it, and the file that the text stands for.
+TEST_F(Nomes, OfOddFilesAndTexts) {
+  const char* const casos[][3] = {
+      {"GAMES.ZST", "GAMES [State 0]", "GAMES.zst"},         {"GAME.SRM", "GAME", "GAME.srm"},
+      {"Jogo Um [State ", "Jogo Um [State ", "UM.zs"},       {"um.Zs9", "Jogo Um [State 9]", "UM.zs9"},
+      {"UM [state 3]", "UM [state 3]", "UM [state 3].srm"},  {"GAME.zs", "GAME", "GAME.srm"},
+      {"X [State 3].zs5", "X [State 3] [State 5]", "X.zs3"}, {"GAME.zsa", "GAME", "GAME.srm"},
+      {"SEM PONTO", "SEM PONTO", "SEM PONTO.srm"},           {"B.zs1", "Igual [State 1]", "A.zs1"},
+  };
+  for (const auto& [arquivo, texto, volta] : casos) {
+    EXPECT_EQ(NomeExibido(arquivo, Catalogo), texto);
+    EXPECT_EQ(NomeArquivo(texto, Catalogo), volta) << texto;
+  }
+}
+
+}  // namespace
