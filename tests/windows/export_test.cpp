@@ -35,7 +35,7 @@ TEST_F(ExportGame, OffersWhatAGameCanBeSavedAs) {
       {"Élan", {Package, Zip}, 0, Outside + "d", "Fora\\d.tvk"},
       {"Élan", {Package, Zip}, 1, Outside + "c", "Fora\\c.zip"},
       {"Zebra", {Smc}, 0, Outside + "e.zip", "Fora\\e.zip"},  // the type of the file is not asked
-      {"Élan", {Package, Zip}, 0, "", "Élan.tvk"},
+      {"Élan", {Package, Zip}, 0, "", "Fora\\Élan.tvk"},      // where the dialog was last
   };
   Start();
   const Files before = Kept();

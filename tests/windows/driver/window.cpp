@@ -254,8 +254,9 @@ Message Answer(const Program& program, int button) {
     message.Buttons.push_back(id);
     if (id == button) pressed = child;
   }
+  if (!pressed) return {};
   pressed.Click();
-  return pressed && Eventually([&] { return !dialog.Visible(); }) ? message : Message{};
+  return Eventually([&] { return !dialog.Visible(); }) ? message : Message{};
 }
 
 }  // namespace driver

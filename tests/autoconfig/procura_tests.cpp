@@ -1,7 +1,6 @@
-#include "autoconfig/procura.h"
-
 #include <gtest/gtest.h>
 
+#include "autoconfig/procura.h"
 #include "platform/simulated/simulated.h"
 #include "support/mod_Globais.h"
 
@@ -10,14 +9,10 @@ namespace {
 using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
 using Textos = std::vector<std::string>;
 
-class Procurando : public testing::Test {
- protected:
-  Procurando() {
-    Reset();
-    DirPrograma = "C:\\Tolvaris\\";
-  }
+struct Procurando : testing::Test {
+  void SetUp() override { Reset(), DirPrograma = "C:\\Tolvaris\\"; }
 
-  static Textos Tudo(std::vector<Lugar> lugares) {
+  Textos Tudo(std::vector<Lugar> lugares) {
     Procura busca(std::move(lugares));
     Textos achados;
     for (passos = 0; !busca.Terminou() && passos < 100000; ++passos) {
@@ -27,7 +22,7 @@ class Procurando : public testing::Test {
     return achados;
   }
 
-  static inline int passos = 0;
+  int passos = 0;
 };
 
 TEST_F(Procurando, UsualPlacesInTheOrderOfTheirLikelihood) {
@@ -53,39 +48,28 @@ TEST_F(Procurando, UsualPlacesInTheOrderOfTheirLikelihood) {
   };
   for (const std::string& arquivo : emOrdem) PutFile(arquivo, "MZ");
   for (const char* longe : {"C:\\Tolvaris\\A\\A\\A\\A\\zsnesw.exe", "C:\\Arquivos de Programas\\a\\b\\c\\zsnes.exe",
-                            "C:\\Outro\\zsnesw.exe", "A:\\zsnes\\zsnesw.exe", "D:\\No caminho\\x\\zsnesw.exe"}) {
+                            "C:\\Outro\\zsnesw.exe", "A:\\zsnes\\zsnesw.exe", "D:\\No caminho\\x\\zsnesw.exe",
+                            "C:\\Tolvaris\\Escondido\\zsnesw.exe"}) {
     PutFile(longe, "MZ");
   }
+  SetAttributes("C:\\Tolvaris\\Escondido", 0x12);
   PutFile("C:\\Emu no caminho\\zsnesw.exe", "");    // damaged
   PutDirectory("C:\\Tolvaris\\zsnes\\zsnesw.exe");  // not a file
-  PutFile("C:\\Tolvaris\\Escondido\\zsnesw.exe", "MZ");
-  SetAttributes("C:\\Tolvaris\\Escondido", 0x12);
   EXPECT_EQ(Tudo(LugaresUsuais()), emOrdem);
 }
 
 TEST_F(Procurando, EndsInAForestWithoutEndAndReportsNothingTwice) {
-  for (int i = 0; i < 70; ++i) {
-    for (int j = 0; j < 70; ++j) PutDirectory("C:\\Z\\" + std::to_string(i) + "\\" + std::to_string(j));
-  }
+  for (int i = 0; i < 70 * 70; ++i) PutDirectory("C:\\Z\\" + std::to_string(i / 70) + "\\" + std::to_string(i % 70));
   PutFile("C:\\Z\\7\\zsnes.exe", "MZ");
-  PutFile("C:\\Depois\\zsnes.exe", "MZ");
-  const Textos esperados = {"C:\\Z\\7\\zsnes.exe", "C:\\Depois\\zsnes.exe"};
-  EXPECT_EQ(Tudo({{"C:\\Z\\", 50}, {"c:\\z\\7\\", 0}, {"C:\\Depois\\", 0}, {"C:\\depois\\", 3}}), esperados);
-  EXPECT_GT(passos, 1000);
-  EXPECT_LT(passos, 4000);
-  EXPECT_EQ(Tudo({{"Q:\\", 3}, {"C:\\Nada\\", 3}, {"C:\\Z\\7\\zsnes.exe\\", 3}}), Textos());
-}
-
-TEST_F(Procurando, LikelyNamesAreNotLeftOutAmongVeryMany) {
-  for (int i = 0; i < 3100; ++i) PutDirectory("C:\\P\\" + std::to_string(i));
-  PutFile("C:\\P\\Zsnes 1.42\\zsnes.exe", "MZ");
-  EXPECT_EQ(Tudo({{"C:\\P\\", 2}}), Textos{"C:\\P\\Zsnes 1.42\\zsnes.exe"});
-}
-
-// A place that is seen again with more levels is gone into as deep as that.
-TEST_F(Procurando, TheDeeperSearchCounts) {
   PutFile("C:\\P\\Q\\zsnes.exe", "MZ");
-  EXPECT_EQ(Tudo({{"C:\\P\\", 0}, {"C:\\", 2}}), Textos{"C:\\P\\Q\\zsnes.exe"});
+  const Textos esperados = {"C:\\Z\\7\\zsnes.exe", "C:\\P\\Q\\zsnes.exe"};
+  EXPECT_EQ(Tudo({{"C:\\Z\\", 50}, {"c:\\z\\7\\", 0}, {"C:\\P\\Q\\", 0}, {"C:\\p\\q\\", 3}}), esperados);
+  EXPECT_TRUE(passos > 1000 && passos < 4000) << passos;
+  EXPECT_EQ(Tudo({{"Q:\\", 3}, {"C:\\Nada\\", 3}, {"C:\\Z\\7\\zsnes.exe\\", 3}}), Textos());
+  EXPECT_EQ(Tudo({{"C:\\P\\", 0}, {"C:\\P\\", 1}}), Textos{esperados[1]}) << "seen again with more levels";
+  for (int i = 0; i < 3100; ++i) PutDirectory("C:\\R\\" + std::to_string(i));
+  PutFile("C:\\R\\Zsnes 1.42\\zsnes.exe", "MZ");
+  EXPECT_EQ(Tudo({{"C:\\R\\", 2}}), Textos{"C:\\R\\Zsnes 1.42\\zsnes.exe"}) << "likely names go before very many";
 }
 
 }  // namespace

@@ -1,0 +1,279 @@
+// The auto-configuration window, on a machine in memory with an emulator.
+#include <memory>
+
+#include "autoconfig/FormCfg.h"
+#include "platform/files.h"
+#include "platform/text.h"
+#include "support/mod_Configuracao.h"
+#include "support/mod_Globais.h"
+#include "tests/falhas.h"
+
+namespace {
+
+using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
+using platform::Answer;
+using Textos = std::vector<std::string>;
+
+const std::string Chave = ChaveConfiguracao;
+const std::string Emulador = "C:\\Tolvaris\\ZSNES\\zsnesw.exe", Configuracao = "C:\\Tolvaris\\ZSNES\\zsnesw.cfg";
+const Textos Nada(5, "-");
+const Textos Padroes = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
+
+class Janela : public testing::Test {
+ protected:
+  Janela() { Reset(), PutFile(Emulador, "MZ"); }
+
+  void Abrir() {
+    form = std::make_unique<FormCfg>();
+    form->Form_Load();
+    form->Show();
+  }
+
+  void AbrirEProcurar() { Abrir(), Tick(form->Timer1); }
+
+  void Gravar() { Click(form->Command1); }
+
+  void Outro(const std::string& caminho) { QueueFileDialog(caminho), Click(form->Command3); }
+
+  // RomDir, SaveDir, ImgDir, EmuExe and EmuCFG as they are stored; "-": not set.
+  static Textos Gravados() {
+    Textos textos;
+    for (const NomeDeAjuste& cada : NomesDosAjustes) textos.push_back(StoredText(Chave, cada.Nome).value_or("-"));
+    return textos;
+  }
+
+  // The messages shown since the last call, as "title: text".
+  static Textos Mensagens() {
+    Textos textos;
+    for (const ShownMessage& cada : ShownMessages()) textos.push_back(cada.Title + ": " + cada.Text);
+    ForgetMessages();
+    return textos;
+  }
+
+  std::unique_ptr<FormCfg> form;
+};
+
+TEST_F(Janela, ShowsWhatItFoundAndWritesIt) {
+  Abrir();
+  EXPECT_EQ(form->Label2.Caption(), "");
+  EXPECT_FALSE(form->Command1.Enabled()) << "there is nothing to save yet";
+  Tick(form->Timer1);
+  EXPECT_FALSE(form->Timer1.Enabled());
+  EXPECT_EQ(form->Label2.Caption(), "Busca concluída."_ansi);
+  EXPECT_TRUE(form->List1.Count() == 1 && form->List1.Text(0) == Emulador);
+  const Textos mostrados = {Emulador, Configuracao, "C:\\Tolvaris\\Roms\\", "C:\\Tolvaris\\Saves\\",
+                            "C:\\Tolvaris\\Imgs\\"};
+  for (std::size_t i = 0; i < 5; ++i) EXPECT_EQ(form->Label4[i].Caption(), mostrados[i]);
+  DenyKey(Chave);
+  Gravar();
+  EXPECT_EQ(Mensagens(), Textos{"Erro: Não foi possível gravar a configuração."_ansi});
+  DenyKey(Chave, false);
+  EXPECT_EQ(Gravados(), Nada);
+  EXPECT_FALSE(form->IsClosed());
+  Gravar();
+  EXPECT_EQ(Gravados(), Padroes);
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_EQ(Mensagens(), Textos());
+  LerCaminhos({});
+  EXPECT_EQ(ArquivoEmulador, Emulador) << "as start-up reads it";
+}
+
+TEST_F(Janela, CancelWritesNothingEvenInTheMiddleOfTheSearch) {
+  for (int i = 0; i < 200; ++i) PutDirectory("C:\\Tolvaris\\" + std::to_string(i));
+  PutFile("C:\\Tolvaris\\ZZ\\zsnes.exe", "MZ");
+  Abrir();
+  QueueEvent([this] {
+    EXPECT_EQ(form->Label2.Caption(), "Procurando...");
+    QueueEvent([this] { Click(form->Command2); });
+  });
+  Tick(form->Timer1);
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_LT(PendingEventRuns(), 10) << "the search has ended at once";
+  AbrirEProcurar();
+  EXPECT_EQ(form->List1.Count(), 2);
+  CloseWindow(*form);
+  EXPECT_EQ(Gravados(), Nada);
+  EXPECT_EQ(WritesEver(), 0U);
+}
+
+TEST_F(Janela, KeysAndClicksOfTheList) {
+  PutFile("C:\\Tolvaris\\ZZZ\\zsnes.exe", "MZ");
+  AbrirEProcurar();
+  PressKey(form->List1, 40);
+  EXPECT_EQ(form->Label4[1].Caption(), "C:\\Tolvaris\\ZZZ\\zsnes.cfg");
+  PressKey(form->List1, 13);
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_EQ(Gravados()[3] + Gravados()[4], "\\ZZZ\\zsnes.exe\\ZZZ\\zsnes.cfg");
+  AbrirEProcurar();
+  EXPECT_EQ(form->List1.Text(0), "C:\\Tolvaris\\ZZZ\\zsnes.exe") << "the one that is set comes first";
+  Choose(form->List1, 1);
+  DoubleClick(form->List1);
+  EXPECT_EQ(Gravados(), Padroes);
+}
+
+TEST_F(Janela, WhatIsSetStaysUnlessThePersonChangesIt) {
+  const std::string meu = "D:\\Meu Emulador\\zsnes.exe", cfg = "D:\\Meu Emulador\\zsnes.cfg";
+  const Textos tudo = {"D:\\Jogos\\", "\\Salvos\\", "-", meu, "-"}, soCfg = {"-", "-", "-", "", "D:\\meu.cfg"};
+  const std::tuple<Textos, std::vector<int>, Textos> casos[] = {
+      // what is set, what is chosen in the list, and what is set afterwards
+      {tudo, {}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", meu, cfg}},
+      {tudo, {1, 0}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", meu, cfg}},
+      {tudo, {1}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", Padroes[3], Padroes[4]}},
+      {soCfg, {}, {"\\Roms\\", "\\Saves\\", "\\Imgs\\", Padroes[3], "D:\\meu.cfg"}},
+      {soCfg, {1}, {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnes.exe", "\\ZSNES\\zsnes.cfg"}},
+  };
+  for (const auto& [antes, escolhidos, depois] : casos) {
+    Reset();
+    AddDisk('D', 1 << 20);
+    for (const std::string& arquivo : {meu, Emulador, std::string("C:\\Tolvaris\\ZSNES\\zsnes.exe")})
+      PutFile(arquivo, "MZ");
+    for (std::size_t i = 0; i < antes.size(); ++i) {
+      if (antes[i] != "-") PutText(Chave, NomesDosAjustes[i].Nome, antes[i]);
+    }
+    AbrirEProcurar();
+    EXPECT_EQ(form->List1.Selected(), 0);
+    for (const int indice : escolhidos) Choose(form->List1, indice);
+    Gravar();
+    EXPECT_EQ(Gravados(), depois);
+    EXPECT_EQ(Mensagens(), Textos());
+  }
+}
+
+TEST_F(Janela, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
+  const std::tuple<bool, std::string, std::string, std::string, std::string> casos[] = {
+      // short names, the program's directory, the emulator; and how it and its configuration file are set
+      {true, "C:\\Tolvaris", "C:\\tolvaris\\zsnesw.exe", "\\zsnesw.exe", "\\zsnesw.cfg"},
+      {true, "C:\\Tolvaris", "C:\\Tolvaris\\Meu Emu\\zsnes.exe", "\\MEUEMU~1\\zsnes.exe", "\\Meu Emu\\zsnes.cfg"},
+      {true, "C:\\Tolvaris da", "C:\\Tolvaris da\\Z\\zsnesw.exe", "C:\\TOLVAR~1\\Z\\zsnesw.exe", "\\Z\\zsnesw.cfg"},
+      {true, "C:\\TolvarisX", "C:\\TolvarisX\\Meu Emu\\zsnesw.exe", "\\MEUEMU~1\\zsnesw.exe", "\\Meu Emu\\zsnesw.cfg"},
+      {true, "C:\\Tolvaris", "C:\\Tolvaris 2\\zsnesw.exe", "C:\\TOLVAR~1\\zsnesw.exe", "C:\\Tolvaris 2\\zsnesw.cfg"},
+      {true, "C:\\Tolvaris", "C:\\Comprido9\\ZSNESW15.exe", "C:\\Comprido9\\ZSNESW15.exe", "C:\\Comprido9\\zsnesw.cfg"},
+      {true, "C:\\", "C:\\Emu\\outro.exe", "\\Emu\\outro.exe", "\\Emu\\zsnesw.cfg"},
+      {false, "C:\\Tolvaris", "C:\\Meu Emu\\zsnes.exe", "C:\\Meu Emu\\zsnes.exe", "C:\\Meu Emu\\zsnes.cfg"},
+      {false, "C:\\Meu Tolvaris", "C:\\Meu Tolvaris\\Z\\zsnes.exe", "\\Z\\zsnes.exe", "\\Z\\zsnes.cfg"},
+  };
+  const std::string aviso =
+      "Informação: O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\n"
+      "Se os jogos não abrirem, mude o emulador para um diretório sem espaços.\r\n\r\n"_ansi;
+  for (const auto& [curtos, programa, arquivo, gravado, configuracao] : casos) {
+    Reset();
+    if (!curtos) KeepNoShortNames();
+    SetProgramDirectory(programa);
+    PutFile(arquivo, "MZ");
+    Abrir();
+    Outro(arquivo);
+    Gravar();
+    EXPECT_EQ(Gravados(), (Textos{"\\Roms\\", "\\Saves\\", "\\Imgs\\", gravado, configuracao})) << arquivo;
+    EXPECT_EQ(Mensagens(), curtos ? Textos() : Textos{aviso + arquivo});
+  }
+  PutFile("C:\\E\\zsnes.cfg", "x");
+  EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";
+}
+
+TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused) {
+  const std::string longo = "C:\\" + std::string(120, 'a') + "\\" + std::string(121, 'b') + "\\";
+  PutFile("C:\\Outro\\zsnes.exe", "MZ");
+  PutFile("C:\\Outro\\vazio.exe", "");
+  PutFile(longo + "z.exe", "MZ");
+  AbrirEProcurar();
+  Outro("");  // cancelled
+  EXPECT_EQ(form->List1.Count(), 1);
+  Outro("C:\\Outro\\zsnes.exe");
+  EXPECT_EQ(form->Label4[0].Caption(), "C:\\Outro\\zsnes.exe");
+  Outro("C:\\TOLVARIS\\zsnes\\ZSNESW.EXE");  // in the list already
+  EXPECT_EQ(form->List1.Count(), 2);
+  EXPECT_EQ(form->Label4[0].Caption(), Emulador);
+  EXPECT_EQ(ShownFileDialogs().back().InitialDirectory, "C:\\Outro\\");
+  const std::pair<std::string, std::string> recusados[] = {
+      {"C:\\Outro\\vazio.exe", "Erro: O emulador ZSnes não foi encontrado."_ansi},
+      {longo + "z.exe",
+       "Erro: O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi + longo + "zsnesw.cfg"},
+  };
+  for (const auto& [arquivo, mensagem] : recusados) {
+    Outro(arquivo);
+    Gravar();
+    EXPECT_EQ(Mensagens(), Textos{mensagem});
+    EXPECT_EQ(Gravados(), Nada);
+    EXPECT_FALSE(form->IsClosed());
+  }
+  EXPECT_EQ(Impedimento(std::string(254, 'x')) + Impedimento("\\Roms\\"), "");
+  EXPECT_NE(Impedimento(std::string(255, 'x')), "");
+  EXPECT_NE(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), "") << "read as relative to the program's directory";
+}
+
+TEST_F(Janela, NothingFoundIsSaidAndNothingCanBeSaved) {
+  RemoveFile(Emulador);
+  AbrirEProcurar();
+  EXPECT_EQ(form->Label2.Caption(), "Nenhum emulador foi encontrado. Clique em 'Procurar outro...'.");
+  EXPECT_FALSE(form->Command1.Enabled());
+  PressKey(form->List1, 13);
+  EXPECT_EQ(Gravados(), Nada);
+  EXPECT_FALSE(form->IsClosed());
+}
+
+TEST_F(Janela, EveryTextCanBeTranslated) {
+  PutFile("C:\\Tolvaris\\language.ini",
+          "[TOLVARIS20]\r\nConfiguração do Tolvaris=Setup\r\nEmuladores encontrados:=Found:\r\n"
+          "&Procurar outro...=&Other...\r\n Configuração =Settings\r\nEmulador:=Emulator:\r\nImagens:=Pictures:\r\n"
+          "&Gravar=&Save\r\n&Cancelar=&Cancel\r\nBusca concluída.=Done.\r\n"_ansi);
+  AbrirEProcurar();
+  EXPECT_EQ(form->Caption() + form->Label1.Caption() + form->Command3.Caption() + form->Frame1.Caption() +
+                form->Label3.front().Caption() + form->Label3.back().Caption() + form->Command1.Caption() +
+                form->Command2.Caption() + form->Label2.Caption(),
+            "SetupFound:&Other...SettingsEmulator:Pictures:&Save&CancelDone.");
+}
+
+// The emulator's configuration file in the newer form.
+const std::string Antes = "x=1\r\nROMPath=\"\"\r\nSRAMPath=\"\"\r\n";
+const std::string Depois = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPath=\"C:\\\\Tolvaris\\\\Saves\"\r\n";
+
+TEST_F(Janela, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
+  const std::string antiga = "SaveDirectory = C:\\S\r\n";
+  const std::tuple<std::string, Answer, std::string, bool> casos[] = {
+      // the file before, the answer to the question, the file afterwards, and whether the settings are written
+      {Antes, Answer::Cancel, Antes, false}, {Antes, Answer::No, Antes, true},   {Antes, Answer::Yes, Depois, true},
+      {Depois, Answer::Ok, Depois, true},    {antiga, Answer::Ok, antiga, true}, {"", Answer::Ok, "", true},
+  };
+  for (const auto& [antes, resposta, depois, grava] : casos) {
+    PutFile(Configuracao, antes);
+    AbrirEProcurar();
+    QueueAnswer(resposta);
+    Gravar();
+    ASSERT_EQ(ShownMessages().size(), antes == Antes ? 1U : 0U) << antes;
+    EXPECT_TRUE(antes != Antes || ShownMessages()[0].Text.find("disquete") != std::string::npos);
+    ForgetMessages();
+    EXPECT_EQ(Content(Configuracao), depois);
+    EXPECT_EQ(Gravados(), grava ? Padroes : Nada);
+    EXPECT_EQ(form->IsClosed(), grava);
+  }
+}
+
+// Whatever fails: the file is the old or the new one, whole, and what is not as it was asked for has been said.
+TEST_F(Janela, EveryFaultLeavesWholeFilesAndIsSaid) {
+  bool fechou = false;
+  std::size_t abertos = 0;
+  const auto preparar = [this] {
+    PutFile(Emulador, "MZ");
+    PutFile(Configuracao, Antes);
+    AbrirEProcurar();
+    QueueAnswer(Answer::Yes);
+  };
+  const auto operar = [&] {
+    Gravar();
+    fechou = form->IsClosed();
+    abertos = OpenFiles() + OpenRegistryHandles();
+    CutPower();
+  };
+  const auto conferir = [&] {
+    const std::string conteudo = Content(Configuracao).value_or("");
+    EXPECT_TRUE(conteudo == Antes || conteudo == Depois) << conteudo;
+    const Textos mensagens = Mensagens();
+    EXPECT_EQ(fechou, mensagens.empty() || !mensagens.back().starts_with("Erro: "));
+    const bool configurado = Gravados()[4] != "-";
+    EXPECT_TRUE(Gravados() == Padroes || !(configurado || fechou)) << "configured is only what is complete";
+    EXPECT_EQ(abertos, 0U);
+  };
+  EXPECT_GT(ComCadaFalha(preparar, operar, conferir), 20);
+}
+
+}  // namespace
