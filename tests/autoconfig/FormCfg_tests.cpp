@@ -11,16 +11,16 @@
 namespace {
 
 using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
+using namespace std::string_literals;
 using platform::Answer;
 using Textos = std::vector<std::string>;
 
-const std::string Chave = ChaveConfiguracao;
+const std::string Chave = ChaveConfiguracao, ParaDos = "C:\\Tolvaris\\ZSNES\\zsnes.exe";
 const std::string Emulador = "C:\\Tolvaris\\ZSNES\\zsnesw.exe", Configuracao = "C:\\Tolvaris\\ZSNES\\zsnesw.cfg";
 const Textos Nada(5, "-");
 const Textos Padroes = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
 
-class Janela : public testing::Test {
- protected:
+struct Janela : testing::Test {
   Janela() { Reset(), PutFile(Emulador, "MZ"); }
 
   void Abrir() {
@@ -28,9 +28,7 @@ class Janela : public testing::Test {
     form->Form_Load();
     form->Show();
   }
-
   void AbrirEProcurar() { Abrir(), Tick(form->Timer1); }
-
   void Gravar() { Click(form->Command1); }
 
   void Outro(const std::string& caminho) { QueueFileDialog(caminho), Click(form->Command3); }
@@ -54,16 +52,22 @@ class Janela : public testing::Test {
 };
 
 TEST_F(Janela, ShowsWhatItFoundAndWritesIt) {
-  Abrir();
-  EXPECT_EQ(form->Label2.Caption(), "");
-  EXPECT_FALSE(form->Command1.Enabled()) << "there is nothing to save yet";
-  Tick(form->Timer1);
+  RemoveFile(Emulador);
+  AbrirEProcurar();
+  EXPECT_EQ(form->Label2.Caption(), "Nenhum emulador foi encontrado. Clique em 'Procurar outro...'.");
+  EXPECT_FALSE(form->Command1.Enabled()) << "there is nothing to save";
+  PressKey(form->List1, 13);
+  EXPECT_EQ(Gravados(), Nada);
+  EXPECT_FALSE(form->IsClosed());
+  PutFile(Emulador, "MZ");
+  AbrirEProcurar();
   EXPECT_FALSE(form->Timer1.Enabled());
   EXPECT_EQ(form->Label2.Caption(), "Busca concluída."_ansi);
   EXPECT_TRUE(form->List1.Count() == 1 && form->List1.Text(0) == Emulador);
-  const Textos mostrados = {Emulador, Configuracao, "C:\\Tolvaris\\Roms\\", "C:\\Tolvaris\\Saves\\",
-                            "C:\\Tolvaris\\Imgs\\"};
-  for (std::size_t i = 0; i < 5; ++i) EXPECT_EQ(form->Label4[i].Caption(), mostrados[i]);
+  std::string mostrados;
+  for (const platform::Label& cada : form->Label4) mostrados += cada.Caption() + "|";
+  EXPECT_EQ(mostrados,
+            Emulador + "|" + Configuracao + "|C:\\Tolvaris\\Roms\\|C:\\Tolvaris\\Saves\\|C:\\Tolvaris\\Imgs\\|");
   DenyKey(Chave);
   Gravar();
   EXPECT_EQ(Mensagens(), Textos{"Erro: Não foi possível gravar a configuração."_ansi});
@@ -72,8 +76,7 @@ TEST_F(Janela, ShowsWhatItFoundAndWritesIt) {
   EXPECT_FALSE(form->IsClosed());
   Gravar();
   EXPECT_EQ(Gravados(), Padroes);
-  EXPECT_TRUE(form->IsClosed());
-  EXPECT_EQ(Mensagens(), Textos());
+  EXPECT_TRUE(form->IsClosed() && ShownMessages().empty());
   LerCaminhos({});
   EXPECT_EQ(ArquivoEmulador, Emulador) << "as start-up reads it";
 }
@@ -82,6 +85,7 @@ TEST_F(Janela, CancelWritesNothingEvenInTheMiddleOfTheSearch) {
   for (int i = 0; i < 200; ++i) PutDirectory("C:\\Tolvaris\\" + std::to_string(i));
   PutFile("C:\\Tolvaris\\ZZ\\zsnes.exe", "MZ");
   Abrir();
+  EXPECT_EQ(form->Label2.Caption(), "");
   QueueEvent([this] {
     EXPECT_EQ(form->Label2.Caption(), "Procurando...");
     QueueEvent([this] { Click(form->Command2); });
@@ -125,8 +129,7 @@ TEST_F(Janela, WhatIsSetStaysUnlessThePersonChangesIt) {
   for (const auto& [antes, escolhidos, depois] : casos) {
     Reset();
     AddDisk('D', 1 << 20);
-    for (const std::string& arquivo : {meu, Emulador, std::string("C:\\Tolvaris\\ZSNES\\zsnes.exe")})
-      PutFile(arquivo, "MZ");
+    for (const std::string& arquivo : {meu, Emulador, ParaDos}) PutFile(arquivo, "MZ");
     for (std::size_t i = 0; i < antes.size(); ++i) {
       if (antes[i] != "-") PutText(Chave, NomesDosAjustes[i].Nome, antes[i]);
     }
@@ -184,31 +187,18 @@ TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused)
   EXPECT_EQ(form->List1.Count(), 2);
   EXPECT_EQ(form->Label4[0].Caption(), Emulador);
   EXPECT_EQ(ShownFileDialogs().back().InitialDirectory, "C:\\Outro\\");
-  const std::pair<std::string, std::string> recusados[] = {
-      {"C:\\Outro\\vazio.exe", "Erro: O emulador ZSnes não foi encontrado."_ansi},
-      {longo + "z.exe",
-       "Erro: O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi + longo + "zsnesw.cfg"},
-  };
-  for (const auto& [arquivo, mensagem] : recusados) {
+  const std::string demais = "Erro: O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
+  for (const auto& [arquivo, mensagem] :
+       {std::pair("C:\\Outro\\vazio.exe"s, "Erro: O emulador ZSnes não foi encontrado."_ansi),
+        {longo + "z.exe", demais + longo + "zsnesw.cfg"}}) {
     Outro(arquivo);
     Gravar();
     EXPECT_EQ(Mensagens(), Textos{mensagem});
-    EXPECT_EQ(Gravados(), Nada);
-    EXPECT_FALSE(form->IsClosed());
+    EXPECT_TRUE(Gravados() == Nada && !form->IsClosed());
   }
   EXPECT_EQ(Impedimento(std::string(254, 'x')) + Impedimento("\\Roms\\"), "");
   EXPECT_NE(Impedimento(std::string(255, 'x')), "");
   EXPECT_NE(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), "") << "read as relative to the program's directory";
-}
-
-TEST_F(Janela, NothingFoundIsSaidAndNothingCanBeSaved) {
-  RemoveFile(Emulador);
-  AbrirEProcurar();
-  EXPECT_EQ(form->Label2.Caption(), "Nenhum emulador foi encontrado. Clique em 'Procurar outro...'.");
-  EXPECT_FALSE(form->Command1.Enabled());
-  PressKey(form->List1, 13);
-  EXPECT_EQ(Gravados(), Nada);
-  EXPECT_FALSE(form->IsClosed());
 }
 
 TEST_F(Janela, EveryTextCanBeTranslated) {
@@ -239,9 +229,9 @@ TEST_F(Janela, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
     AbrirEProcurar();
     QueueAnswer(resposta);
     Gravar();
-    ASSERT_EQ(ShownMessages().size(), antes == Antes ? 1U : 0U) << antes;
-    EXPECT_TRUE(antes != Antes || ShownMessages()[0].Text.find("disquete") != std::string::npos);
-    ForgetMessages();
+    const Textos ditas = Mensagens();
+    ASSERT_EQ(ditas.size(), antes == Antes ? 1U : 0U) << antes;
+    EXPECT_TRUE(ditas.empty() || ditas[0].find("disquete") != std::string::npos);
     EXPECT_EQ(Content(Configuracao), depois);
     EXPECT_EQ(Gravados(), grava ? Padroes : Nada);
     EXPECT_EQ(form->IsClosed(), grava);

@@ -28,29 +28,20 @@ struct Procurando : testing::Test {
 TEST_F(Procurando, UsualPlacesInTheOrderOfTheirLikelihood) {
   AddDisk('D', 1 << 20);
   AddDisk('A', 1 << 20);
-  SetEnvironment("programfiles", "C:\\Arquivos de Programas");
-  SetEnvironment("ProgramFiles(x86)", "C:\\Programas 32\\");
+  SetEnvironment("programfiles", "C:\\Prog");
+  SetEnvironment("ProgramFiles(x86)", "C:\\Prog 32\\");
   SetEnvironment("ProgramW6432", "E:");
   SetEnvironment("Path", ";\"D:\\No caminho\\\"; C:\\Emu no caminho ;\\\\servidor\\zsnes;A:\\zsnes;zsnes;");
-  const Textos emOrdem = {
-      "C:\\Tolvaris\\zsnesw.exe",
-      "C:\\Tolvaris\\zsnes.exe",
-      "C:\\Tolvaris\\B\\zsnes.exe",
-      "C:\\Tolvaris\\A\\A\\A\\zsnesw.exe",
-      "C:\\Arquivos de Programas\\Meu Emulador\\zsnesw.exe",
-      "C:\\Arquivos de Programas\\Jogos\\Outro\\zsnes.exe",
-      "C:\\Programas 32\\x\\zsnesw.exe",
-      "C:\\ZSNES 1.51\\zsnesw.exe",
-      "C:\\Emulador\\um\\dois\\zsnes.exe",
-      "D:\\Arquivos de Programas\\zsnesw.exe",
-      "D:\\zsnes\\zsnes.exe",
-      "D:\\No caminho\\zsnesw.exe",
-  };
+  Textos emOrdem = {"C:\\Tolvaris\\zsnesw.exe"};
+  for (const std::string perto :
+       {"C:\\Tolvaris\\", "C:\\Tolvaris\\B\\", "C:\\Tolvaris\\A\\A\\A\\", "C:\\Prog\\Meu Emu\\", "C:\\Prog\\Um\\Dois\\",
+        "C:\\Prog 32\\x\\", "C:\\ZSNES 1.51\\", "C:\\Emu\\1\\2\\", "D:\\Prog\\", "D:\\zsnes\\", "D:\\No caminho\\"}) {
+    emOrdem.push_back(perto + "zsnes.exe");
+  }
   for (const std::string& arquivo : emOrdem) PutFile(arquivo, "MZ");
-  for (const char* longe : {"C:\\Tolvaris\\A\\A\\A\\A\\zsnesw.exe", "C:\\Arquivos de Programas\\a\\b\\c\\zsnes.exe",
-                            "C:\\Outro\\zsnesw.exe", "A:\\zsnes\\zsnesw.exe", "D:\\No caminho\\x\\zsnesw.exe",
-                            "C:\\Tolvaris\\Escondido\\zsnesw.exe"}) {
-    PutFile(longe, "MZ");
+  for (const std::string longe : {"C:\\Tolvaris\\A\\A\\A\\A", "C:\\Prog\\a\\b\\c", "C:\\Outro", "A:\\zsnes",
+                                  "D:\\No caminho\\x", "C:\\Tolvaris\\Escondido"}) {
+    PutFile(longe + "\\zsnesw.exe", "MZ");
   }
   SetAttributes("C:\\Tolvaris\\Escondido", 0x12);
   PutFile("C:\\Emu no caminho\\zsnesw.exe", "");    // damaged

@@ -2,10 +2,10 @@
 // pieces of a package to be written and read back. scripts/fuzz builds and runs it.
 #include <algorithm>
 #include <array>
-#include <cstddef>
 #include <cstdint>
 #include <cstdlib>
 #include <functional>
+#include <iterator>
 #include <string>
 #include <string_view>
 
@@ -38,16 +38,15 @@ bool Dentro(std::string_view parte, std::string_view todo) {
 // Writes these pieces and reads them: what comes back is what was written, or is refused where it has to be.
 void EscreverELer(std::string_view nome, std::string_view dosName, std::string_view crc, std::string_view imagem,
                   std::string_view rom) {
-  const std::string conteudo = MontarPacote(nome, dosName, crc, static_cast<std::int64_t>(imagem.size()),
-                                            static_cast<std::int64_t>(rom.size()), imagem, rom);
+  const std::string conteudo = MontarPacote(nome, dosName, crc, std::ssize(imagem), std::ssize(rom), imagem, rom);
   const auto lido = LerPacote(conteudo);
   if (!Livre(nome) || !Livre(dosName) || !Livre(crc)) return;
   const bool cabe = conteudo.size() - imagem.size() - rom.size() <= MaiorCabecalho;
-  const bool inteiro = !imagem.empty() && !rom.empty();
-  Exigir(lido.has_value() == (cabe && inteiro && NomeDeArquivo(nome) && NomeDeArquivo(dosName)));
+  const bool inteiro = !imagem.empty() && !rom.empty() && NomeDeArquivo(nome) && NomeDeArquivo(dosName);
+  Exigir(lido.has_value() == (cabe && inteiro));
   if (!lido) return;
-  Exigir(lido->Nome == nome && lido->DOSName == dosName && lido->CRC == crc);
-  Exigir(lido->Imagem == imagem && lido->Rom == rom);
+  Exigir(lido->Nome == nome && lido->DOSName == dosName && lido->CRC == crc && lido->Imagem == imagem &&
+         lido->Rom == rom);
 }
 
 void LerComoPacote(std::string_view conteudo) {

@@ -242,18 +242,20 @@ void PrintTo(const Message& message, std::ostream* out) {
   for (const int button : message.Buttons) *out << ' ' << button;
 }
 
+Message ReadMessage(const Window& dialog) {
+  Message message{dialog.Text(), "", {}};
+  for (const Window& child : dialog.Children()) {
+    if (child.Class() == "Static" && !child.Text().empty()) message.Text = child.Text();
+    if (child.Class() == "Button" && child.Visible()) message.Buttons.push_back(GetDlgCtrlID(child.Handle()));
+  }
+  return message;
+}
+
 Message Answer(const Program& program, int button) {
   Window dialog;
   if (!Eventually([&] { return static_cast<bool>(dialog = FindMessage(program)); })) return {};
-  Message message{dialog.Text(), "", {}};
-  Window pressed;
-  for (const Window& child : dialog.Children()) {
-    const int id = GetDlgCtrlID(child.Handle());
-    if (child.Class() == "Static" && !child.Text().empty()) message.Text = child.Text();
-    if (child.Class() != "Button" || !child.Visible()) continue;
-    message.Buttons.push_back(id);
-    if (id == button) pressed = child;
-  }
+  const Message message = ReadMessage(dialog);
+  const Window pressed(GetDlgItem(dialog.Handle(), button));
   if (!pressed) return {};
   pressed.Click();
   return Eventually([&] { return !dialog.Visible(); }) ? message : Message{};

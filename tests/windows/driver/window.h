@@ -67,6 +67,8 @@ struct Message {
 };
 void PrintTo(const Message& message, std::ostream* out);
 
+Message ReadMessage(const Window& dialog);
+
 // Waits for a message of the program, presses one of its buttons, waits until it is gone, and tells what it showed.
 // Without a message, or without that button, everything of the result is empty.
 Message Answer(const Program& program, int button);

@@ -1,0 +1,59 @@
+#include <gtest/gtest.h>
+
+#include "controller/Form3.h"
+#include "platform/simulated/simulated.h"
+#include "platform/text.h"
+#include "support/mod_Globais.h"
+
+namespace {
+
+using namespace platform;
+using namespace platform::simulated;
+
+std::string Titulos(const Form3& janela) {
+  std::string titulos = janela.Caption() + "|" + janela.Command1.Caption();
+  for (const Label& label : janela.Label1) titulos += "|" + label.Caption();
+  return titulos;
+}
+
+// Opens a window: what it shows of both players, and that only its first tick reminds.
+void Usar(const std::string& primeiro, const std::string& segundo, void (*fechar)(Form3&)) {
+  QueueModal([&](Window& aberta) {
+    auto& janela = static_cast<Form3&>(aberta);
+    EXPECT_EQ(Titulos(janela), primeiro);
+    Choose(janela.Combo1, 1);
+    EXPECT_EQ(Titulos(janela), segundo);
+    janela.Combo1.Select(-1);
+    janela.MostrarTeclas();
+    EXPECT_EQ(Titulos(janela), segundo) << "nobody is chosen: nothing changes";
+    Choose(janela.Combo1, 0);
+    EXPECT_EQ(Titulos(janela), primeiro);
+    Choose(janela.Combo1, 2);
+    EXPECT_EQ(janela.Combo1.Selected(), 0) << "there is no third entry";
+    for (int vez = 0; vez < 2; ++vez) Tick(janela.Timer1);
+    fechar(janela);
+    EXPECT_TRUE(janela.IsClosed());
+  });
+  Form3::ABRIR();
+}
+
+TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
+  Reset();
+  ArquivoIdioma.clear();
+  const std::string segundas = "Home|Page Down|Delete|End|Shift d.|ENTER|U|J|I|K|O|L";
+  const std::string primeiras = "Seta direita|Seta esquerda|Seta baixo|Shift e.|CTRL e.|A|Z|S|X|D|C";
+  Usar("Controle|&Fechar|Seta cima|" + primeiras, "Controle|&Fechar|" + segundas,
+       [](Form3& janela) { Click(janela.Command1); });
+  Form3::Descarregar();  // nothing is open
+  ArquivoIdioma = "C:\\Tolvaris\\language.ini";
+  PutFile(ArquivoIdioma,
+          "[TOLVARIS20]\r\nControle=Pad\r\n&Fechar=&Close\r\nSeta cima=Up\r\nInformação=Note\r\n"
+          "Guarde os comandos do controle. Se necessário anote-os.=Learn them.\r\n"_ansi);
+  Usar("Pad|&Close|Up|" + primeiras, "Pad|&Close|" + segundas, [](Form3&) { Form3::Descarregar(); });
+  const std::string lembrete = "Guarde os comandos do controle. Se necessário anote-os."_ansi;
+  const std::vector<ShownMessage> lembretes = {{lembrete, "Informação"_ansi, Buttons::Ok, Icon::Information},
+                                               {"Learn them.", "Note", Buttons::Ok, Icon::Information}};
+  EXPECT_EQ(ShownMessages(), lembretes) << "also: both windows were opened";
+}
+
+}  // namespace
