@@ -2,6 +2,7 @@
 #include "mainwindow/Form1.h"
 #include "mainwindow/arquivos_de_jogos.h"
 #include "mainwindow/mensagens.h"
+#include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/events.h"
 #include "platform/text.h"
@@ -57,13 +58,22 @@ Desfecho SalvarCopia(const Jogo& Escolhido, const std::string& Destino) {
   return GravarInteiro(Destino, Conteudo) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
 }
 
+// The ROM is read once, to where the package has it, and the header is then put before the blocks: texts of many
+// megabytes cost more than reading the file.
 Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const std::string& Destino) {
-  const auto Soma = CRCDoArquivo(Escolhido.Arquivo);
-  if (!Soma) return Desfecho::ErroInesperado;
+  constexpr std::size_t Folga = 1024;  // a longer header costs a copy, no more
+  const std::int32_t TamanhoImagem = TamanhoArquivo(ArquivoImagem), TamanhoRom = TamanhoArquivo(Escolhido.Arquivo);
+  std::string Pacote;
+  Pacote.reserve(Folga + static_cast<std::size_t>(TamanhoImagem) + static_cast<std::size_t>(TamanhoRom));
+  AcrescentarArquivo(Pacote, ArquivoImagem);
+  const std::size_t InicioRom = Pacote.size();
+  AcrescentarArquivo(Pacote, Escolhido.Arquivo);
+  if (Pacote.size() - InicioRom != static_cast<std::size_t>(TamanhoRom)) return Desfecho::ErroInesperado;
   RunPendingEvents();
-  const std::string Pacote =
-      MontarPacote(Escolhido.Nome, Escolhido.DOSName, *Soma, TamanhoArquivo(ArquivoImagem),
-                   TamanhoArquivo(Escolhido.Arquivo), LerArquivo(ArquivoImagem), LerArquivo(Escolhido.Arquivo));
+  cls_CRC Medida;
+  const auto Soma = Medida.CRC(std::string_view(Pacote).substr(InicioRom));
+  if (!Soma) return Desfecho::ErroInesperado;
+  Pacote.insert(0, MontarPacote(Escolhido.Nome, Escolhido.DOSName, TextoCRC(*Soma), TamanhoImagem, TamanhoRom, {}, {}));
   RunPendingEvents();
   return GravarInteiro(Destino, Pacote) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
 }

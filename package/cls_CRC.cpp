@@ -11,9 +11,10 @@ namespace {
 
 constexpr std::int64_t Cheio = 1'048'576;  // bytes of a chunk
 
-// What is read at a time. The platform reads faster into memory that starts at the beginning of a page.
+// What is read at a time: the platform reads faster into memory that starts at the beginning of a page, and that the
+// processor still holds from the piece before.
 struct alignas(4096) Pedaco {
-  std::array<char, Cheio> Bytes;
+  std::array<char, Cheio / 4> Bytes;
 };
 
 }  // namespace
@@ -24,11 +25,13 @@ std::optional<std::int64_t> cls_CRC::CRC(platform::File& Filenr) {
   const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
   std::int64_t soma = 0;
   Registro = CRC32::Inicial;
-  for (std::int64_t posicao = 0; posicao < tamanho; posicao += Cheio) {
-    const std::int64_t parte = std::min(Cheio, tamanho - posicao);
+  for (std::int64_t posicao = 0; posicao < tamanho;) {
+    const std::int64_t parte = std::min<std::int64_t>(sizeof pedaco->Bytes, tamanho - posicao);
     const auto quantos = static_cast<std::size_t>(parte);
     if (Filenr.Read(posicao, pedaco->Bytes.data(), quantos) != parte) return std::nullopt;
-    soma += Acrescentar({pedaco->Bytes.data(), quantos});
+    const std::int32_t valor = Acrescentar({pedaco->Bytes.data(), quantos});
+    posicao += parte;
+    if (posicao % Cheio == 0 || posicao == tamanho) soma += valor;
   }
   return soma;
 }
@@ -43,7 +46,7 @@ std::optional<std::int64_t> cls_CRC::CRC(std::string_view Conteudo) {
   return soma;
 }
 
-// The register's value after the next chunk.
+// The register's value after the next bytes.
 std::int32_t cls_CRC::Acrescentar(std::string_view Bytes) {
   Registro = CRC32::Atualizar(Registro, Bytes);
   return static_cast<std::int32_t>(~Registro);

@@ -63,6 +63,16 @@ std::string LerArquivo(const std::string& Caminho, std::int32_t Inicio, std::int
   return texto;
 }
 
+void AcrescentarArquivo(std::string& Texto, const std::string& Caminho) {
+  platform::File arquivo(Caminho, platform::Access::Read);
+  const std::int64_t tamanho = arquivo.Size();
+  if (tamanho < 0 || tamanho > MaiorTamanho) return;
+  const std::size_t antes = Texto.size(), quantos = static_cast<std::size_t>(tamanho);
+  Texto.resize(antes + quantos);
+  const std::int64_t lidos = arquivo.Read(0, Texto.data() + antes, quantos);
+  Texto.resize(antes + static_cast<std::size_t>(std::max<std::int64_t>(lidos, 0)));
+}
+
 std::optional<std::string> LerInteiro(platform::File& Arquivo) { return LerAteFim(Arquivo, 0); }
 
 int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32_t Posicao, bool ApagarAntes) {

@@ -15,6 +15,9 @@ class File;
 // cannot be read to its end, or does not fit in a text.
 std::string LerArquivo(const std::string& Caminho, std::int32_t Inicio = 1, std::int32_t Tamanho = -1);
 
+// Puts all bytes of a file behind those of the text; none of a file that LerArquivo would give as empty.
+void AcrescentarArquivo(std::string& Texto, const std::string& Caminho);
+
 // All bytes of an open file; nothing when it cannot be read, or is longer than a 32-bit length can say.
 std::optional<std::string> LerInteiro(platform::File& Arquivo);
 

@@ -17,7 +17,7 @@ constexpr int Rounds = 101;
 constexpr std::size_t Length = (6 << 20) + 512;  // with the header that old copiers put before a ROM
 
 struct alignas(4096) Piece {
-  char Bytes[1 << 20];
+  char Bytes[1 << 18];
 };
 
 std::string Path() { return platform::ProgramDirectory() + "\\checksum_benchmark.smc"; }

@@ -41,7 +41,6 @@ TEST_F(Servicos, AProgramStartsWithItsPriorityInItsDirectory) {
       {"C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "C:\\Emu", 1, "C:\\Emu", 0x40},
       {"C:\\Emu 2\\emu.exe -x", "", 3, "C:\\Emu 2\\", 0x80},
       {"C:\\Emu\\emu.exe", "", 4, "C:\\Emu\\", 0x100},
-      {"C:\\Emu\\emu.exe", "", 0, "C:\\Emu\\", 0x20},
       {"C:\\Emu\\emu.exe", "", 5, "C:\\Emu\\", 0x20},
   };
   PutFile("C:\\Emu\\emu.exe", "MZ");

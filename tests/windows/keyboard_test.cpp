@@ -28,6 +28,10 @@ class Keyboard : public testing::Test {
     return line.substr(line.rfind('\\') + 1);
   }
 
+  bool Exists(const std::string& name) const {
+    return GetFileAttributesA((installation.Directory + name).c_str()) != INVALID_FILE_ATTRIBUTES;
+  }
+
   Installation installation;
 };
 
@@ -53,7 +57,7 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   EXPECT_SOON(main.List.Focused());
   PressKey('A');
   EXPECT_SOON_EQ(0, SelectedEntry(main.List));
-  driver::TypeText("é");
+  driver::TypeText("É");
   EXPECT_SOON_EQ(3, SelectedEntry(main.List));
   PressKey(VK_DOWN);
   EXPECT_SOON_EQ(4, SelectedEntry(main.List));
@@ -93,11 +97,13 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   EXPECT_EQ(AnswerWithKey(program, VK_RETURN).Text, "Arquivo salvo.");
   EXPECT_EQ(installation.Content("Novos\\copia.smc"), "jogo novo");
   EXPECT_SOON(main.List.Focused());
+  PressKey('N');
+  EXPECT_SOON(main.Pictures[4].Enabled());
   EXPECT_TRUE(TabTo(main.Pictures[4]));
   PressKey(VK_SPACE);
   EXPECT_EQ(AnswerWithKey(program, VK_RETURN).Title, "Confirmar deleção");
   EXPECT_SOON_EQ(size_t{5}, Entries(main.List).size());
-  EXPECT_EQ(installation.Content("Roms\\novo.smc"), "");
+  EXPECT_FALSE(Exists("Roms\\novo.smc"));
 
   EXPECT_SOON(main.List.Focused());
   driver::PressWith(VK_MENU, VK_F4);
@@ -106,7 +112,7 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
 
 TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   for (const char* file : {"Disquete\\AGUA.srm", "Disquete\\ZEBRA.srm", "Saves\\ELAN.srm"}) {
-    installation.Put(file, Bytes(static_cast<unsigned char>(file[10]), 3000));
+    installation.Put(file, std::string("bateria ") + file[9]);
   }
   const FloppyDisk disk(installation.Directory + "Disquete");
   const Program program(installation.CommandLine());
@@ -121,10 +127,17 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   EXPECT_SOON_EQ(FloppyOffered, manager.Offered());
   ExpectTabOrder({manager.Floppy.Delete, manager.Copy, manager.Computer.List, manager.Close, manager.Floppy.List});
 
+  // A button that loses the keyboard to the mouse looks as before.
+  const auto atRest = driver::Appearance(manager.Copy);
+  EXPECT_TRUE(TabTo(manager.Copy));
+  manager.Floppy.Delete.Click();
+  EXPECT_EQ(AnswerWithKey(program, VK_ESCAPE).Title, "Confirmar deleção");
+  EXPECT_SOON(driver::Appearance(manager.Copy) == atRest);
+
   EXPECT_TRUE(TabTo(manager.Copy));
   PressKey(VK_SPACE);
   EXPECT_SOON_EQ(size_t{2}, Entries(manager.Computer.List).size());
-  EXPECT_EQ(installation.Content("Saves\\ZEBRA.srm"), installation.Content("Disquete\\ZEBRA.srm"));
+  EXPECT_EQ(installation.Content("Saves\\ZEBRA.srm"), "bateria Z");
   EXPECT_SOON(manager.Floppy.List.Focused());
 
   EXPECT_TRUE(TabTo(manager.Computer.List));
@@ -138,15 +151,15 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   PressKey(VK_SPACE);
   EXPECT_EQ(AnswerWithKey(program, VK_RETURN).Title, "Confirmar deleção");
   EXPECT_SOON(manager.Computer.List.Focused());
-  EXPECT_EQ(installation.Content("Saves\\ZEBRA.srm"), "");
+  EXPECT_FALSE(Exists("Saves\\ZEBRA.srm"));
 
   EXPECT_TRUE(TabTo(manager.Floppy.List));
-  PressKey('A');
+  driver::TypeText("Á");
   EXPECT_SOON_EQ(FloppyOffered, manager.Offered());
   PressKey(VK_DELETE);
   EXPECT_EQ(AnswerWithKey(program, VK_RETURN).Title, "Confirmar deleção");
   EXPECT_SOON_EQ(std::vector<std::string>{"Zebra"}, Entries(manager.Floppy.List));
-  EXPECT_EQ(installation.Content("Disquete\\AGUA.srm"), "");
+  EXPECT_FALSE(Exists("Disquete\\AGUA.srm"));
 
   driver::PressWith(VK_MENU, 'F');
   EXPECT_SOON(!manager.Window);
@@ -172,6 +185,7 @@ TEST_F(Keyboard, ReadsAndClosesTheControllerHelp) {
     const Window players = help.ChildAt(120, 120);
     const Window upKey = help.ChildAt(2040, 1560);
     EXPECT_SOON(players.Focused());
+    EXPECT_EQ(driver::Choices(players), (std::vector<std::string>{"Jogador 1", "Jogador 2"}));
     PressKey(VK_DOWN);
     EXPECT_SOON_EQ(std::string("Home"), upKey.Text());
     PressKey(VK_UP);

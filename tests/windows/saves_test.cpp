@@ -86,6 +86,7 @@ TEST_F(Saves, AreListedAndCopiedBothWays) {
   const MainWindow main(program);
   Open(main);
   const SaveManager manager(program);
+  for (const char* text : {" Disquete ", " Computador ", "&Fechar"}) EXPECT_TRUE(manager.Window.Child(text)) << text;
   EXPECT_EQ(Entries(manager.Floppy.List), (Texts{"Água Viva", "Água Viva [State 0]", "MEUJOGO [State 2]"}));
   EXPECT_EQ(Entries(manager.Computer.List), (Texts{"Élan [State 0]", "Zebra", "Zebra [State 9]"}));
   EXPECT_EQ(manager.Offered(), NothingOffered);
