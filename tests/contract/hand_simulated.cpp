@@ -3,36 +3,22 @@
 
 namespace contract {
 
-namespace simulated = platform::simulated;
-
-Desk::Desk() { simulated::Reset(); }
-Desk::~Desk() { simulated::Reset(); }
-
-void Click(platform::Button& button) { simulated::Click(button); }
-void Click(platform::ImageButton& button) { simulated::Click(button); }
-void Click(platform::CheckBox& box) { simulated::Click(box); }
-void Choose(platform::ListBox& list, int index) { simulated::Choose(list, index); }
-void Choose(platform::ComboBox& box, int index) { simulated::Choose(box, index); }
-
-void DoubleClick(platform::ListBox& list, int index) {
-  simulated::Choose(list, index);
-  simulated::DoubleClick(list);
-}
-
-void PressKey(platform::ListBox& list, int keyCode) { simulated::PressKey(list, keyCode); }
-void UseCloseBox(platform::Window& window) { simulated::CloseWindow(window); }
+void Click(Button& button) { simulated::Click(button); }
+void Click(ImageButton& button) { simulated::Click(button); }
+void Click(CheckBox& box) { simulated::Click(box); }
+void Choose(ListBox& list, int index) { simulated::Choose(list, index); }
+void Choose(ComboBox& box, int index) { simulated::Choose(box, index); }
+void DoubleClick(ListBox& list, int index) { Choose(list, index), simulated::DoubleClick(list); }
+void PressKey(ListBox& list, int keyCode) { simulated::PressKey(list, keyCode); }
+void UseCloseBox(Window& window) { simulated::CloseWindow(window); }
 void QueueEvent(std::function<void()> event) { simulated::QueueEvent(std::move(event)); }
-
 void QueueModal(std::function<void()> script) {
-  simulated::QueueModal([script = std::move(script)](platform::Window&) { script(); });
+  simulated::QueueModal([script = std::move(script)](Window&) { script(); });
 }
 
-void QueueAnswer(platform::Answer answer) { simulated::QueueAnswer(answer); }
-
-bool WaitUntil(const std::function<bool()>& condition, std::initializer_list<platform::Timer*> timers) {
-  constexpr int most = 100;  // ticks
-  for (int i = 0; i < most && !condition(); ++i) {
-    for (platform::Timer* timer : timers) simulated::Tick(*timer);
+bool WaitUntil(const std::function<bool()>& condition, std::initializer_list<Timer*> timers) {
+  for (int ticks = 0; ticks < 100 && !condition(); ++ticks) {
+    for (Timer* timer : timers) simulated::Tick(*timer);
   }
   return condition();
 }

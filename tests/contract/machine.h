@@ -1,64 +1,52 @@
 // What the contract tests need of the machine and no platform header can do.
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <cstdint>
 #include <string>
 
+#include "platform/files.h"
+
 namespace contract {
 
-// A new directory, empty; gone with all that is in it, as are the files' attributes, at the end of its life.
-class FreshDirectory {
- public:
-  FreshDirectory();
-  ~FreshDirectory();
-  FreshDirectory(const FreshDirectory&) = delete;
-  FreshDirectory& operator=(const FreshDirectory&) = delete;
+using namespace platform;
+using std::string;
 
-  const std::string& Path() const { return path_; }  // with a backslash at its end
-  std::string operator/(const std::string& name) const { return path_ + name; }
+inline constexpr const char* Key = "Software\\Tolvaris test";  // below HKEY_CURRENT_USER; gone at a test's end
+inline const string Zero(1, '\0');                             // a path with one in it names nothing
 
- private:
-  std::string path_;
+// A test with the screen to itself and a new, empty directory, which is gone with all that is in it at the test's end.
+class Machine : public testing::Test {
+ protected:
+  Machine();
+  ~Machine() override;
+
+  const string here_;  // the directory, with a backslash at its end
 };
 
-// The path below HKEY_CURRENT_USER of a new key, empty; gone with all that is in it at the end of its life.
-class FreshKey {
- public:
-  FreshKey();
-  ~FreshKey();
-  FreshKey(const FreshKey&) = delete;
-  FreshKey& operator=(const FreshKey&) = delete;
+inline void Put(const string& path, std::string_view content = "") {
+  ASSERT_TRUE(File(path, Access::ReplaceContent).Write(0, content)) << path;
+}
 
-  const std::string& Path() const { return path_; }
+// What the file holds, or "(none)".
+inline string Content(const string& path) {
+  File file(path, Access::Read);
+  if (!file.IsOpen()) return "(none)";
+  string content(static_cast<std::size_t>(file.Size()), '?');
+  EXPECT_EQ(file.Read(0, content.data(), content.size()), file.Size());
+  return content;
+}
 
- private:
-  std::string path_;
-};
+void SetAttributes(const string& path, std::uint32_t attributes);
+void SetEnvironment(const string& name, const string& value);  // of this program, until its end
 
-// Of this program, until its end.
-void SetEnvironment(const std::string& name, const std::string& value);
+// Wine lets read-only files be replaced, and root also write to them; it starts every process with the normal priority.
+bool IsWine();
 
-void SetAttributes(const std::string& path, std::uint32_t attributes);
-
-// Where Wine differs from Windows, the tests ask Windows and the twin only:
-bool ProtectsReadOnlyFiles();  // Wine lets them be replaced, and root also write to them
-bool StartsWithPriority();     // Wine starts every process with the normal priority
-
-// A program that runs until it is told to end, and then writes the file "here.txt" in the directory it works in: the
-// number of its priority class, a blank, and its whole command line.
-class StandIn {
- public:
-  StandIn();
-  ~StandIn();
-  StandIn(const StandIn&) = delete;
-  StandIn& operator=(const StandIn&) = delete;
-
-  const std::string& CommandLine() const { return commandLine_; }  // what starts it; arguments may be added
-  void TellToEnd();
-
- private:
-  std::string commandLine_;
-  std::intptr_t signal_ = 0;
-};
+// The command line, to which arguments may be added, of a program that runs until it is told to end, and then writes
+// the file "here.txt" in the directory it works in: the number of its priority class, a blank, its whole command line.
+string StandIn();
+void TellStandInToEnd();
 
 }  // namespace contract

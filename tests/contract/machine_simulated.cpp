@@ -3,43 +3,28 @@
 
 namespace contract {
 
-namespace simulated = platform::simulated;
-
-FreshDirectory::FreshDirectory() : path_("C:\\Pasta de teste\\") {
+Machine::Machine() : here_("C:\\Pasta de teste\\") {
   simulated::Reset();
-  simulated::PutDirectory(path_);
+  simulated::PutDirectory(here_);
 }
 
-FreshDirectory::~FreshDirectory() { simulated::Reset(); }
+Machine::~Machine() { simulated::Reset(); }
 
-FreshKey::FreshKey() : path_("Software\\Contrato") {
-  simulated::Reset();
-  simulated::PutValue(path_, "", 1, {});  // makes the key; the value without a name is not looked at
-}
-
-FreshKey::~FreshKey() { simulated::Reset(); }
-
-void SetAttributes(const std::string& path, std::uint32_t attributes) { simulated::SetAttributes(path, attributes); }
-
-void SetEnvironment(const std::string& name, const std::string& value) { simulated::SetEnvironment(name, value); }
-
-bool ProtectsReadOnlyFiles() { return true; }
-
-bool StartsWithPriority() { return true; }
+void SetAttributes(const string& path, std::uint32_t attributes) { simulated::SetAttributes(path, attributes); }
+void SetEnvironment(const string& name, const string& value) { simulated::SetEnvironment(name, value); }
+bool IsWine() { return false; }
 
 // Ends when it is waited for the second time: the first wait finds it running.
-StandIn::StandIn() : commandLine_("C:\\Substituto.exe") {
-  simulated::PutFile(commandLine_, "program");
-  simulated::OnProcess(commandLine_, 2, [] {
-    const simulated::StartedProcess& process = simulated::StartedProcesses().back();
-    const bool slash = process.Directory.ends_with('\\');
-    simulated::PutFile(process.Directory + (slash ? "" : "\\") + "here.txt",
-                       std::to_string(process.CreationFlags) + " " + process.CommandLine);
+string StandIn() {
+  const string program = "C:\\Substituto.exe";
+  simulated::PutFile(program, "program");
+  simulated::OnProcess(program, 2, [] {
+    const auto& [commandLine, directory, flags] = simulated::StartedProcesses().back();
+    simulated::PutFile(directory + "\\here.txt", std::to_string(flags) + " " + commandLine);
   });
+  return program;
 }
 
-StandIn::~StandIn() = default;
-
-void StandIn::TellToEnd() {}
+void TellStandInToEnd() {}
 
 }  // namespace contract

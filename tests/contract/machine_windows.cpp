@@ -1,103 +1,72 @@
 #include <windows.h>
 
+// After it, as it needs its types.
+#include <shellapi.h>
+
 #include <cstdlib>
 
-#include "platform/files.h"
 #include "tests/contract/machine.h"
 
 namespace contract {
 namespace {
 
-constexpr DWORD Limit = 60'000;  // milliseconds that a stand-in which nobody tells to end lives on
-
-bool IsWine() { return ::GetProcAddress(::GetModuleHandleA("ntdll.dll"), "wine_get_version") != nullptr; }
-
-std::string OwnFile() {
-  char path[MAX_PATH] = "";
-  ::GetModuleFileNameA(nullptr, path, MAX_PATH);
-  return path;
-}
+constexpr DWORD Limit = 60'000;  // milliseconds that a stand-in lives on, and that a test waits for its turn
 
 // The stand-in is this very test program. Its first argument is an inherited event, as a number.
 bool PlayStandIn() {
-  const std::string commandLine = ::GetCommandLineA();
-  const std::string mark = " --stand-in=";
+  const string commandLine = ::GetCommandLineA(), mark = " --stand-in=";
   const std::size_t place = commandLine.find(mark);
-  if (place == std::string::npos) return false;
+  if (place == string::npos) return false;
   const auto event = std::strtoull(commandLine.c_str() + place + mark.size(), nullptr, 10);
   if (::WaitForSingleObject(reinterpret_cast<HANDLE>(event), Limit) != WAIT_OBJECT_0) ::ExitProcess(1);
-  platform::File("here.txt", platform::Access::ReplaceContent)
-      .Write(0, std::to_string(::GetPriorityClass(::GetCurrentProcess())) + " " + commandLine);
+  Put("here.txt", std::to_string(::GetPriorityClass(::GetCurrentProcess())) + " " + commandLine);
   ::ExitProcess(0);
 }
 const bool standIn = PlayStandIn();  // before any test
 
-void RemoveContents(const std::string& directory) {
-  WIN32_FIND_DATAA data;
-  const HANDLE find = ::FindFirstFileA((directory + "*").c_str(), &data);
-  for (BOOL more = find != INVALID_HANDLE_VALUE; more; more = ::FindNextFileA(find, &data)) {
-    const std::string name = data.cFileName, path = directory + name;
-    if (name == "." || name == "..") continue;
-    ::SetFileAttributesA(path.c_str(), FILE_ATTRIBUTE_NORMAL);
-    if (data.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) {
-      RemoveContents(path + "\\");
-      ::RemoveDirectoryA(path.c_str());
-    } else {
-      ::DeleteFileA(path.c_str());
-    }
-  }
-  if (find != INVALID_HANDLE_VALUE) ::FindClose(find);
+SECURITY_ATTRIBUTES inherited{sizeof inherited, nullptr, TRUE};
+const HANDLE endSignal = ::CreateEventA(&inherited, TRUE, FALSE, nullptr);
+
+// One test program at a time has the screen: another would take the keyboard away.
+const HANDLE turn = ::CreateMutexA(nullptr, FALSE, "Tolvaris contract tests");
+
+string MakeDirectory() {
+  char temporary[MAX_PATH] = "", path[MAX_PATH] = "";
+  ::GetTempPathA(MAX_PATH, temporary);
+  ::GetLongPathNameA(temporary, path, MAX_PATH);
+  ::lstrcatA(path, ("tolvaris-" + std::to_string(::GetCurrentProcessId())).c_str());
+  ::CreateDirectoryA(path, nullptr);
+  return path + string("\\");
 }
 
 }  // namespace
 
-FreshDirectory::FreshDirectory() {
-  static int made = 0;
-  char temporary[MAX_PATH] = "", longForm[MAX_PATH] = "";
-  ::GetTempPathA(MAX_PATH, temporary);
-  ::GetLongPathNameA(temporary, longForm, MAX_PATH);
-  path_ = longForm + ("tolvaris-" + std::to_string(::GetCurrentProcessId()) + "-" + std::to_string(++made));
-  ::CreateDirectoryA(path_.c_str(), nullptr);
-  path_ += "\\";
+Machine::Machine() : here_(MakeDirectory()) {
+  ::WaitForSingleObject(turn, Limit);
+  ::RegDeleteTreeA(HKEY_CURRENT_USER, Key);  // of a run that was ended
 }
 
-FreshDirectory::~FreshDirectory() {
-  RemoveContents(path_);
-  ::RemoveDirectoryA(path_.c_str());
+Machine::~Machine() {
+  TellStandInToEnd();
+  ::RegDeleteTreeA(HKEY_CURRENT_USER, Key);
+  ::ReleaseMutex(turn);
+  const string paths = here_.substr(0, here_.size() - 1) + Zero;  // a list that ends with an empty path
+  constexpr FILEOP_FLAGS silently = FOF_SILENT | FOF_NOCONFIRMATION | FOF_NOERRORUI;
+  SHFILEOPSTRUCTA removal{nullptr, FO_DELETE, paths.c_str(), nullptr, silently, FALSE, nullptr, nullptr};
+  EXPECT_EQ(::SHFileOperationA(&removal), 0) << here_;
 }
 
-FreshKey::FreshKey() : path_("Software\\Tolvaris test " + std::to_string(::GetCurrentProcessId())) {
-  ::RegDeleteTreeA(HKEY_CURRENT_USER, path_.c_str());
-  HKEY key = nullptr;
-  ::RegCreateKeyA(HKEY_CURRENT_USER, path_.c_str(), &key);
-  ::RegCloseKey(key);
+void SetAttributes(const string& path, std::uint32_t attributes) { ::SetFileAttributesA(path.c_str(), attributes); }
+void SetEnvironment(const string& name, const string& value) { ::SetEnvironmentVariableA(name.c_str(), value.c_str()); }
+bool IsWine() { return ::GetProcAddress(::GetModuleHandleA("ntdll.dll"), "wine_get_version") != nullptr; }
+
+string StandIn() {
+  char program[MAX_PATH] = "";
+  ::GetModuleFileNameA(nullptr, program, MAX_PATH);
+  ::ResetEvent(endSignal);
+  return program + (" --stand-in=" + std::to_string(reinterpret_cast<std::uintptr_t>(endSignal)));
 }
 
-FreshKey::~FreshKey() { ::RegDeleteTreeA(HKEY_CURRENT_USER, path_.c_str()); }
-
-void SetAttributes(const std::string& path, std::uint32_t attributes) {
-  ::SetFileAttributesA(path.c_str(), attributes);
-}
-
-bool ProtectsReadOnlyFiles() { return !IsWine(); }
-
-bool StartsWithPriority() { return !IsWine(); }
-
-void SetEnvironment(const std::string& name, const std::string& value) {
-  ::SetEnvironmentVariableA(name.c_str(), value.c_str());
-}
-
-StandIn::StandIn() {
-  SECURITY_ATTRIBUTES inherited{sizeof inherited, nullptr, TRUE};
-  signal_ = reinterpret_cast<std::intptr_t>(::CreateEventA(&inherited, TRUE, FALSE, nullptr));
-  commandLine_ = OwnFile() + " --stand-in=" + std::to_string(signal_);
-}
-
-StandIn::~StandIn() {
-  TellToEnd();
-  ::CloseHandle(reinterpret_cast<HANDLE>(signal_));
-}
-
-void StandIn::TellToEnd() { ::SetEvent(reinterpret_cast<HANDLE>(signal_)); }
+void TellStandInToEnd() { ::SetEvent(endSignal); }
 
 }  // namespace contract

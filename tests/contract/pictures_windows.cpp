@@ -1,169 +1,101 @@
 // The pixels of decoded pictures.
-#include <gtest/gtest.h>
-
-#include <map>
+#include <algorithm>
 #include <random>
-#include <string>
 #include <vector>
 
-#include "platform/pictures.h"
 #include "platform/windows/drawing.h"
 #include "platform/windows/whole_file.h"
+#include "tests/contract/machine.h"
 #include "tests/contract/small_pictures.h"
 
-namespace contract {
 namespace {
 
-using platform::LoadPicture;
+using namespace contract;
+
 using Colours = std::vector<std::uint32_t>;
 
-constexpr std::uint32_t White = 0xFFFFFF, Blue = 0x0000FF;
-
-Colours ColoursOf(const std::string& content) {
-  const platform::Picture picture = LoadPicture(content);
+Colours ColoursOf(const string& content) {
+  const Picture picture = LoadPicture(content);
   return picture ? picture.Data()->Image.Colours : Colours();
 }
 
 TEST(PicturePixels, SmallPicturesAreDecodedOverWhite) {
-  EXPECT_EQ(ColoursOf(SmallGif()), (Colours{White, Blue, Blue, White}));
+  EXPECT_EQ(ColoursOf(SmallGif()), (Colours{0xFFFFFF, 0x0000FF, 0x0000FF, 0xFFFFFF}));
   EXPECT_EQ(ColoursOf(SmallBmp()), Colours(3, 0x404040));
   EXPECT_EQ(ColoursOf(SmallJpeg()), Colours(64, 0x808080));
 }
 
 // Windows' decoders show the beginning of such files; Wine's refuse them, so that only this tells.
 TEST(PicturePixels, TruncationIsSeenBeforeDecoding) {
-  const std::string bmp = SmallBmp(), jpeg = SmallJpeg();
-  std::string runs = bmp;  // run-length coded: the header says how many bytes
-  runs[30] = 1;
-  runs[34] = 5;
-  EXPECT_TRUE(platform::BmpIsWhole(bmp));
-  EXPECT_TRUE(platform::JpegIsWhole(jpeg));
-  EXPECT_FALSE(platform::BmpIsWhole(runs));
-  EXPECT_TRUE(platform::BmpIsWhole(runs + "+"));
-  for (std::size_t length = 2; length < bmp.size(); ++length) EXPECT_FALSE(platform::BmpIsWhole(bmp.substr(0, length)));
-  for (std::size_t length = 2; length < jpeg.size(); ++length) {
-    EXPECT_FALSE(platform::JpegIsWhole(jpeg.substr(0, length))) << length;
+  const string runs = SmallBmp().replace(30, 1, "\1").replace(34, 1, "\4");  // run-length coded: 4 bytes
+  const std::pair<string, bool (*)(std::string_view)> cases[] = {
+      {SmallBmp(), BmpIsWhole}, {runs, BmpIsWhole}, {SmallJpeg(), JpegIsWhole}};
+  for (const auto& [content, isWhole] : cases) {
+    EXPECT_TRUE(isWhole(content));
+    for (std::size_t length = 2; length < content.size(); ++length) EXPECT_FALSE(isWhole(content.substr(0, length)));
   }
 }
 
 TEST(PicturePixels, DamagedGifIsRefused) {
-  struct Case {
-    const char* Damage;
-    std::string Codes;
-  };
-  const Case cases[] = {
-      {"a code that is not given away yet", Bytes({0xC4, 0x02, 0x05})},  // 4, 0, 3: no colour 3
-      {"a first code that stands for nothing", Bytes({0x74, 0x02, 0x05})},
-      {"fewer pixels than the size says", Bytes({0x44, 0x0A})},
-      {"no codes", ""},
-  };
-  for (const Case& one : cases) EXPECT_FALSE(LoadPicture(SmallGif({2, 2}, one.Codes))) << one.Damage;
-  std::string noColours = SmallGif();
-  noColours[10] = 0;
-  EXPECT_FALSE(LoadPicture(noColours));
+  // A code that is not given away yet (4, 0, 3), a first code that stands for nothing, too few pixels, no codes.
+  for (const string& codes : {Bytes({0xC4, 2, 5}), Bytes({0x74, 2, 5}), Bytes({0x44, 0x0A}), string()}) {
+    EXPECT_FALSE(LoadPicture(SmallGif({2, 2}, codes)));
+  }
+  EXPECT_FALSE(LoadPicture(SmallGif().replace(10, 1, Zero))) << "without colours";
 }
 
-// Codes in the order of writing, each with its number of bits.
-class CodeWriter {
- public:
-  void Write(unsigned code, int bits) {
-    held_ |= code << count_;
-    for (count_ += bits; count_ >= 8; count_ -= 8, held_ >>= 8) bytes_ += static_cast<char>(held_ & 0xFF);
-  }
-  std::string Finish() {
-    if (count_ > 0) bytes_ += static_cast<char>(held_ & 0xFF);
-    return bytes_;
-  }
-
- private:
-  std::string bytes_;
-  unsigned held_ = 0;
-  int count_ = 0;
-};
-
-// The longest known string each time. The dictionary is given up when it is full, or, with `deferred`, kept.
-std::string Compress(const std::string& indices, int indexBits, bool deferred) {
-  const unsigned clear = 1U << indexBits;
-  std::map<std::string, unsigned> known;
-  unsigned next = 0;
-  int width = 0;
-  CodeWriter writer;
-  const auto restart = [&] {
-    known.clear();
-    for (unsigned i = 0; i < clear; ++i) known[std::string(1, static_cast<char>(i))] = i;
-    next = clear + 2;
-    width = indexBits + 1;
+// Codes that a decoder has to understand, and the indices that they stand for, in rows of this width. The dictionary
+// is given up now and then, or stays when it is full.
+string RandomCodes(unsigned seed, std::size_t colours, std::size_t width, string& indices) {
+  std::mt19937 random(seed);
+  std::vector<string> known;
+  string bytes, last;
+  std::size_t held = 0, count = 0, bits = 9;
+  const auto write = [&](std::size_t code) {
+    held |= code << count;
+    for (count += bits; count >= 8; count -= 8, held >>= 8) bytes += static_cast<char>(held & 0xFF);
   };
-  restart();
-  writer.Write(clear, width);
-  for (std::size_t at = 0; at < indices.size();) {
-    std::string longest(1, indices[at]);
-    while (at + longest.size() < indices.size() && known.contains(longest + indices[at + longest.size()])) {
-      longest += indices[at + longest.size()];
+  while (indices.size() < 30'000 || indices.size() % width != 0) {
+    if (known.empty() || random() % 6000 == 0) {
+      write(256);
+      known.assign(258, "");  // the last two have another meaning
+      for (std::size_t i = 0; i < colours; ++i) known[i] = static_cast<char>(i);
+      last.clear(), bits = 9;
     }
-    writer.Write(known[longest], width);
-    at += longest.size();
-    if (at == indices.size()) break;
-    if (next < 4096) {
-      known[longest + indices[at]] = next++;
-      if (next > 1U << width && width < 12) ++width;
-    } else if (!deferred) {
-      writer.Write(clear, width);
-      restart();
+    const bool grows = !last.empty() && known.size() < 4096;
+    const std::size_t code = random() % 3 == 0 ? random() % colours : random() % (known.size() + 1);
+    const string text = code < known.size() ? known[code] : grows ? last + last[0] : "";
+    if (text.empty()) continue;
+    write(code);
+    indices += text;
+    if (grows) known.push_back(last + text[0]);
+    if (known.size() >= std::size_t{1} << bits && bits < 12) ++bits;
+    last = text;
+  }
+  write(257);
+  return bytes + static_cast<char>(held);
+}
+
+TEST(PicturePixels, GifComesBackPixelForPixel) {
+  using Passes = std::vector<std::pair<std::size_t, std::size_t>>;  // first row and step
+  constexpr std::size_t width = 5;
+  for (unsigned seed = 1; seed <= 16; ++seed) {
+    string greys, indices, pieces;
+    for (int grey = 0; grey < 256; ++grey) greys += string(3, static_cast<char>(grey));
+    const string data = RandomCodes(seed, seed % 2 == 0 ? 256 : seed, width, indices);
+    for (std::size_t at = 0; at < data.size(); at += 255) {
+      pieces += Low(std::min<std::size_t>(255, data.size() - at), 1) + data.substr(at, 255);
     }
-  }
-  writer.Write(clear + 1, width);
-  return writer.Finish();
-}
-
-std::string InPieces(const std::string& data) {
-  std::string pieces;
-  for (std::size_t at = 0; at < data.size(); at += 255) {
-    const std::string piece = data.substr(at, 255);
-    pieces += Low(piece.size(), 1) + piece;
-  }
-  return pieces + '\0';
-}
-
-// The rows as an interlaced file stores them.
-std::string Interlaced(const std::string& indices, std::size_t width) {
-  constexpr struct { std::size_t First, Step; } passes[] = {{0, 8}, {4, 8}, {2, 4}, {1, 2}};
-  std::string stored;
-  for (const auto& [first, step] : passes) {
-    for (std::size_t row = first; row * width < indices.size(); row += step)
-      stored += indices.substr(row * width, width);
-  }
-  return stored;
-}
-
-std::uint32_t ColourOf(std::uint32_t index) { return index * 0x010203U & 0xFFFFFF; }
-
-// With a colour table of the image's own.
-std::string Gif(PictureSize size, const std::string& indices, bool interlaced, bool deferred) {
-  std::string table;
-  for (std::uint32_t index = 0; index < 256; ++index) {
-    for (const int shift : {16, 8, 0}) table += Low(ColourOf(index) >> shift, 1);
-  }
-  return "GIF87a" + Low(1, 2) + Low(1, 2) + Bytes({0, 0, 0, 0x2C, 0, 0, 0, 0}) + Low(size.Width, 2) +
-         Low(size.Height, 2) + Bytes({interlaced ? 0xC7 : 0x87}) + table + Bytes({8}) +
-         InPieces(Compress(interlaced ? Interlaced(indices, size.Width) : indices, 8, deferred)) + ";";
-}
-
-TEST(PicturePixels, CompressedGifComesBackPixelForPixel) {
-  std::mt19937 random(1);
-  for (const unsigned spread : {2U, 5U, 256U}) {  // colours in use; few make long strings
-    for (const PictureSize size : {PictureSize{1, 1}, PictureSize{5, 3}, PictureSize{200, 174}}) {
-      std::string indices;
-      Colours expected;
-      for (unsigned i = 0; i < size.Width * size.Height; ++i) {
-        const auto index = static_cast<std::uint32_t>(random() % spread);
-        indices += static_cast<char>(index);
-        expected.push_back(ColourOf(index));
-      }
-      for (const bool interlaced : {false, true}) {
-        for (const bool deferred : {false, true}) {
-          EXPECT_EQ(ColoursOf(Gif(size, indices, interlaced, deferred)), expected)
-              << spread << " colours, " << size.Width << " wide, " << interlaced << deferred;
+    const bool interlaced = seed % 3 == 0;
+    const Colours seen =
+        ColoursOf("GIF87a" + Bytes({1, 0, 1, 0, 0, 0, 0, 0x2C, 0, 0, 0, 0, width, 0}) + Low(indices.size() / width, 2) +
+                  Bytes({interlaced ? 0xC7 : 0x87}) + greys + '\x08' + pieces + Zero + ";");
+    ASSERT_EQ(seen.size(), indices.size());
+    auto index = indices.begin();
+    for (const auto& [first, step] : interlaced ? Passes{{0, 8}, {4, 8}, {2, 4}, {1, 2}} : Passes{{0, 1}}) {
+      for (std::size_t at = first * width; at < seen.size(); at += (step - 1) * width) {
+        for (const std::size_t end = at + width; at < end; ++at, ++index) {
+          ASSERT_EQ(seen[at], static_cast<unsigned char>(*index) * 0x010101U) << seed << " at " << at;
         }
       }
     }
@@ -171,4 +103,3 @@ TEST(PicturePixels, CompressedGifComesBackPixelForPixel) {
 }
 
 }  // namespace
-}  // namespace contract

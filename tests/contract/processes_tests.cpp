@@ -1,69 +1,48 @@
-#include <gtest/gtest.h>
+#include <tuple>
 
-#include <algorithm>
-
-#include "platform/files.h"
+#include "platform/environment.h"
 #include "platform/processes.h"
 #include "tests/contract/machine.h"
 
 namespace {
 
-using platform::CreateProcessA;
-using platform::Process;
+using namespace contract;
 
-constexpr std::uint32_t Limit = 20'000;
+class Processes : public Machine {};
 
-std::string Content(const std::string& path) {
-  platform::File file(path, platform::Access::Read);
-  std::string content(static_cast<std::size_t>(std::max<std::int64_t>(file.Size(), 0)), '\0');
-  file.Read(0, content.data(), content.size());
-  return content;
-}
-
-TEST(Processes, StartWithTheirCommandLineDirectoryAndPriority) {
-  struct {
-    std::uint32_t Priority;
-    std::string Directory, Arguments;
-  } const cases[] = {{platform::PriorityNormal, "Um", ""},
-                     {platform::PriorityIdle, "Um", " C:\\Jogos\\JOGOUM~1.SMC"},
-                     {platform::PriorityHigh, "A\xE7\xE3o e mais\\", "  \"a b\"  -c A\xE7\xE3o "}};
-  const contract::FreshDirectory directory;
-  for (const auto& each : cases) {
-    contract::StandIn program;
-    const std::string place = directory / each.Directory;
-    const std::string note = place + (place.ends_with('\\') ? "" : "\\") + "here.txt";
-    platform::CreateDirectoryA(place);
-    platform::DeleteFileA(note);
-
-    Process process = CreateProcessA(program.CommandLine() + each.Arguments, each.Priority, place);
-    ASSERT_TRUE(process.Started());
-    EXPECT_FALSE(process.WaitForEnd(0));
-    EXPECT_FALSE(platform::FileSize(note));
-    program.TellToEnd();
+TEST_F(Processes, StartWithTheirCommandLineDirectoryAndPriority) {
+  const std::tuple<std::uint32_t, string, string> cases[] = {
+      {PriorityNormal, "Um\\", ""},
+      {PriorityIdle, "Um", " C:\\Jogos\\JOGOUM~1.SMC"},
+      {PriorityHigh, "A\xE7\xE3o e mais", "  \"a b\"  -c A\xE7\xE3o "}};
+  for (const auto& [priority, name, arguments] : cases) {
+    const string commandLine = StandIn() + arguments, directory = here_ + name, note = directory + "\\here.txt";
+    CreateDirectoryA(directory);
+    DeleteFileA(note);
+    Process process = CreateProcessA(commandLine, priority, directory);
+    EXPECT_TRUE(process.Started() && !process.WaitForEnd(0) && !FileSize(note));
+    TellStandInToEnd();
     const Process moved = std::move(process);
     EXPECT_FALSE(process.Started());
-    EXPECT_TRUE(moved.WaitForEnd(Limit));
-    EXPECT_TRUE(moved.WaitForEnd(0));
-    const std::uint32_t priority = contract::StartsWithPriority() ? each.Priority : platform::PriorityNormal;
-    EXPECT_EQ(Content(note), std::to_string(priority) + " " + program.CommandLine() + each.Arguments);
+    for (const std::uint32_t limit : {20'000u, 0u}) EXPECT_TRUE(moved.WaitForEnd(limit));
+    EXPECT_EQ(Content(note), std::to_string(IsWine() ? PriorityNormal : priority) + " " + commandLine);
   }
 }
 
-TEST(Processes, WhatCannotBeStartedIsNotAndHasEnded) {
-  const contract::FreshDirectory directory;
-  const contract::StandIn program;
-  const std::string zero(1, '\0');
-  struct {
-    std::string CommandLine, Directory;
-  } const cases[] = {{directory / "nothing.exe", ""},
-                     {"", directory.Path()},
-                     {program.CommandLine(), directory / "nowhere"},
-                     {program.CommandLine() + zero, directory.Path()},
-                     {program.CommandLine(), directory.Path() + zero}};
-  for (const auto& each : cases) {
-    const Process process = CreateProcessA(each.CommandLine, platform::PriorityNormal, each.Directory);
-    EXPECT_FALSE(process.Started()) << each.CommandLine << " in " << each.Directory;
-    EXPECT_TRUE(process.WaitForEnd(0));
+TEST_F(Processes, WhatCannotBeStartedIsNotAndHasEnded) {
+  const string program = StandIn(), nowhere = here_ + "nowhere";
+  const std::pair<string, string> cases[] = {
+      {nowhere, ""}, {"", here_}, {program, nowhere}, {program + Zero, here_}, {program, here_ + Zero}};
+  for (const auto& [commandLine, directory] : cases) {
+    const Process process = CreateProcessA(commandLine, PriorityNormal, directory);
+    EXPECT_TRUE(!process.Started() && process.WaitForEnd(0)) << commandLine << " in " << directory;
+  }
+}
+
+TEST_F(Processes, EnvironmentIsReadWithoutRegardToCase) {
+  for (const string& value : {string("C:\\Jogos;D:\\A\xE7\xE3o"), string(3000, 'x'), string()}) {
+    SetEnvironment("Tolvaris_Teste", value);
+    EXPECT_EQ(GetEnvironmentVariableA("TOLVARIS_teste"), value);
   }
 }
 

@@ -1,123 +1,77 @@
-#include <gtest/gtest.h>
-
 #include "platform/registry.h"
 #include "tests/contract/machine.h"
 
 namespace {
 
-using namespace platform;
+using namespace contract;
 
 const RegistryKey root = RootKey(RootCurrentUser);
 
-class Registry : public testing::Test {
+class Registry : public Machine {
  protected:
-  void SetUp() override { ASSERT_EQ(RegOpenKeyExA(root, fresh_.Path(), KeyQueryAndSet, key_), 0); }
-  void TearDown() override { EXPECT_EQ(RegCloseKey(key_), 0); }
-
-  bool Set(const std::string& name, std::uint32_t type, std::string_view data) {
-    return RegSetValueExA(key_, name, type, data.data(), static_cast<std::uint32_t>(data.size())) == 0;
-  }
+  Registry() { EXPECT_EQ(RegCreateKeyA(root, Key, key_), 0); }
+  ~Registry() override { EXPECT_EQ(RegCloseKey(key_), 0); }
 
   // The type and the data of a value that fits into so many bytes; or "failed".
-  std::string Query(const std::string& name, std::uint32_t room = 255) {
-    std::string buffer(room, '\0');
-    std::uint32_t type = 0, size = room;
+  string Query(const string& name, std::size_t room) {
+    string buffer(room, '\0');
+    std::uint32_t type = 0, size = static_cast<std::uint32_t>(room);
     if (RegQueryValueExA(key_, name, type, buffer.data(), size) != 0) return "failed";
     return std::to_string(type) + ":" + buffer.substr(0, size);
   }
 
-  bool Exists(const std::string& subkey) {
-    RegistryKey opened = 0;
-    if (RegOpenKeyExA(key_, subkey, KeyQueryAndSet, opened) != 0) return false;
-    return opened != 0 && RegCloseKey(opened) == 0;
+  // Whether the key opens; a failure leaves the result alone.
+  bool Exists(const string& subkey) {
+    RegistryKey opened = 77;
+    if (RegOpenKeyExA(key_, subkey, KeyQueryAndSet, opened) == 0) return RegCloseKey(opened) == 0;
+    EXPECT_EQ(opened, 77);
+    return false;
   }
 
-  long Create(const std::string& subkey) {
+  bool Create(const string& subkey) {
     RegistryKey made = 0;
-    const long error = RegCreateKeyA(key_, subkey, made);
-    return error != 0 ? error : RegCloseKey(made);
+    return RegCreateKeyA(key_, subkey, made) == 0 && RegCloseKey(made) == 0;
   }
 
-  contract::FreshKey fresh_;
   RegistryKey key_ = 0;
 };
 
-TEST_F(Registry, ValuesKeepTheirTypeAndBytes) {
-  using namespace std::string_view_literals;
-  struct {
-    std::uint32_t Type;
-    std::string_view Data;
-  } const cases[] = {{RegistryText, "C:\\Jogos\\A\xE7\xE3o\0"sv},
-                     {RegistryText, "\0"sv},
-                     {RegistryNumber, "\1\0\0\0"sv},
-                     {RegistryBinary, "\0\xFF\0"sv},
-                     {RegistryBinary, ""sv},
-                     {2, "%PATH%\0"sv}};
-  for (const auto& each : cases) {  // each over the one before it
-    ASSERT_TRUE(Set("Valor", each.Type, each.Data));
-    EXPECT_EQ(Query("Valor"), std::to_string(each.Type) + ":" + std::string(each.Data));
-    EXPECT_EQ(Query("VALOR"), Query("Valor"));
+TEST_F(Registry, ValuesKeepTheirTypeAndBytesAndMustFitTheRoom) {
+  const std::pair<std::uint32_t, string> cases[] = {{RegistryText, string("C:\\A\xE7\xE3o\0", 8)},
+                                                    {RegistryText, string(254, 'x') + '\0'},
+                                                    {RegistryText, string(255, 'x') + '\0'},
+                                                    {RegistryText, "without its zero"},
+                                                    {RegistryNumber, string("\1\0\0\0", 4)},
+                                                    {RegistryBinary, string("\0\xFF\0", 3)},
+                                                    {RegistryBinary, ""},
+                                                    {2, string("%PATH%\0", 7)}};
+  for (const auto& [type, data] : cases) {  // each over the one before it; what lies behind its data is not taken
+    ASSERT_EQ(RegSetValueExA(key_, "Valor", type, (data + "+").data(), static_cast<std::uint32_t>(data.size())), 0);
+    const string stored = std::to_string(type) + ":" + data;
+    EXPECT_EQ(Query("Valor", data.size()), stored);
+    EXPECT_EQ(Query("VALOR", 255), data.size() > 255 ? "failed" : stored);
+    EXPECT_EQ(Query("Valor", data.empty() ? 0 : data.size() - 1), data.empty() ? stored : "failed");
   }
-  EXPECT_EQ(Query("Outro"), "failed");
+  EXPECT_EQ(Query("Outro", 255), "failed");
 }
 
-TEST_F(Registry, TextStoredWithoutItsZeroHasNone) {
-  ASSERT_TRUE(Set("Valor", RegistryText, std::string_view("abcd").substr(0, 3)));
-  EXPECT_EQ(Query("Valor"), "1:abc");
-}
-
-TEST_F(Registry, DataLongerThanTheRoomFails) {
-  ASSERT_TRUE(Set("Cabe", RegistryText, std::string(254, 'x') + '\0'));
-  ASSERT_TRUE(Set("Sobra", RegistryText, std::string(255, 'x') + '\0'));
-  ASSERT_TRUE(Set("Bytes", RegistryBinary, "12345"));
-  EXPECT_EQ(Query("Cabe"), "1:" + std::string(254, 'x') + '\0');
-  EXPECT_EQ(Query("Sobra"), "failed");
-  EXPECT_EQ(Query("Bytes", 4), "failed");
-  EXPECT_EQ(Query("Bytes", 5), "3:12345");
-}
-
-TEST_F(Registry, KeysAreMadeOnceAndOpenedAfterwards) {
+TEST_F(Registry, KeysAreMadeOnceAndDeletedWithoutKeysBelow) {
   EXPECT_FALSE(Exists("Um"));
-  EXPECT_EQ(Create("Um\\"), 0);
-  EXPECT_TRUE(Exists("um"));
-  RegistryKey below = 0;
-  ASSERT_EQ(RegCreateKeyA(key_, "Um\\Dois", below), 0);
-  EXPECT_EQ(RegSetValueExA(below, "Valor", RegistryNumber, "1234", 4), 0);
-  EXPECT_EQ(RegCloseKey(below), 0);
-  EXPECT_EQ(Create("UM\\DOIS"), 0);  // stands already: keeps what is in it
-  ASSERT_EQ(RegOpenKeyExA(key_, "Um\\Dois", KeyQueryAndSet, below), 0);
-  std::uint32_t type = 0, size = 4, number = 0;
-  EXPECT_EQ(RegQueryValueExA(below, "Valor", type, &number, size), 0);
-  EXPECT_EQ(number, 0x34333231u);
-  EXPECT_EQ(RegCloseKey(below), 0);
-}
-
-TEST_F(Registry, AnEmptySubkeyIsTheParentItself) {
-  RegistryKey same = 0, user = 0;
-  ASSERT_EQ(RegOpenKeyExA(key_, "", KeyQueryAndSet, same), 0);
-  EXPECT_EQ(RegSetValueExA(same, "Valor", RegistryNumber, "1234", 4), 0);
-  EXPECT_EQ(RegCloseKey(same), 0);
-  EXPECT_EQ(Query("Valor"), "4:1234");
-  ASSERT_EQ(RegOpenKeyExA(root, "", KeyQueryAndSet, user), 0);
-  EXPECT_EQ(RegCloseKey(user), 0);
-  EXPECT_TRUE(Exists(""));
-}
-
-TEST_F(Registry, OnlyKeysWithoutKeysBelowAreDeleted) {
-  ASSERT_EQ(Create("Um"), 0);
-  ASSERT_EQ(Create("Um\\Dois"), 0);
+  EXPECT_TRUE(Create("Um\\"));
+  EXPECT_TRUE(Exists("um") && Create("Um\\Dois"));
   EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
   EXPECT_TRUE(Exists("Um\\Dois"));
   EXPECT_EQ(RegDeleteKeyA(key_, "UM\\dois"), 0);
   EXPECT_FALSE(Exists("Um\\Dois"));
   EXPECT_EQ(RegDeleteKeyA(key_, "Um"), 0);
   EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
-}
 
-TEST_F(Registry, AFailedOpenLeavesTheResultAlone) {
-  RegistryKey result = 77;
-  EXPECT_NE(RegOpenKeyExA(key_, "Nada", KeyQueryAndSet, result), 0);
-  EXPECT_EQ(result, 77);
+  RegistryKey same = 0, again = 0;  // an empty subkey is the parent itself
+  ASSERT_EQ(RegOpenKeyExA(key_, "", KeyQueryAndSet, same), 0);
+  EXPECT_EQ(RegSetValueExA(same, "Valor", RegistryNumber, "1234", 4), 0);
+  ASSERT_EQ(RegCreateKeyA(root, Key, again), 0);  // stands already: keeps what is in it
+  EXPECT_EQ(Query("Valor", 4), "4:1234");
+  for (const RegistryKey key : {same, again}) EXPECT_EQ(RegCloseKey(key), 0);
 }
 
 }  // namespace

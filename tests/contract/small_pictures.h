@@ -11,11 +11,7 @@ struct PictureSize {
   std::uint32_t Width, Height;
 };
 
-inline std::string Bytes(std::initializer_list<int> values) {
-  std::string bytes;
-  for (const int value : values) bytes += static_cast<char>(value);
-  return bytes;
-}
+inline std::string Bytes(std::initializer_list<int> values) { return std::string(values.begin(), values.end()); }
 
 // A number, its lowest byte first.
 inline std::string Low(std::uint64_t value, int bytes) {
@@ -35,8 +31,8 @@ inline std::string SmallBmp(PictureSize size = {3, 1}) {
 // then 0 and 5 (end) of four. The file ends with its first image, which is all that counts.
 inline std::string SmallGif(PictureSize size = {2, 2}, const std::string& codes = Bytes({0x44, 0x02, 0x05})) {
   const std::string sides = Low(size.Width, 2) + Low(size.Height, 2);
-  return "GIF89a" + sides + Bytes({0x80, 0, 0, 255, 0, 0, 0, 0, 255}) + Bytes({0x21, 0xF9, 4, 1, 0, 0, 0, 0}) +
-         Bytes({0x2C, 0, 0, 0, 0}) + sides + Bytes({0, 2}) + Low(codes.size(), 1) + codes + Bytes({0});
+  return "GIF89a" + sides + Bytes({0x80, 0, 0, 255, 0, 0, 0, 0, 255, 0x21, 0xF9, 4, 1, 0, 0, 0, 0, 0x2C, 0, 0, 0, 0}) +
+         sides + Bytes({0, 2}) + Low(codes.size(), 1) + codes + '\0';
 }
 
 // One block of 8 by 8 pixels in middle grey: each Huffman table has one code, of one bit, and it means zero.

@@ -123,7 +123,7 @@ TEST_F(FirstStart, ShowsTheControllerOnceBeforeTheMainWindow) {
 
     help.Child("&Fechar").Click();
     const MainWindow window(program);
-    EXPECT_FALSE(help);
+    EXPECT_SOON(!help);
     window.Window.CloseByUser();
     EXPECT_SOON(program.HasEnded());
   }

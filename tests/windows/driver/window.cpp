@@ -13,6 +13,7 @@ namespace {
 
 constexpr char DialogClass[] = "#32770";
 constexpr UINT AnswerLimit = 5000;  // milliseconds that a window may take to answer
+constexpr DWORD PressLimit = 3000;  // and a control to go down under the mouse
 
 int Pixels(int twips) {
   const HDC screen = GetDC(nullptr);
@@ -81,23 +82,44 @@ void WaitUntilInFront(HWND window) {
 // A coordinate as SendInput wants it: the screen's size is 65536.
 LONG Normalised(LONG pixel, int size) { return MulDiv(pixel, 65536, size) + 32768 / size; }
 
-// Each press and release carries its own place: a window that has just come under the pointer can set it back to where
-// the display had it.
-void SendMouse(HWND window, POINT place, int times) {
-  WaitUntilInFront(window);
-  SetCursorPos(place.x, place.y);
+// Presses or releases the mouse's button so many times. Each event carries its own place: a window that has just come
+// under the pointer can set it back to where the display had it.
+void SendMouse(POINT place, const std::vector<DWORD>& events) {
   std::vector<INPUT> inputs;
-  for (int i = 0; i < times; ++i) {
-    for (const DWORD button : {DWORD{MOUSEEVENTF_LEFTDOWN}, DWORD{MOUSEEVENTF_LEFTUP}}) {
-      INPUT input{};
-      input.type = INPUT_MOUSE;
-      input.mi.dwFlags = button | MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE;
-      input.mi.dx = Normalised(place.x, GetSystemMetrics(SM_CXSCREEN));
-      input.mi.dy = Normalised(place.y, GetSystemMetrics(SM_CYSCREEN));
-      inputs.push_back(input);
-    }
+  for (const DWORD event : events) {
+    INPUT input{};
+    input.type = INPUT_MOUSE;
+    input.mi.dwFlags = event | MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE;
+    input.mi.dx = Normalised(place.x, GetSystemMetrics(SM_CXSCREEN));
+    input.mi.dy = Normalised(place.y, GetSystemMetrics(SM_CYSCREEN));
+    inputs.push_back(input);
   }
   SendInput(static_cast<UINT>(inputs.size()), inputs.data(), sizeof(INPUT));
+}
+
+GUITHREADINFO ThreadOf(HWND window) {
+  GUITHREADINFO info{};
+  info.cbSize = sizeof info;
+  GetGUIThreadInfo(GetWindowThreadProcessId(window, nullptr), &info);
+  return info;
+}
+
+// A person sees a control go down under the mouse before he lets go, and presses again when it did not: while the
+// display still moves the focus to a window that has just come, a press can be lost.
+void ClickOnce(HWND window, POINT place) {
+  for (int tries = 0; tries < 3; ++tries) {
+    SendMouse(place, {MOUSEEVENTF_LEFTDOWN});
+    const bool down = Eventually([&] { return ThreadOf(window).hwndCapture != nullptr; }, PressLimit);
+    SendMouse(place, {MOUSEEVENTF_LEFTUP});
+    if (down) return;
+  }
+}
+
+void ClickPlace(HWND window, POINT place, int times) {
+  WaitUntilInFront(window);
+  SetCursorPos(place.x, place.y);
+  if (times == 1) return ClickOnce(window, place);
+  SendMouse(place, {MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP, MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP});
 }
 
 }  // namespace
@@ -110,12 +132,7 @@ std::string Window::Class() const {
   return name.data();
 }
 
-bool Window::Focused() const {
-  GUITHREADINFO info{};
-  info.cbSize = sizeof info;
-  GetGUIThreadInfo(GetWindowThreadProcessId(handle_, nullptr), &info);
-  return handle_ != nullptr && info.hwndFocus == handle_;
-}
+bool Window::Focused() const { return handle_ != nullptr && ThreadOf(handle_).hwndFocus == handle_; }
 
 RECT Window::Place() const {
   RECT place{};
@@ -166,13 +183,13 @@ void Window::FinishPainting() const {
 
 void Window::Click() const {
   const RECT place = Place();
-  SendMouse(handle_, {(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
+  ClickPlace(handle_, {(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
 }
 
 void Window::ClickAt(int left, int top, int times) const {
   POINT place{Pixels(left), Pixels(top)};
   ClientToScreen(handle_, &place);
-  SendMouse(handle_, place, times);
+  ClickPlace(handle_, place, times);
 }
 
 void Window::CloseByUser() const { PostMessageW(handle_, WM_SYSCOMMAND, SC_CLOSE, 0); }
@@ -234,7 +251,7 @@ void ClickEntry(const Window& list, const std::string& text, int times) {
   Ask(list.Handle(), LB_GETITEMRECT, static_cast<WPARAM>(entry - entries.begin()), reinterpret_cast<LPARAM>(&area));
   POINT middle{(area.left + area.right) / 2, (area.top + area.bottom) / 2};
   ClientToScreen(list.Handle(), &middle);
-  SendMouse(list.Handle(), middle, times);
+  ClickPlace(list.Handle(), middle, times);
 }
 
 void PrintTo(const Message& message, std::ostream* out) {
