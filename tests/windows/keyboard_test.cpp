@@ -90,7 +90,7 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   driver::EnterPath(program, "C:\\Ensaio\\Novos\\novo.smc");
   EXPECT_EQ(AnswerWithKey(program, VK_SPACE).Text, "Jogo adicionado com sucesso.");
   EXPECT_SOON_EQ(4, SelectedEntry(main.List));
-  EXPECT_SOON(main.List.Focused());
+  EXPECT_SOON(main.List.Focused() && main.Pictures[3].Enabled());
   EXPECT_TRUE(TabTo(main.Pictures[3]));
   PressKey(VK_RETURN);
   driver::EnterPath(program, "C:\\Ensaio\\Novos\\copia.smc");
