@@ -68,6 +68,18 @@ remove_drive() {
   rm -f "$WINEPREFIX/dosdevices/${1,,}:"
 }
 
+# Makes the directory a file system as small as a floppy disk until the script ends. It fails where this machine does
+# not let us mount one: mount_floppy DIRECTORY
+mount_floppy() {
+  local -a administrator=()
+  if [[ $(id -u) != 0 ]]; then administrator=(sudo -n); fi
+  mkdir -p "$1"
+  # What a run left that was killed; one that somebody still looks into goes when he is done.
+  "${administrator[@]}" umount -l "$1" 2>/dev/null || true
+  "${administrator[@]}" mount -t tmpfs -o "size=1440k,uid=$(id -u),mode=755" tolvaris-floppy "$1" 2>/dev/null || return 1
+  on_exit "${administrator[@]}" umount -l "$1"
+}
+
 # Waits until all of the prefix's programs have ended.
 wait_wine() {
   "$wineserver" -w
