@@ -67,6 +67,7 @@ Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, c
   Pacote.reserve(Folga + static_cast<std::size_t>(TamanhoImagem) + static_cast<std::size_t>(TamanhoRom));
   AcrescentarArquivo(Pacote, ArquivoImagem);
   const std::size_t InicioRom = Pacote.size();
+  if (InicioRom != static_cast<std::size_t>(TamanhoImagem)) return Desfecho::ErroInesperado;
   AcrescentarArquivo(Pacote, Escolhido.Arquivo);
   if (Pacote.size() - InicioRom != static_cast<std::size_t>(TamanhoRom)) return Desfecho::ErroInesperado;
   RunPendingEvents();

@@ -99,12 +99,14 @@ TEST_F(Export, FailuresAreToldAndLeaveNoHalfFile) {
     std::string Message;
     const char* Left;  // content of the target afterwards; null: none
   };
-  const std::string rom = Home + "Roms\\SUPERJOG.ZIP";
+  const std::string rom = Home + "Roms\\SUPERJOG.ZIP", picture = Home + "Imgs\\Super Jogo.bmp";
   const Case cases[] = {
       {"unknown game", [&] { form->Jogos.clear(); }, "", Unknown, nullptr},
       {"nothing selected", [&] { form->List1.Select(-1); }, "", Unknown, nullptr},
       {"ROM gone", [&] { RemoveFile(rom); }, "", Gone, nullptr},
       {"ROM locked", [&] { LockFile(rom); }, "C:\\n.zip", ReadError, nullptr},
+      {"ROM locked, package", [&] { LockFile(rom); }, "C:\\n.tvk", ExportError, nullptr},
+      {"picture locked", [&] { LockFile(picture); }, "C:\\n.tvk", ExportError, nullptr},
       {"a ROM of the checksum's chunk", [&] { PutFile(rom, std::string(1048576, 'x')); }, "C:\\n.tvk", ExportError,
        nullptr},
       {"no such disk", [] {}, "Q:\\n.zip", WriteError, nullptr},
@@ -115,7 +117,7 @@ TEST_F(Export, FailuresAreToldAndLeaveNoHalfFile) {
   for (const Case& each : cases) {
     SetFreeSpace('C', 10'000'000);
     PutFile(rom, "123456789");
-    LockFile(rom, false);
+    for (const std::string& file : {rom, picture}) LockFile(file, false);
     ASSERT_TRUE(Start());
     Pick("Super Jogo");
     each.Spoil();
