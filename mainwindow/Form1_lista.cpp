@@ -71,13 +71,13 @@ void Form1::CarregarLista(bool IgnorarUltimo) {
 void Form1::EncherLista(const std::vector<platform::DirectoryEntry>& Arquivos) {
   const std::string DirCurto = CaminhoCurto(DirRoms);
   Jogos.assign(Arquivos.size(), Jogo{});
-  List1.SetRedraw(false);
+  std::vector<std::string> Nomes;
   for (std::size_t i = 0; i < Arquivos.size(); ++i) {
     Jogos[i] = LerJogo(Arquivos[i], DirCurto);
-    if (i % 10 == 0) platform::RunPendingEvents();
-    if (!Jogos[i].Arquivo.empty()) List1.Add(Jogos[i].Nome);
+    if (i % 10 == 0) platform::RunPendingEventsAtIntervals();
+    if (!Jogos[i].Arquivo.empty()) Nomes.push_back(Jogos[i].Nome);
   }
-  List1.SetRedraw(true);
+  List1.Fill(Nomes);
 }
 
 void Form1::SelecionarUltimo() {

@@ -8,6 +8,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "platform/pictures.h"
 
@@ -130,6 +131,7 @@ class ListBox : public Control {
   ListBox(const Container& container, const Bounds& bounds, Order order);
 
   void Add(const std::string& text);
+  void Fill(const std::vector<std::string>& texts);  // in place of all entries; much faster than adding each
   void Clear();
   int Count() const;
   std::string Text(int index) const;  // positions start at 0; the empty text when there is no such entry
@@ -140,22 +142,19 @@ class ListBox : public Control {
   // The first entry that equals the text without regard to letter case, or -1 (LB_FINDSTRINGEXACT from -1).
   int FindExact(const std::string& text) const;
 
-  // Off while many entries are added: nothing of the list is drawn until it is on again.
-  void SetRedraw(bool redraw);
-
   std::function<void()> OnClick;  // the user selected an entry, by mouse or keyboard
   std::function<void()> OnDoubleClick;
   std::function<void(int keyCode)> OnKeyDown;  // before the list acts on the key; 13 is Enter
 };
 
-// A push button that shows its caption, or an icon once it has one.
+// A push button that shows its caption, or an icon of the program's resources, whose size follows the screen's DPI; its
+// tool tip is then its name.
 class Button : public Control {
  public:
   Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font = {});
+  Button(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip);
 
-  // Shows an icon of the program's resources, with the tool tip as the button's name; its size follows the screen's
-  // DPI.
-  void SetIcon(int id);
+  void SetIcon(int id);  // another one; nothing for a button that shows its caption
 
   std::function<void()> OnClick;
 };

@@ -8,6 +8,10 @@ namespace platform {
 // Handles every event that waits, and returns at once when none does.
 void RunPendingEvents();
 
+// The same inside an operation that calls it again and again: does nothing when the last time was less than a hundredth
+// of a second ago, since a look at the queue can take longer than what is done between two of them.
+void RunPendingEventsAtIntervals();
+
 // Handles events until the main window (the first one created) is closed.
 void RunEventLoop();
 

@@ -30,7 +30,7 @@ Form4::Form4()
       Frame1(*this, LugarFrame1, " Disquete "),
       List1(Frame1, LugarLista, platform::ListBox::Order::Sorted),
       Image1(Frame1, LugarLixeira, FIGURA_EXCLUIR, "Excluir"),
-      Command1(*this, LugarCommand1, ""),
+      Command1(*this, LugarCommand1, ICONE_SETA_DIREITA, ""),
       Frame2(*this, LugarFrame2, " Computador "),
       List2(Frame2, LugarLista, platform::ListBox::Order::Sorted),
       Image2(Frame2, LugarLixeira, FIGURA_EXCLUIR, "Excluir"),

@@ -19,14 +19,13 @@ void Form4::Listar(const Painel& painel) {
 }
 
 void Form4::Preencher(const Painel& painel) {
-  painel.Lista.SetRedraw(false);
-  painel.Lista.Clear();
+  std::vector<std::string> textos;
   if (!painel.Diretorio.empty()) {
     for (const platform::DirectoryEntry& arquivo : platform::ListDirectory(painel.Diretorio, PadraoSalvamentos)) {
-      painel.Lista.Add(NomeExibido(arquivo.Name, Catalogo()));
+      textos.push_back(NomeExibido(arquivo.Name, Catalogo()));
     }
   }
-  painel.Lista.SetRedraw(true);
+  painel.Lista.Fill(textos);
 }
 
 void Form4::List1_Click() { Escolher(Disquete); }

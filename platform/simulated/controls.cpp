@@ -20,6 +20,13 @@ void Join(ControlState& control, const Container& container, const Bounds& bound
   control.Place = {container.Left + bounds.Left, container.Top + bounds.Top, bounds.Width, bounds.Height};
 }
 
+void JoinWithIcon(ControlState& control, const Container& container, const Bounds& bounds, int icon,
+                  const std::string& toolTip) {
+  Join(control, container, bounds);
+  control.Icon = icon;
+  control.ToolTip = toolTip;
+}
+
 }  // namespace
 
 Container::Container(Frame& frame) : Parent(frame.Parent), Left(frame.Place.Left), Top(frame.Place.Top) {}
@@ -70,14 +77,16 @@ Button::Button(const Container& container, const Bounds& bounds, const std::stri
   state_->Caption = caption;
 }
 
+Button::Button(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
+  JoinWithIcon(*state_, container, bounds, icon, toolTip);
+}
+
 void Button::SetIcon(int id) {
-  if (IsAlive(*state_)) state_->Icon = id;
+  if (IsAlive(*state_) && state_->Icon != 0) state_->Icon = id;
 }
 
 CheckBox::CheckBox(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
-  Join(*state_, container, bounds);
-  state_->Icon = icon;
-  state_->ToolTip = toolTip;
+  JoinWithIcon(*state_, container, bounds, icon, toolTip);
 }
 
 int CheckBox::Value() const { return state_->Value; }
@@ -104,9 +113,7 @@ void ImageBox::SetPicture(const Picture& picture) {
 Picture ImageBox::ShownPicture() const { return state_->Shown; }
 
 ImageButton::ImageButton(const Container& container, const Bounds& bounds, int picture, const std::string& toolTip) {
-  Join(*state_, container, bounds);
-  state_->Icon = picture;
-  state_->ToolTip = toolTip;
+  JoinWithIcon(*state_, container, bounds, picture, toolTip);
 }
 
 namespace {
@@ -139,6 +146,11 @@ ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) 
 
 void ListBox::Add(const std::string& text) { AddEntry(*state_, text); }
 
+void ListBox::Fill(const std::vector<std::string>& texts) {
+  Clear();
+  for (const std::string& text : texts) Add(text);
+}
+
 void ListBox::Clear() {
   if (!IsAlive(*state_)) return;
   state_->Entries.clear();
@@ -162,10 +174,6 @@ int ListBox::FindExact(const std::string& text) const {
   const auto found =
       std::find_if(state_->Entries.begin(), state_->Entries.end(), [&](const auto& entry) { return entry.Key == key; });
   return found == state_->Entries.end() ? -1 : static_cast<int>(found - state_->Entries.begin());
-}
-
-void ListBox::SetRedraw(bool redraw) {
-  if (IsAlive(*state_)) state_->Redraw = redraw;
 }
 
 ComboBox::ComboBox(const Container& container, const Bounds& bounds) { Join(*state_, container, bounds); }

@@ -70,7 +70,7 @@ struct ControlState {
   std::int32_t Handle = 0;
 
   std::vector<simulated::ListEntry> Entries;
-  bool Sorted = false, Redraw = true;
+  bool Sorted = false;
   int Selected = -1;
   int Value = 0;
   int Icon = 0;

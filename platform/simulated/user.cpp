@@ -105,8 +105,6 @@ const Control* Focused() {
 
 int IconOf(const Button& button) { return button.State().Icon; }
 
-bool RedrawIsOn(const ListBox& list) { return list.State().Redraw; }
-
 std::uint32_t IntervalOf(const Timer& timer) { return timer.State().Interval; }
 
 int DroppedExceptions() { return TheMachine().DroppedExceptions; }

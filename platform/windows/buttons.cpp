@@ -7,16 +7,23 @@ namespace {
 constexpr int IconSide = 32;
 
 void ShowIcon(ControlState& control, int id) {
-  control.NamedByToolTip = true;
-  SetNativeText(control, control.ToolTip);
-  const LONG_PTR style = ::GetWindowLongPtrA(control.Handle, GWL_STYLE);
-  ::SetWindowLongPtrA(control.Handle, GWL_STYLE, style | BS_ICON);
   control.LayOut = [&control, id] {
     IconHandle next = LoadIconFor(id, IconSide, control.Owner->Dpi);
     ::SendMessageA(control.Handle, BM_SETIMAGE, IMAGE_ICON, reinterpret_cast<LPARAM>(next.get()));
     control.Icon.swap(next);
   };
   control.LayOut();
+}
+
+// A button of the style that shows an icon and bears the tool tip as its name.
+void CreateIconButton(ControlState& control, const Container& container, const Bounds& bounds, DWORD style, int icon,
+                      const std::string& toolTip) {
+  CreateControl(control, container, bounds, {"BUTTON", WS_TABSTOP | BS_ICON | style}, toolTip);
+  control.Caption.clear();
+  control.ToolTip = toolTip;
+  control.NamedByToolTip = true;
+  PressOnEnter(control);
+  if (control.Handle != nullptr) ShowIcon(control, icon);
 }
 
 }  // namespace
@@ -38,15 +45,19 @@ Button::Button(const Container& container, const Bounds& bounds, const std::stri
   };
 }
 
+Button::Button(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
+  CreateIconButton(*state_, container, bounds, BS_PUSHBUTTON, icon, toolTip);
+  state_->OnNotification = [this](int code) {
+    if (IsClick(code)) Raise(OnClick);
+  };
+}
+
 void Button::SetIcon(int id) {
-  if (state_->Handle != nullptr) ShowIcon(*state_, id);
+  if (state_->Handle != nullptr && state_->NamedByToolTip) ShowIcon(*state_, id);
 }
 
 CheckBox::CheckBox(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
-  CreateControl(*state_, container, bounds, {"BUTTON", WS_TABSTOP | BS_AUTOCHECKBOX | BS_PUSHLIKE});
-  PressOnEnter(*state_);
-  ShowIcon(*state_, icon);
-  SetToolTip(toolTip);
+  CreateIconButton(*state_, container, bounds, BS_AUTOCHECKBOX | BS_PUSHLIKE, icon, toolTip);
   state_->LastValue = 0;
   state_->Remember = [this] { state_->LastValue = Value(); };
 }
@@ -57,6 +68,7 @@ int CheckBox::Value() const {
 }
 
 void CheckBox::SetValue(int value) {
+  if (value == Value()) return;
   ::SendMessageA(state_->Handle, BM_SETCHECK, value == 1 ? BST_CHECKED : BST_UNCHECKED, 0);
 }
 

@@ -39,6 +39,12 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
     case WM_KILLFOCUS:
       EndDefault(handle);
       break;
+    case WM_ENABLE:
+      if (!control.Framed && !::IsWindowVisible(handle)) return 0;  // nothing but a reason to draw it anew
+      break;
+    case WM_NCPAINT:
+      if (!control.Framed) return 0;  // what is not there takes as long to draw as a frame
+      break;
     case WM_ERASEBKGND:
       if (control.Draw) return TRUE;  // it draws all of itself
       break;
@@ -100,6 +106,7 @@ void CreateControl(ControlState& control, const Container& container, const Boun
   control.Place.Top += container.Top;
   control.Face = font;
   control.Caption = text;
+  control.Framed = native.ExtendedStyle != 0 || (native.Style & (WS_BORDER | WS_VSCROLL)) != 0;
   const DWORD group = GroupStyle(window, native.Class);
   const auto id = static_cast<std::uintptr_t>(FirstId) + window.Controls.size();
   window.Controls.push_back(&control);
@@ -166,7 +173,7 @@ void Control::SetFocus() {
 std::string Control::Caption() const { return state_->Caption; }
 
 void Control::SetCaption(const std::string& caption) {
-  if (state_->Handle == nullptr) return;
+  if (state_->Handle == nullptr || caption == state_->Caption) return;
   state_->Caption = caption;
   if (!state_->NamedByToolTip) SetNativeText(*state_, caption);
   if (state_->LayOut) state_->LayOut();
@@ -175,7 +182,7 @@ void Control::SetCaption(const std::string& caption) {
 std::string Control::ToolTip() const { return state_->ToolTip; }
 
 void Control::SetToolTip(const std::string& text) {
-  if (state_->Handle == nullptr) return;
+  if (state_->Handle == nullptr || text == state_->ToolTip) return;
   state_->ToolTip = text;
   if (state_->NamedByToolTip) SetNativeText(*state_, text);
   UpdateToolTip(*state_);

@@ -1,7 +1,6 @@
 // Listings of directories.
 #include <windows.h>
 
-#include <algorithm>
 #include <memory>
 #include <string_view>
 #include <utility>
@@ -9,6 +8,7 @@
 #include "platform/files.h"
 #include "platform/text.h"
 #include "platform/wildcards.h"
+#include "platform/windows/order.h"
 #include "platform/windows/paths.h"
 
 namespace platform {
@@ -30,44 +30,22 @@ FindHandle FindFirst(const std::string& pattern, WIN32_FIND_DATAA& data) {
 
 DirectoryEntry EntryOf(const WIN32_FIND_DATAA& data) { return {data.cFileName, data.cAlternateFileName}; }
 
-// Bytes that compare as the text does in CompareStringA. One call a name, where comparing would take one a comparison.
-std::string SortKey(const std::string& text) {
-  constexpr DWORD flags = LCMAP_SORTKEY | NORM_IGNORECASE;
-  const auto map = [&](char* buffer, int room) {
-    return ::LCMapStringA(LOCALE_USER_DEFAULT, flags, text.data(), static_cast<int>(text.size()), buffer, room);
-  };
-  std::string key(8 * text.size() + 16, '\0');  // enough for most
-  int length = map(key.data(), static_cast<int>(key.size()));
-  if (length == 0) {
-    key.resize(static_cast<std::size_t>(map(nullptr, 0)));
-    length = map(key.data(), static_cast<int>(key.size()));
-  }
-  key.resize(static_cast<std::size_t>(length));
-  return key;
-}
-
-struct SortedEntry {
-  std::string Key;
-  DirectoryEntry Entry;
-  bool operator<(const SortedEntry& other) const {
-    return Key != other.Key ? Key < other.Key : Entry.Name < other.Entry.Name;
-  }
-};
-
 // What a directory holds, as far as it is wanted, in the order of the names.
 template <typename Wanted>
 std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& wanted) {
-  std::vector<SortedEntry> found;
+  std::vector<DirectoryEntry> found;
   WIN32_FIND_DATAA data;
   const FindHandle find = FindFirst(directory + "*", data);
   for (bool more = find != nullptr; more; more = ::FindNextFileA(find.get(), &data) != 0) {
-    if (wanted(data)) found.push_back({SortKey(data.cFileName), EntryOf(data)});
+    if (wanted(data)) found.push_back(EntryOf(data));
   }
-  std::sort(found.begin(), found.end());
+  std::vector<const std::string*> names;
+  names.reserve(found.size());
+  for (const DirectoryEntry& each : found) names.push_back(&each.Name);
 
   std::vector<DirectoryEntry> entries;
   entries.reserve(found.size());
-  for (SortedEntry& each : found) entries.push_back(std::move(each.Entry));
+  for (const std::size_t place : InOrder(names)) entries.push_back(std::move(found[place]));
   return entries;
 }
 

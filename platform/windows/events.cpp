@@ -52,6 +52,14 @@ void RunPendingEvents() {
   while (::PeekMessageA(&event, nullptr, 0, 0, PM_REMOVE)) HandleEvent(event);
 }
 
+void RunPendingEventsAtIntervals() {
+  constexpr ULONGLONG interval = 10;  // milliseconds
+  static ULONGLONG last = 0;
+  if (::GetTickCount64() - last < interval) return;
+  RunPendingEvents();
+  last = ::GetTickCount64();
+}
+
 void RunEventLoop() {
   MSG event;
   while (MainWindowIsOpen() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);

@@ -2,6 +2,7 @@
 #include <vector>
 
 #include "platform/controls.h"
+#include "platform/windows/order.h"
 #include "platform/windows/state.h"
 
 namespace platform {
@@ -24,6 +25,17 @@ int FindExactIn(const std::vector<std::string>& texts, const std::string& text) 
   };
   const auto found = std::find_if(texts.begin(), texts.end(), same);
   return found == texts.end() ? -1 : static_cast<int>(found - texts.begin());
+}
+
+std::vector<const std::string*> Pointers(const std::vector<std::string>& texts, bool sorted) {
+  std::vector<const std::string*> given;
+  given.reserve(texts.size());
+  for (const std::string& text : texts) given.push_back(&text);
+  if (!sorted) return given;
+  std::vector<const std::string*> ordered;
+  ordered.reserve(texts.size());
+  for (const std::size_t place : InOrder(given)) ordered.push_back(given[place]);
+  return ordered;
 }
 
 }  // namespace
@@ -51,6 +63,20 @@ void ListBox::Add(const std::string& text) {
   ::SendMessageA(state_->Handle, LB_ADDSTRING, 0, reinterpret_cast<LPARAM>(text.c_str()));
 }
 
+// Texts that are in the list's own order already need no place looked up for them, which would be most of the work. A
+// list with a scroll bar that is drawn anew for each entry takes a hundred times as long.
+void ListBox::Fill(const std::vector<std::string>& texts) {
+  if (state_->Handle == nullptr) return;
+  const bool sorted = (::GetWindowLongPtrA(state_->Handle, GWL_STYLE) & LBS_SORT) != 0;
+  ::SendMessageA(state_->Handle, WM_SETREDRAW, FALSE, 0);
+  Clear();
+  for (const std::string* text : Pointers(texts, sorted)) {
+    ::SendMessageA(state_->Handle, LB_INSERTSTRING, static_cast<WPARAM>(-1), reinterpret_cast<LPARAM>(text->c_str()));
+  }
+  ::SendMessageA(state_->Handle, WM_SETREDRAW, TRUE, 0);
+  ::InvalidateRect(state_->Handle, nullptr, TRUE);
+}
+
 void ListBox::Clear() { ::SendMessageA(state_->Handle, LB_RESETCONTENT, 0, 0); }
 
 int ListBox::Count() const {
@@ -74,11 +100,6 @@ int ListBox::FindExact(const std::string& text) const {
   if (state_->Handle == nullptr) return FindExactIn(state_->LastTexts, text);
   return static_cast<int>(::SendMessageA(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
                                          reinterpret_cast<LPARAM>(text.c_str())));
-}
-
-void ListBox::SetRedraw(bool redraw) {
-  ::SendMessageA(state_->Handle, WM_SETREDRAW, redraw, 0);
-  if (redraw && state_->Handle != nullptr) ::InvalidateRect(state_->Handle, nullptr, TRUE);
 }
 
 }  // namespace platform

@@ -30,10 +30,14 @@ HFONT CreateFontFor(const Font& font, int dpi) {
 
 }  // namespace
 
+// It stays the same for as long as the program runs.
 int DpiOfScreen() {
-  const HDC screen = ::GetDC(nullptr);
-  const int dpi = ::GetDeviceCaps(screen, LOGPIXELSX);
-  ::ReleaseDC(nullptr, screen);
+  static const int dpi = [] {
+    const HDC screen = ::GetDC(nullptr);
+    const int pixels = ::GetDeviceCaps(screen, LOGPIXELSX);
+    ::ReleaseDC(nullptr, screen);
+    return pixels;
+  }();
   return dpi > 0 ? dpi : UsualDpi;
 }
 

@@ -21,11 +21,11 @@ struct WindowState {
   Picture Background;
   std::vector<ControlState*> Controls;  // in the order of creation
   std::vector<TimerState*> Timers;
-  HWND Focus = nullptr;        // the control that has the keyboard while the window is active
-  HWND ToolTips = nullptr;     // made when the mouse first comes
-  std::vector<HWND> Disabled;  // the windows that this modal one has disabled
-  IconHandle LargeIcon, SmallIcon;
-  RECT LastPlace = {};  // once closed
+  HWND Focus = nullptr;             // the control that has the keyboard while the window is active
+  HWND ToolTips = nullptr;          // made when the mouse first comes
+  std::vector<HWND> Disabled;       // the windows that this modal one has disabled
+  IconHandle LargeIcon, SmallIcon;  // once its resolution is not the one that its class has an icon for
+  RECT LastPlace = {};              // once closed
   bool LastEnabled = true;
 };
 
@@ -39,6 +39,7 @@ struct ControlState {
   bool Enabled = true, Visible = true;
   bool NamedByToolTip = false;  // the native text is the tool tip
   bool WhiteGround = false;
+  bool Framed = false;  // something lies around its client area
   IconHandle Icon;
   Picture Shown;
   bool EnterIsKey = false;  // Enter goes to OnKey and not to the window
@@ -102,8 +103,8 @@ void SetNativeText(const ControlState& control, const std::string& text);
 // Tells the tool tips what the control's tip is, and where the control lies while it is disabled.
 void UpdateToolTip(const ControlState& control);
 
-// From now on the window has tool tips. They cost the start of the program more than its controls, so they wait for the
-// mouse.
+// From now on the window has tool tips. They cost the start of the program more than its controls, so they wait until
+// the mouse comes to a control that has one.
 void StartToolTips(WindowState& window);
 
 // Enter presses the button that has the keyboard; a key that is held down does so once.

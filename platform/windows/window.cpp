@@ -4,14 +4,26 @@
 namespace platform {
 namespace {
 
-void Centre(WindowState& window) {
-  MONITORINFO monitor{};
-  monitor.cbSize = sizeof monitor;
-  ::GetMonitorInfoA(::MonitorFromWindow(window.Handle, MONITOR_DEFAULTTOPRIMARY), &monitor);
+// In the middle of the primary monitor's work area.
+POINT CornerFor(const SIZE& size) {
+  RECT area = {};
+  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &area, 0);
+  return {area.left + (area.right - area.left - size.cx) / 2, area.top + (area.bottom - area.top - size.cy) / 2};
+}
+
+void Create(WindowState& window) {
+  window.Dpi = DpiOfScreen();
   const SIZE size = WindowSize(window.Style, window.Dpi);
-  const RECT& area = monitor.rcWork;
-  PlaceWindow(window, area.left + (area.right - area.left - size.cx) / 2,
-              area.top + (area.bottom - area.top - size.cy) / 2);
+  const POINT corner = CornerFor(size);
+  ::CreateWindowExA(0, WindowClass, window.Style.Caption.c_str(), NativeStyle(window.Style), corner.x, corner.y,
+                    size.cx, size.cy, nullptr, nullptr, ::GetModuleHandleA(nullptr), &window);
+}
+
+// The monitor may have another resolution than the screen as a whole.
+void FitToMonitor(WindowState& window) {
+  window.Dpi = DpiOfWindow(window.Handle);
+  const POINT corner = CornerFor(WindowSize(window.Style, window.Dpi));
+  PlaceWindow(window, corner.x, corner.y);
 }
 
 // Where the window is in screen pixels; of a minimized window, where it will be again.
@@ -34,6 +46,8 @@ RECT PlaceOf(const WindowState& window) {
 }
 
 void MoveTo(const WindowState& window, int left, int top) {
+  const RECT place = PlaceOf(window);
+  if (place.left == left && place.top == top) return;
   ::SetWindowPos(window.Handle, nullptr, left, top, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
@@ -43,12 +57,11 @@ Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(
   RegisterWindowClass();
   AllWindows().push_back(state_.get());
   if (style.Background != 0) state_->Background = LoadPictureResource(style.Background);
-  ::CreateWindowExA(0, WindowClass, style.Caption.c_str(), NativeStyle(style), CW_USEDEFAULT, CW_USEDEFAULT, 0, 0,
-                    nullptr, nullptr, ::GetModuleHandleA(nullptr), state_.get());
+  Create(*state_);
   if (state_->Handle == nullptr) return;
-  state_->Dpi = DpiOfWindow(state_->Handle);
-  Centre(*state_);
-  LayOutWindow(*state_);
+  const int before = state_->Dpi;
+  FitToMonitor(*state_);
+  if (state_->Dpi != before) LayOutWindow(*state_);
 }
 
 Window::~Window() {

@@ -32,11 +32,25 @@ void EraseBackground(const WindowState& window, HDC context) {
   ::RestoreDC(context, before);
 }
 
-// The keyboard goes back to the control that had it, and at first to the one that is first in order.
-void PassFocusOn(const WindowState& window) {
+// The keyboard goes back to the control that had it, and at first to the one that is first in order. False when the
+// window has to keep it.
+bool PassFocusOn(const WindowState& window) {
   HWND target = window.Focus;
   if (target == nullptr) target = ::GetNextDlgTabItem(window.Handle, nullptr, FALSE);
-  if (target != nullptr && ::IsWindowEnabled(target) && ::IsWindowVisible(target)) ::SetFocus(target);
+  if (target == nullptr || !::IsWindowEnabled(target) || !::IsWindowVisible(target)) return false;
+  ::SetFocus(target);
+  return true;
+}
+
+// Whether the window has become the active one, and stands on the screen.
+bool Activated(WPARAM wParam) { return LOWORD(wParam) != WA_INACTIVE && HIWORD(wParam) == 0; }
+
+IconHandle ProgramIcon(int side, int dpi) { return LoadIconFor(ICONE_PROGRAMA, side, dpi); }
+
+void ChangeIcon(IconHandle& icon, const WindowState& window, WPARAM size, int side) {
+  IconHandle next = ProgramIcon(side, window.Dpi);
+  ::SendMessageA(window.Handle, WM_SETICON, size, reinterpret_cast<LPARAM>(next.get()));
+  icon.swap(next);
 }
 
 void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
@@ -71,6 +85,15 @@ HBRUSH TextGround(const WindowState& window, HDC context, HWND sender) {
   return static_cast<HBRUSH>(::GetStockObject(WHITE_BRUSH));
 }
 
+// The mouse's own messages go past a control that is disabled; its place does not.
+bool MouseAsksForToolTip(const WindowState& window) {
+  POINT place = {};
+  ::GetCursorPos(&place);
+  ::ScreenToClient(window.Handle, &place);
+  const ControlState* control = FindControl(window, ::ChildWindowFromPoint(window.Handle, place));
+  return control != nullptr && !control->ToolTip.empty();
+}
+
 // Whether the message is answered here, and the answer.
 std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
@@ -92,11 +115,13 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
       EraseBackground(window, reinterpret_cast<HDC>(wParam));
       return {true, TRUE};
     case WM_SETCURSOR:  // also for its controls
-      StartToolTips(window);
+      if (window.ToolTips == nullptr && MouseAsksForToolTip(window)) StartToolTips(window);
       return {false, 0};
     case WM_TIMER:
       Tick(window, wParam);
       return {true, 0};
+    case WM_ACTIVATE:  // the window itself would be given the keyboard first
+      return {Activated(wParam) && PassFocusOn(window), 0};
     case WM_SETFOCUS:
       PassFocusOn(window);
       return {true, 0};
@@ -140,7 +165,9 @@ void RegisterWindowClass() {
     description.cbSize = sizeof description;
     description.lpfnWndProc = WindowProcedure;
     description.hInstance = ::GetModuleHandleA(nullptr);
-    description.hCursor = ::LoadCursorA(nullptr, MAKEINTRESOURCEA(32512));  // the arrow
+    description.hCursor = ::LoadCursorA(nullptr, MAKEINTRESOURCEA(32512));    // the arrow
+    description.hIcon = ProgramIcon(LargeIconSide, DpiOfScreen()).release();  // for as long as the program runs
+    description.hIconSm = ProgramIcon(SmallIconSide, DpiOfScreen()).release();
     description.lpszClassName = WindowClass;
     return ::RegisterClassExA(&description);
   }();
@@ -149,7 +176,12 @@ void RegisterWindowClass() {
 
 void PlaceWindow(WindowState& window, int left, int top) {
   const SIZE size = WindowSize(window.Style, window.Dpi);
-  ::SetWindowPos(window.Handle, nullptr, left, top, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
+  const RECT wanted = {left, top, left + size.cx, top + size.cy};
+  RECT place = {};
+  ::GetWindowRect(window.Handle, &place);
+  if (!::EqualRect(&place, &wanted)) {
+    ::SetWindowPos(window.Handle, nullptr, left, top, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
+  }
   // Not every version of Windows draws the frame in the window's own resolution.
   RECT client = {};
   ::GetClientRect(window.Handle, &client);
@@ -161,10 +193,8 @@ void PlaceWindow(WindowState& window, int left, int top) {
 }
 
 void LayOutWindow(WindowState& window) {
-  window.LargeIcon = LoadIconFor(ICONE_PROGRAMA, LargeIconSide, window.Dpi);
-  window.SmallIcon = LoadIconFor(ICONE_PROGRAMA, SmallIconSide, window.Dpi);
-  ::SendMessageA(window.Handle, WM_SETICON, ICON_BIG, reinterpret_cast<LPARAM>(window.LargeIcon.get()));
-  ::SendMessageA(window.Handle, WM_SETICON, ICON_SMALL, reinterpret_cast<LPARAM>(window.SmallIcon.get()));
+  ChangeIcon(window.LargeIcon, window, ICON_BIG, LargeIconSide);
+  ChangeIcon(window.SmallIcon, window, ICON_SMALL, SmallIconSide);
   for (ControlState* control : window.Controls) LayOutControl(*control);
   ::InvalidateRect(window.Handle, nullptr, TRUE);
 }

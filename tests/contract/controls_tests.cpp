@@ -31,6 +31,11 @@ TEST_F(Controls, SortedListKeepsTheOrderOfTheLanguageAndFindsWholeTextsWithoutCa
   for (ListBox* box : {&sorted, &plain}) {
     for (const string& text : added) box->Add(text);
     EXPECT_EQ(TextsOf(*box), box == &sorted ? order : added);
+    box->Fill({added.begin() + 1, added.end()});
+    box->Add(added[0]);
+    EXPECT_EQ(TextsOf(*box).back(), box == &sorted ? order.back() : added[0]);
+    box->Fill(added);
+    EXPECT_EQ(TextsOf(*box), box == &sorted ? order : added);
     EXPECT_EQ(box->Text(-1) + box->Text(box->Count()), "");
   }
   for (std::size_t i = 1; i < order.size(); ++i) EXPECT_LT(CompareStringA(order[i - 1], order[i]), 0) << i;
