@@ -33,10 +33,13 @@ HFONT CreateFontFor(const Font& font, int dpi) {
 // It stays the same for as long as the program runs.
 int DpiOfScreen() {
   static const int dpi = [] {
+    if (const auto ofSystem = SystemFunction<UINT WINAPI()>("user32.dll", "GetDpiForSystem")) {
+      return static_cast<int>(ofSystem());
+    }
     const HDC screen = ::GetDC(nullptr);
-    const int pixels = ::GetDeviceCaps(screen, LOGPIXELSX);
+    const int ofScreen = ::GetDeviceCaps(screen, LOGPIXELSX);
     ::ReleaseDC(nullptr, screen);
-    return pixels;
+    return ofScreen;
   }();
   return dpi > 0 ? dpi : UsualDpi;
 }
