@@ -1,10 +1,12 @@
-// From the start of a program to its window: Tolvaris with a list of games, in turn with an empty window.
-//   start_benchmark TOLVARIS EMPTY_WINDOW ENTRIES ROUNDS
-// For each start it prints the program's title, a tab and the milliseconds, and waits for a line before it closes the
-// window, so that the process can be looked at meanwhile.
+// Sees the windows of other programs come, and closes them.
+//
+// Each line of its input names a window: its title, a tab, and the number of entries that its list must hold (0: it has
+// none). Once it stands the answer is "stands"; after another line of input the window is closed, and the answer is
+// "closed" when its program has ended. A window stands when it is visible and its program answers a message.
 #include <windows.h>
 
 #include <cstdlib>
+#include <iostream>
 #include <string>
 
 #include "benchmarks/median.h"
@@ -16,16 +18,21 @@ using namespace benchmarks;
 constexpr double Limit = 30000;     // milliseconds
 constexpr DWORD PauseOfSearch = 4;  // the search asks the same server as the program that starts
 
-struct Program {
-  std::string Path, Title;
-  int Entries;  // that its list must hold
+struct Wanted {
+  std::string Title;
+  int Entries;
 };
 
 struct Search {
-  DWORD Process;
-  const Program& Wanted;
+  const Wanted& For;
   HWND Found;
 };
+
+// A program answers once it has shown and painted its window and waits for its user.
+bool Answers(HWND window) {
+  DWORD_PTR answer = 0;
+  return ::SendMessageTimeoutA(window, WM_NULL, 0, 0, SMTO_NORMAL, static_cast<UINT>(Limit), &answer) != 0;
+}
 
 bool ListStands(HWND window, int entries) {
   if (entries == 0) return true;
@@ -35,59 +42,47 @@ bool ListStands(HWND window, int entries) {
 
 BOOL CALLBACK LookAt(HWND window, LPARAM parameter) {
   auto& search = *reinterpret_cast<Search*>(parameter);
-  DWORD process = 0;
-  ::GetWindowThreadProcessId(window, &process);
-  if (process != search.Process || !::IsWindowVisible(window)) return TRUE;
+  if (!::IsWindowVisible(window)) return TRUE;
   char title[64] = "";
   ::GetWindowTextA(window, title, sizeof title);
-  if (title != search.Wanted.Title || !ListStands(window, search.Wanted.Entries)) return TRUE;
+  if (title != search.For.Title || !Answers(window) || !ListStands(window, search.For.Entries)) return TRUE;
   search.Found = window;
   return FALSE;
 }
 
-HWND FindWindowOf(DWORD process, const Program& program) {
-  Search search{process, program, nullptr};
-  ::EnumWindows(LookAt, reinterpret_cast<LPARAM>(&search));
+HWND WaitForWindow(const Wanted& wanted) {
+  const Stopwatch watch;
+  Search search{wanted, nullptr};
+  while (watch.Milliseconds() < Limit) {
+    ::EnumWindows(LookAt, reinterpret_cast<LPARAM>(&search));
+    if (search.Found != nullptr) break;
+    ::Sleep(PauseOfSearch);
+  }
   return search.Found;
 }
 
-// The milliseconds until the window stands, or -1.
-double Start(const Program& program) {
-  std::string command = "\"" + program.Path + "\"";
-  STARTUPINFOA start{};
-  start.cb = sizeof start;
-  PROCESS_INFORMATION process{};
-  const Stopwatch watch;
-  if (!::CreateProcessA(nullptr, command.data(), nullptr, nullptr, FALSE, 0, nullptr, nullptr, &start, &process)) {
-    return -1;
-  }
-  HWND window = nullptr;
-  while (!window && watch.Milliseconds() < Limit) {
-    window = FindWindowOf(process.dwProcessId, program);
-    if (!window) ::Sleep(PauseOfSearch);
-  }
-  const double milliseconds = window ? watch.Milliseconds() : -1;
-  std::printf("%s\t%.3f\n", program.Title.c_str(), milliseconds);
-  std::fflush(stdout);
-  std::getchar();
+bool Close(HWND window) {
+  DWORD id = 0;
+  ::GetWindowThreadProcessId(window, &id);
+  const HANDLE process = ::OpenProcess(SYNCHRONIZE, FALSE, id);
   ::PostMessageA(window, WM_CLOSE, 0, 0);
-  if (::WaitForSingleObject(process.hProcess, static_cast<DWORD>(Limit)) != WAIT_OBJECT_0) {
-    ::TerminateProcess(process.hProcess, 1);
-  }
-  ::CloseHandle(process.hThread);
-  ::CloseHandle(process.hProcess);
-  return milliseconds;
+  const bool ended = ::WaitForSingleObject(process, static_cast<DWORD>(Limit)) == WAIT_OBJECT_0;
+  ::CloseHandle(process);
+  return ended;
 }
 
 }  // namespace
 
-int main(int count, char** arguments) {
-  if (count != 5) return 2;
-  const Program programs[] = {{arguments[1], "Tolvaris", std::atoi(arguments[3])}, {arguments[2], "Empty window", 0}};
-  for (int round = std::atoi(arguments[4]); round > 0; --round) {
-    for (const Program& program : programs) {
-      if (Start(program) < 0) return 1;
-    }
+int main() {
+  for (std::string line; std::getline(std::cin, line);) {
+    const std::size_t tab = line.find('\t');
+    if (tab == std::string::npos) return 2;
+    const HWND window = WaitForWindow({line.substr(0, tab), std::atoi(line.c_str() + tab)});
+    if (window == nullptr) return 1;
+    std::cout << "stands" << std::endl;
+    std::getline(std::cin, line);
+    if (!Close(window)) return 1;
+    std::cout << "closed" << std::endl;
   }
   return 0;
 }
