@@ -44,10 +44,6 @@ def build(name, dos_name, crc_text, picture, rom):
     return b"".join(line + b"\r\n" for line in lines) + MARKER + picture + rom
 
 
-def names_plain_file(name):
-    return not re.search(rb"[\x00-\x1f\\/:]", name) and not DEVICE.match(name)
-
-
 def number(text):
     text = text.strip(b" \t")
     if not re.fullmatch(rb"[0-9]+", text) or not 1 <= int(text) <= LARGEST:
@@ -57,13 +53,10 @@ def number(text):
 
 def parse(content):
     """Name, DOS name, checksum text, picture and ROM, all as bytes."""
-    if content[:8].upper() != b"TOLVARIS":
-        raise Refused("no magic")
-    end = content[:HEADER_LIMIT].upper().find(MARKER)
-    if end < 0:
-        raise Refused("no marker")
-    end += len(MARKER)
-    header = content[:end]
+    marker = re.search(re.escape(MARKER), content[:HEADER_LIMIT], re.IGNORECASE)
+    if content[:8].upper() != b"TOLVARIS" or not marker:
+        raise Refused("no magic or no marker")
+    header = content[:marker.end()]
 
     def value(key):
         found = re.search(re.escape(key) + rb"(.*?)\r\n", header, re.IGNORECASE | re.DOTALL)
@@ -74,9 +67,9 @@ def parse(content):
     name, dos_name, crc_text = value(b"NOME="), value(b"NOMEDOS="), value(b"CRC=")
     blocks = []
     for start_key, length_key in ((b"IIMG=", b"TIMG="), (b"IROM=", b"TROM=")):
-        start = end + number(value(start_key)) - 1
+        start = len(header) + number(value(start_key)) - 1
         blocks.append(content[start:start + number(value(length_key))])
-    if not names_plain_file(name) or not names_plain_file(dos_name):
+    if any(re.search(rb"[\x00-\x1f\\/:]", text) or DEVICE.match(text) for text in (name, dos_name)):
         raise Refused("a name that leaves its directory")
     return name, dos_name, crc_text, blocks[0], blocks[1]
 

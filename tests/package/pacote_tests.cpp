@@ -1,10 +1,16 @@
+// The package format.
 #include <gtest/gtest.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <algorithm>
-#include <numeric>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
 #include <random>
 #include <string>
 
+#include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/text.h"
 
@@ -16,9 +22,7 @@ const std::string Exemplo =
 
 // The example with one piece of it replaced by another.
 std::string ExemploCom(const std::string& de, const std::string& para) {
-  const std::size_t lugar = Exemplo.find(de);
-  EXPECT_NE(lugar, std::string::npos) << de;
-  return std::string(Exemplo).replace(lugar, de.size(), para);
+  return std::string(Exemplo).replace(Exemplo.find(de), de.size(), para);
 }
 
 std::string Montar(const std::string& nome, const std::string& dosName, const std::string& crc = "1",
@@ -26,9 +30,7 @@ std::string Montar(const std::string& nome, const std::string& dosName, const st
   return MontarPacote(nome, dosName, crc, std::ssize(imagem), std::ssize(rom), imagem, rom);
 }
 
-bool Lido(const std::string& conteudo) { return LerPacote(conteudo).has_value(); }
-
-// The five pieces between bars.
+// The five pieces that are read, between bars.
 std::string Pecas(const std::string& conteudo) {
   const auto lido = LerPacote(conteudo);
   if (!lido) return "refused";
@@ -38,103 +40,128 @@ std::string Pecas(const std::string& conteudo) {
 TEST(Pacote, TheExampleIsWrittenAndReadByteForByte) {
   EXPECT_EQ(MontarPacote("Super Jogo", "SUPERJOG", "-873187034", 6, 9, "GIF89a", "123456789"), Exemplo);
   EXPECT_EQ(Pecas(Exemplo), "Super Jogo|SUPERJOG|-873187034|GIF89a|123456789");
-  EXPECT_EQ(LerPacote(Exemplo)->Rom.data(), Exemplo.data() + 110) << "a block is a part of the content, not a copy";
   EXPECT_EQ(MontarPacote("", "", "", 0, 5'000'000'000, "", "R"),
             "TOLVARIS\r\nNOME=\r\nNOMEDOS=\r\nCRC=\r\niIMG=1\r\ntIMG=0\r\niROM=1\r\ntROM=5000000000\r\n|IMGROMDAT|R");
 }
 
-// The reader's whole judgement: the same package with one piece replaced.
-TEST(Pacote, WhatIsReadAndWhatIsRefused) {
-  const std::pair<const char*, const char*> lidos[] = {
-      {"TOLVARIS", "tolvaris"},
-      {"TOLVARIS\r\n", "Tolvaris"},  // no line end is asked for there
-      {"|IMGROMDAT|", "|imgRomDat|"},
-      {"NOME=", "nOmE="},
-      {"iIMG=1\r\ntIMG=6\r\n", "TIMG=6\r\n\r\nlixo\r\nIimg=1\r\n"},  // any order, other lines between
-      {"Super Jogo", ""},
-      {"SUPERJOG", ""},
-      {"-873187034", ""},
-      {"tROM=9", "tROM=2147483647"},
-      {"iROM=7", "iROM=2147483647"},
-      {"tIMG=6", "tIMG= \t0006 "},
-  };
-  for (const auto& [de, para] : lidos) EXPECT_TRUE(Lido(ExemploCom(de, para))) << de << " -> " << para;
-  const std::pair<const char*, const char*> recusados[] = {
-      {"TOLVARIS", "TOLVARIZ"},   {"TOLVARIS", " TOLVARIS"}, {"|IMGROMDAT|", "|IMGROMDAT"}, {"iIMG=1", "iIMG=0"},
-      {"tROM=9\r\n", "tROM=9\n"}, {"tROM=9\r\n", "tROM=9"},  {"iROM=7", "iROM=0"},          {"tROM=9", "tROM=0"},
-  };
-  for (const auto& [de, para] : recusados) EXPECT_FALSE(Lido(ExemploCom(de, para))) << de << " -> " << para;
-  for (const std::string chave : {"NOME", "NOMEDOS", "CRC", "iIMG", "tIMG", "iROM", "tROM"}) {
-    EXPECT_FALSE(Lido(ExemploCom(chave + "=", chave + "x="))) << chave;
-  }
-  for (const std::string numero :
-       {"", "  ", "+6", "-6", "6.0", "0x6", "6 6", "0", "2147483648", "4294967297", "18446744073709551617"}) {
-    EXPECT_FALSE(Lido(ExemploCom("tIMG=6", "tIMG=" + numero))) << numero;
-  }
-  EXPECT_FALSE(LerPacote(std::string_view()));
-  for (std::size_t tamanho = 0; tamanho < Exemplo.size(); ++tamanho) {
-    EXPECT_EQ(Lido(Exemplo.substr(0, tamanho)), tamanho >= Exemplo.find("GIF89a")) << tamanho;
-  }
-  const std::size_t sobra = 10'240 - Montar("", "", "1", "", "").size();  // the marker has to end within 10,240 bytes
-  EXPECT_TRUE(Lido(Montar(std::string(sobra, 'x'), "")));
-  EXPECT_FALSE(Lido(Montar(std::string(sobra + 1, 'x'), "")));
-}
-
-TEST(Pacote, BlocksAreCutShortWhereTheContentEnds) {
+TEST(Pacote, IsReadInEveryFormThatTheFormatAllows) {
   const char* const casos[][3] = {
-      {"123456789", "1234", "GIF89a|1234"},
-      {"123456789", "", "GIF89a|"},
-      {"GIF89a123456789", "GI", "GI|"},
+      {"TOLVARIS\r\n", "Tolvaris", "GIF89a|123456789"},  // no line end is asked for there
+      {"|IMGROMDAT|", "|imgRomDat|", "GIF89a|123456789"},
+      {"CRC=", "lixo\r\ncrC=", "GIF89a|123456789"},
+      {"iIMG=1\r\ntIMG=6", "TIMG= \t06 \r\niIMG=1", "GIF89a|123456789"},
+      // blocks may overlap, and are cut short where the content ends
+      {"iIMG=1", "iIMG=4", "89a123|123456789"},
       {"123456789", "123456789 and more", "GIF89a|123456789"},
+      {"GIF89a123456789", "GI", "GI|"},
       {"tROM=9", "tROM=2147483647", "GIF89a|123456789"},
       {"iROM=7", "iROM=2147483647", "GIF89a|"},
-      {"iROM=7", "iROM=15", "GIF89a|9"},
-      {"iROM=7", "iROM=16", "GIF89a|"},
-      {"iIMG=1", "iIMG=4", "89a123|123456789"},  // blocks may overlap
   };
   for (const auto& [de, para, blocos] : casos) {
     EXPECT_EQ(Pecas(ExemploCom(de, para)), std::string("Super Jogo|SUPERJOG|-873187034|") + blocos) << para;
   }
+  // A key is searched in the whole header: a name that holds one answers for the line that the key belongs to.
+  EXPECT_EQ(Pecas(Montar("Jogo Nomedos=OUTRO", "JOGO", "")), "Jogo Nomedos=OUTRO|OUTRO||I|R");
+  EXPECT_EQ(Pecas(Montar("", "TROM=2", "7", "I", "ROM")), "|TROM=2|7|I|RO");
 }
 
-// A key is searched in the whole header, so a name that holds one answers for the line that the key belongs to.
-TEST(Pacote, AKeyInsideANameCapturesTheSearch) {
-  EXPECT_EQ(Pecas(Montar("Jogo Crc=5", "JOGO", "7")), "Jogo Crc=5|JOGO|5|I|R");
-  EXPECT_EQ(Pecas(Montar("Jogo nomedos=OUTRO", "JOGO")), "Jogo nomedos=OUTRO|OUTRO|1|I|R");
-  EXPECT_EQ(Pecas(Montar("Jogo", "TROM=2", "7", "I", "ROM")), "Jogo|TROM=2|7|I|RO");
-  EXPECT_FALSE(Lido(Montar("Jogo nomedos=..\\OUTRO", "JOGO"))) << "what was captured is checked like the line itself";
-  EXPECT_FALSE(Lido(Montar("Jogo |ImgRomDat|", "JOGO"))) << "the header ends inside the name";
+TEST(Pacote, WhatIsRefused) {
+  const std::pair<const char*, const char*> casos[] = {
+      {"TOLVARIS", "TOLVARIZ"},      {"TOLVARIS", " TOLVARIS"},     {"|IMGROMDAT|", "|IMGROMDAT"},
+      {"NOME=", "NOMEx="},           {"NOMEDOS=", "NOMEDOSx="},     {"CRC=", "CRCx="},
+      {"iIMG=", "iIMGx="},           {"tIMG=", "tIMGx="},           {"iROM=", "iROMx="},
+      {"tROM=", "tROMx="},           {"tROM=9\r\n", "tROM=9\n"},    {"iIMG=1", "iIMG=0"},
+      {"iROM=7", "iROM=0"},          {"tROM=9", "tROM=0"},          {"tIMG=6", "tIMG=0"},
+      {"tIMG=6", "tIMG=  "},         {"tIMG=6", "tIMG=+6"},         {"tIMG=6", "tIMG=-6"},
+      {"tIMG=6", "tIMG=2147483648"}, {"tIMG=6", "tIMG=4294967297"}, {"tIMG=6", "tIMG=18446744073709551617"},
+      {"=SUPERJOG", "=..\\JOGO"},    {"=Super Jogo", "=../JOGO"},   {"=Super", "=nomedos=C:"},
+  };
+  for (const auto& [de, para] : casos) EXPECT_EQ(Pecas(ExemploCom(de, para)), "refused") << de << " -> " << para;
+  for (std::size_t tamanho = 0; tamanho < Exemplo.size(); ++tamanho) {
+    EXPECT_EQ(Pecas(Exemplo.substr(0, tamanho)) != "refused", tamanho >= Exemplo.find("GIF89a")) << tamanho;
+  }
+  const std::size_t sobra = 10'240 - Montar("", "", "1", "", "").size();  // the marker has to end within 10,240 bytes
+  EXPECT_NE(Pecas(Montar(std::string(sobra, 'x'), "")), "refused");
+  EXPECT_EQ(Pecas(Montar(std::string(sobra + 1, 'x'), "")), "refused");
 }
 
 // An extension always follows, so ".." leads nowhere; and what the platform refuses by itself is left to it.
-TEST(Pacote, ANameThatWouldLeaveItsDirectoryIsRefused) {
+TEST(NomeDeArquivo, IsNoneThatWouldLeaveItsDirectory) {
   const std::string levamFora[] = {"..\\JOGO", "../JOGO", "\\JOGO",  "C:JOGO", "JO:oculto",    "JO\tGO",
                                    "JO\nGO",   "\x1F",    "CON",     "nul",    "Aux.txt",      "PRN  .x",
                                    "com1",     "LPT9",    "COM\xB2", "CONIN$", {"JO.exe\0", 7}};
-  const std::string ficam[] = {"CONTRA",       "COM10", "COMX",        "LPT",         "Super CON",
-                               " CON",         "..",    "Jogo Bros. ", "Quem? *<>\"", "Ação|Pão=1"_ansi,
-                               "& 2 [!] (BR)", "'x' ~1"};
-  for (const auto& fora : levamFora) EXPECT_FALSE(Lido(Montar(fora, "JOGO")) || Lido(Montar("Jogo", fora))) << fora;
-  for (const auto& fica : ficam) EXPECT_TRUE(Lido(Montar(fica, "JOGO")) && Lido(Montar("Jogo", fica))) << fica;
+  const std::string ficam[] = {
+      "CONTRA", "COM10", "COMX", "LPT", "Super CON", " CON", "..", "Jogo Bros. ", "Quem? *<>\"", "Ação|Pão=1"_ansi,
+  };
+  for (const auto& fora : levamFora) EXPECT_FALSE(NomeDeArquivo(fora)) << fora;
+  for (const auto& fica : ficam) EXPECT_TRUE(NomeDeArquivo(fica)) << fica;
 }
 
 TEST(Pacote, WhatIsWrittenIsReadBack) {
+  std::mt19937 acaso(3);
+  const auto sorteado = [&](const std::string& alfabeto, std::size_t maior) {
+    std::string texto(1 + acaso() % maior, ' ');
+    std::ranges::generate(texto, [&] { return alfabeto[acaso() % alfabeto.size()]; });
+    return texto;
+  };
   // Every key needs one of E, S, C, G and M before its "=", so these letters never make one.
   const std::string letras = "abdfhijklnopqrtuvwxyzABDFHIJKLNOPQRTUVWXYZ 0123456789|=.,-'()[]!&~áÉçÃôÜñÿ"_ansi;
-  std::string bytes(256, '\0');
-  std::iota(bytes.begin(), bytes.end(), '\0');
-  std::mt19937 acaso(3);
-  const auto texto = [&](const std::string& alfabeto, std::size_t menor, std::size_t maior) {
-    std::string resultado(menor + acaso() % maior, ' ');
-    std::ranges::generate(resultado, [&] { return alfabeto[acaso() % alfabeto.size()]; });
-    return resultado;
-  };
+  const std::string bytes("\0\r\n\t\x1A\xFF|IMGROMDAT|=", 18);
   for (int vez = 0; vez < 500; ++vez) {
-    const std::string nome = texto(letras, 0, 300), dosName = texto(letras, 0, 40), crc = texto(letras, 0, 12);
-    const std::string imagem = texto(bytes, 1, 5'000), rom = texto(bytes, 1, 5'000);
-    EXPECT_TRUE(Pecas(Montar(nome, dosName, crc, imagem, rom)) ==
-                nome + "|" + dosName + "|" + crc + "|" + imagem + "|" + rom)
-        << nome << " / " << dosName;
+    const std::string nome = sorteado(letras, 300), dosName = sorteado(letras, 40), crc = sorteado(letras, 12);
+    const std::string imagem = "|IMGROMDAT|" + sorteado(bytes, 5'000), rom = sorteado(bytes, 5'000);
+    const std::string pecas = nome + "|" + dosName + "|" + crc + "|" + imagem + "|" + rom;
+    EXPECT_TRUE(Pecas(Montar(nome, dosName, crc, imagem, rom)) == pecas) << nome << " / " << dosName;
+  }
+}
+
+// Beside pacote.py, which was written from the format alone.
+struct PacotePython : testing::Test {
+  PacotePython() {
+    std::filesystem::create_directories(Pasta);
+    std::filesystem::current_path(Pasta);
+  }
+  ~PacotePython() override { std::filesystem::remove_all(Pasta); }
+
+  static void Gravar(const char* nome, const std::string& bytes) { std::ofstream(nome, std::ios::binary) << bytes; }
+
+  static std::string Ler(const char* nome) {
+    std::ifstream arquivo(nome, std::ios::binary);
+    return {std::istreambuf_iterator<char>(arquivo), {}};
+  }
+
+  // The exit code; what was printed is in the file "saida".
+  static int Rodar(const std::string& argumentos) {
+    const std::string comando = "LC_ALL=C.UTF-8 python3 '" TOLVARIS_PACOTE_PY "' " + argumentos;
+    const int estado = std::system((comando + " >saida 2>/dev/null").c_str());
+    return WIFEXITED(estado) ? WEXITSTATUS(estado) : -1;
+  }
+
+  const std::string Pasta = std::filesystem::temp_directory_path() / ("tolvaris-pacote-" + std::to_string(getpid()));
+};
+
+TEST_F(PacotePython, EachReadsWhatTheOtherWrites) {
+  const std::string nome = "Ação & Emoção (B) [!] - não|é=isso", dosName = "AÇÃO~1";  // in UTF-8
+  const std::string imagem("\0\r\n|IMGROMDAT|\0\r\nCRC=1\r\n", 24);
+  std::string rom(2'500'000, '\0');
+  std::ranges::generate(rom, [acaso = std::mt19937(7)]() mutable { return static_cast<char>(acaso()); });
+  const std::string crc = TextoCRC(cls_CRC().CRC(rom).value_or(0));
+  const std::string nosso = Montar(platform::FromUtf8(nome), platform::FromUtf8(dosName), crc, imagem, rom);
+  Gravar("nosso", nosso);
+  EXPECT_EQ(Rodar("ler nosso imagem rom"), 0);
+  EXPECT_EQ(Ler("saida"), nome + "\n" + dosName + "\n" + crc + "\n" + crc + "\n");
+  EXPECT_EQ(Rodar("montar deles '" + nome + "' '" + dosName + "' imagem rom"), 0);
+  EXPECT_TRUE(Ler("deles") == nosso && LerPacote(nosso));
+}
+
+TEST_F(PacotePython, BothRefuseTheSamePackages) {
+  const std::string inicio = "TOLVARISNOME=A\r\nNOMEDOS=",
+                    fim = "\r\niIMG= 1\r\nTIMG=01\t\r\niROM=2\r\ntROM=99\r\n|imgromdat|IR";
+  for (const std::string meio :
+       {"B\r\ncrc=1", "B CRC=5", "B\r\nC=1", ".\\\r\nCRC=1", "Lpt1 .\r\nCRC=1", "\r\nCRC=\r\ntROM=2147483648"}) {
+    const std::string pacote = inicio + meio + fim;
+    Gravar("pacote", pacote);
+    EXPECT_EQ(Rodar("ler pacote"), LerPacote(pacote) ? 0 : 3) << pacote;
   }
 }
 
