@@ -11,7 +11,6 @@ TEST(EspacoLivre, CountsIn32BitsAndTrustsEveryDiskButTheFloppy) {
       {"A:\\X.srm", Disco{8, 512, 524288, 524288}, 0},        {"A:\\X.srm", std::nullopt, 0},
       {"a:\\X.srm", Disco{1, 512, 0, 2847}, UmGiB},           {"a:\\X.srm", std::nullopt, UmGiB},
       {"C:\\X.srm", Disco{8, 512, 524287, Tudo}, 2147479552}, {"C:\\X.srm", Disco{8, 512, 524288, Tudo}, UmGiB},
-      {"C:\\X.srm", Disco{8, 512, Tudo, Tudo}, UmGiB},        {"C:\\X.srm", Disco{8, 512, 0, 2000}, UmGiB},
       {"A:\\X.srm", Disco{5, 1u << 30, 3435973837, Tudo}, 0},  // 2 to the 64th and 1 GiB
       {"\\\\casa\\saves\\X.srm", std::nullopt, UmGiB},        {"", std::nullopt, UmGiB},
   };
