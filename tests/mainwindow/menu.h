@@ -1,40 +1,37 @@
-// A configured installation on the machine in memory, and the main window on it.
+// A configured installation with three games on the machine in memory, and the main window on it.
 #pragma once
 
 #include <gtest/gtest.h>
 
+#include <map>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
+#include "package/pacote.h"
 #include "platform/simulated/simulated.h"
 #include "platform/text.h"
 
 namespace menu {
 
 using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
-using platform::Answer;
-using platform::Buttons;
-using platform::Icon;
+using platform::Answer, platform::Buttons, platform::Icon;
+using Texts = std::vector<std::string>;
+using Files = std::map<std::string, std::optional<std::string>>;  // contents by full path
 
 inline const std::string Key = "Software\\Roms\\Tolvaris";
-inline const std::string Home = "C:\\Tolvaris\\";
-inline const std::string Emulator = "C:\\Emu\\zsnesw.exe";
-inline const std::string EmulatorConfig = "C:\\Emu\\zsnesw.cfg";
+inline const std::string Home = "C:\\Tolvaris\\", Roms = Home + "Roms\\", Imgs = Home + "Imgs\\";
+inline const std::string Emulator = "C:\\Emu\\zsnesw.exe", EmulatorConfig = "C:\\Emu\\zsnesw.cfg";
+inline const std::string Rom = "123456789";
 
-// A bitmap of one pixel.
-inline std::string Bitmap(char shade) {
-  std::string bytes(58, '\0');
-  const auto put = [&bytes](std::size_t at, unsigned value) {
-    for (std::size_t i = 0; i < 4; ++i) bytes[at + i] = static_cast<char>(value >> (8 * i));
-  };
-  bytes[0] = 'B', bytes[1] = 'M';
-  put(2, 58), put(10, 54), put(14, 40), put(18, 1), put(22, 1), put(34, 4);
-  bytes[26] = 1, bytes[28] = 24;
-  bytes[54] = bytes[55] = bytes[56] = shade;
-  return bytes;
+// A package with the checksum of Rom.
+inline std::string Package(const std::string& name, const std::string& dosName, const std::string& picture = "figura",
+                           const std::string& rom = Rom) {
+  return MontarPacote(name, dosName, "-873187034", static_cast<std::int64_t>(picture.size()),
+                      static_cast<std::int64_t>(rom.size()), picture, rom);
 }
 
 class Menu : public testing::Test {
@@ -42,17 +39,22 @@ class Menu : public testing::Test {
   Menu() { SetUpMachine(); }
   ~Menu() override { End(); }
 
-  static void SetUpMachine() {
-    Reset();
-    PutText(Key, "EmuExe", Emulator);
-    PutText(Key, "EmuCFG", EmulatorConfig);
-    PutText(Key, "AvisoControle", "1");
-    PutText(Key, "AvisoALTF4", "1");
-    PutFile(Emulator, "MZ");
-  }
   void End() {
     form.reset();
     Catalogo().Fechar();
+  }
+
+  void SetUpMachine() {
+    End();
+    Reset();
+    for (const char* shown : {"AvisoControle", "AvisoALTF4"}) PutText(Key, shown, "1");
+    PutText(Key, "EmuExe", Emulator);
+    PutText(Key, "EmuCFG", EmulatorConfig);
+    PutFile(Emulator, "MZ");
+    PutFile(EmulatorConfig, "x\r\nSaveDirectory = C:\\Somewhere\\else\\before\r\nGameDirectory = C:\\Old2\r\ny");
+    PutFile(Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura|");
+    for (const char* rom : {"SUPERJOG.zip", "SEMFIG.SMC", "Nome comprido.smc"}) PutFile(Roms + rom, Rom);
+    for (const char* picture : {"Super Jogo.gif", "Nome comprido.bmp"}) PutFile(Imgs + picture, "figura");
   }
 
   // Starts the program; false when it ended before its window was to be shown.
@@ -63,43 +65,45 @@ class Menu : public testing::Test {
     return goesOn;
   }
 
-  static void PutRom(const std::string& file, const std::string& content = "rom") {
-    PutFile(Home + "Roms\\" + file, content);
+  // Starts the program and selects a game as the user would.
+  void StartAndPick(const std::string& name) {
+    ASSERT_TRUE(Start());
+    Pick(name);
   }
-  static void PutCatalogue(const std::string& content) { PutFile(Home + "tolvaris.dat", content); }
-  static std::string Catalogue() { return Content(Home + "tolvaris.dat").value_or(""); }
 
-  // Selects a game as the user would.
   void Pick(const std::string& name) const {
     const int index = form->List1.FindExact(name);
     ASSERT_GE(index, 0) << name;
     Choose(form->List1, index);
   }
 
-  std::vector<std::string> Names() const {
-    std::vector<std::string> names;
-    for (int i = 0; i < form->List1.Count(); ++i) names.push_back(form->List1.Text(i));
-    return names;
+  // Clicks a command that shows a file dialog, and chooses the path there.
+  static void ChooseFile(platform::Button& command, const std::string& path) {
+    QueueFileDialog(path);
+    Click(command);
   }
 
-  // The commands that are enabled, in the order of their numbers, then "k" for Check1, "l" for the list and "i" for a
-  // shown picture: "234kli" is a window with nothing selected.
+  static Files Standing() {
+    Files files;
+    for (const std::string& path : AllFiles()) files[path] = Content(path);
+    return files;
+  }
+
+  std::string Selected() const { return form->List1.Text(form->List1.Selected()); }
+
+  // The commands that are enabled by their numbers, then "k" for Check1, "l" for the list and "i" for a shown picture.
   std::string States() const {
-    std::string states;
-    const platform::Button* commands[] = {&form->Command1, &form->Command2, &form->Command3,
-                                          &form->Command4, &form->Command5, &form->Command6};
-    for (int i = 0; i < 6; ++i) {
-      if (commands[i]->Enabled()) states += static_cast<char>('1' + i);
-    }
-    if (form->Check1.Enabled()) states += 'k';
-    if (form->List1.Enabled()) states += 'l';
-    if (form->Image1.Visible()) states += 'i';
-    return states;
+    const platform::Control* controls[] = {&form->Command1, &form->Command2, &form->Command3, &form->Command4,
+                                           &form->Command5, &form->Command6, &form->Check1,   &form->List1};
+    std::string letters;
+    for (std::size_t i = 0; i < std::size(controls); ++i) letters.append(controls[i]->Enabled() ? 1 : 0, "123456kl"[i]);
+    if (form->Image1.Visible()) letters += 'i';
+    return letters;
   }
 
   // The messages shown since the last call, as "title: text".
-  static std::vector<std::string> Messages() {
-    std::vector<std::string> texts;
+  static Texts Messages() {
+    Texts texts;
     for (const ShownMessage& each : ShownMessages()) texts.push_back(each.Title + ": " + each.Text);
     ForgetMessages();
     return texts;
@@ -108,9 +112,6 @@ class Menu : public testing::Test {
   std::unique_ptr<Form1> form;
 };
 
-using Texts = std::vector<std::string>;
-
-inline constexpr char NothingSelected[] = "234kli";
-inline constexpr char GameSelected[] = "123456kli";
+inline constexpr char NothingSelected[] = "234kli", GameSelected[] = "123456kli";
 
 }  // namespace menu

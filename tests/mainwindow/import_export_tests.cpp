@@ -1,0 +1,143 @@
+#include "tests/mainwindow/menu.h"
+
+namespace menu {
+namespace {
+
+using namespace std::string_literals;
+
+const std::string Added = "Ok: Jogo adicionado com sucesso.", Saved = "Ok: Arquivo salvo.";
+const std::string ReadError = "Erro: Erro ao ler arquivo.", WriteError = "Erro: Erro ao gravar arquivo.";
+const std::string ExportError = "Erro: Erro ao salvar arquivo.";
+const std::string Corrupt =
+    "Erro: Houve uma diferença na medição dos códigos CRC.\r\nEssa mudança indica que o arquivo está corrompido."_ansi;
+const std::string ReplaceGame = "Confirmar: O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?"_ansi;
+const std::string ReplaceFile = "Confirmar: Arquivo já existente.\r\n\r\nSubstituir ?"_ansi;
+const std::string WithoutChecksum(1048576, 'x');  // a length that has none
+
+// What happens before the command is given.
+using Before = std::function<void()>;
+const Before Nothing = [] {}, Yes = [] { QueueAnswer(Answer::Yes); }, No = [] { QueueAnswer(Answer::No); };
+const Before FullDisk = [] {  // and the user says yes
+  Yes();
+  SetFreeSpace('C', 3);
+};
+
+Before Locked(const std::string& path) {
+  return [path] { LockFile(path); };
+}
+
+// As if the disk held something else than what was written.
+void AlterOnceWritten(const std::string& path) {
+  if (Content(path)) return PutFile(path, "other");
+  QueueEvent([path] { AlterOnceWritten(path); });
+}
+
+class Import : public Menu {};
+
+TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
+  const Before altered = [] { AlterOnceWritten(Roms + "NOVO.zip"); };
+  const Files package = {{Roms + "ação.zip"_ansi, Rom},
+                         {Imgs + "Ação=Jogo.gif"_ansi, "figura"},
+                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||AÇÃO=Ação=Jogo|"_ansi}};
+  const Files replaced = {{Roms + "SUPERJOG.zip", Rom}, {Imgs + "Super Jogo.gif", "new"}};
+  const Files unchecked = {{Roms + "LONGO.zip", WithoutChecksum}, {Imgs + "Longo.gif", "figura"}};
+  const struct {
+    std::string Path, Content;
+    Texts Shown;
+    std::string Selected = {};
+    Files New = {};  // what stands there afterwards, beside what stood there
+    Before Happens = Nothing;
+  } cases[] = {
+      {"D:\\NOVO.SMC", "rom", {Added}, "NOVO", {{Roms + "NOVO.SMC", "rom"}}},
+      {"D:\\a.b.zip", "zip", {Added}, "a.b", {{Roms + "a.b.zip", "zip"}}},
+      {"D:\\x.gzip", "zip", {Added}, "", {{Roms + "x.gzip", "zip"}}},  // copied, but no name that the list shows
+      {"D:\\p.tVk", Package("Ação=Jogo"_ansi, "ação"_ansi), {Added}, "Ação=Jogo"_ansi, package},
+      {"", "", {}},  // cancelled
+      {"D:\\vazio.zip", "", {ReadError}},
+      {"D:\\preso.zip", "x", {ReadError}, "", {}, Locked("D:\\preso.zip")},
+      {"D:\\semponto", "x", {ReadError}},
+      {"D:\\x.txt", "x", {}},
+      {"D:\\nada.tvk", "no package", {ReadError}},
+      {"D:\\soma.tvk", Package("Novo", "NOVO", "figura", "123456788"), {Corrupt}},
+      {"D:\\curto.tvk", Package("Novo", "NOVO").substr(0, 108), {Corrupt}},
+      {"D:\\disco.tvk", Package("Novo", "NOVO"), {Corrupt}, "", {}, altered},
+      {"D:\\figura.tvk", Package("No|vo", "NOVO"), {ReadError}},  // the picture cannot have this name: nor the ROM
+      {"D:\\rom.tvk", Package("Novo", "NO|VO"), {ReadError}, "", {{Imgs + "Novo.gif", "figura"}}},
+      {"D:\\longo.tvk", Package("Longo", "LONGO", "figura", WithoutChecksum), {ReadError}, "", unchecked},
+      {"D:\\SUPERJOG.zip", "longer than it was", {WriteError}, "", {}, FullDisk},
+      {"D:\\novo.smc", "rom of a new game", {WriteError}, "", {}, FullDisk},
+      {"D:\\v.tvk", Package("SUPER jogo", "SUPERJOG", "new"), {ReplaceGame}, "", {}, No},
+      {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new", "987654321"), {ReplaceGame, Corrupt}, "", {}, Yes},
+      {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new"), {ReplaceGame, Added}, "Super Jogo", replaced, Yes},
+  };
+  for (const auto& each : cases) {
+    SCOPED_TRACE(each.Path + " " + each.Content.substr(0, 100));
+    SetUpMachine();
+    AddDisk('D', 100'000'000);
+    PutFile(Roms + "SUPERJOG.zip", "old");
+    ASSERT_TRUE(Start());
+    if (!each.Path.empty()) PutFile(each.Path, each.Content);
+    Files expected = Standing();
+    for (const auto& [path, content] : each.New) expected[path] = content;
+    each.Happens();
+    ChooseFile(form->Command4, each.Path);
+    EXPECT_EQ(Messages(), each.Shown);
+    EXPECT_TRUE(Standing() == expected);
+    EXPECT_EQ(Selected(), each.Selected);
+    EXPECT_EQ(States(), each.Selected.empty() ? NothingSelected : GameSelected);
+    const auto& asked = ShownFileDialogs().back();
+    EXPECT_EQ(asked.Title + asked.Filter, "Adicionar...Arquivos suportados\0*.zip;*.smc;*.tvk\0"s);
+  }
+}
+
+class Export : public Menu {};
+
+// A package is offered only for a game of the catalogue that has a picture, but it can be written of each.
+TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
+  const std::string both = "tvk;zipArquivo Tolvaris (*.tvk)\0*.tvk\0Arquivo ZIP (*.zip)\0*.zip\0"s;
+  const std::string smc = "smcArquivo SMC (*.smc)\0*.smc\0"s;
+  const std::string rom = Roms + "SUPERJOG.zip", picture = Imgs + "Super Jogo.gif";
+  const Before putLongRom = [&] { PutFile(rom, WithoutChecksum); };
+  const struct {
+    std::string Name, Offered;  // the extension and the types
+    std::string Target;
+    Texts Shown;
+    std::optional<std::string> Left;  // content of the target afterwards
+    Before Happens = Nothing;
+  } cases[] = {
+      {"Super Jogo", both, "C:\\x.zip", {Saved}, Rom},
+      {"Super Jogo", both, "C:\\x.TvK", {Saved}, Package("Super Jogo", "SUPERJOG")},
+      {"Sem figura", smc, "C:\\x.tvk", {Saved}, Package("Sem figura", "SEMFIG", "")},
+      {"Nome comprido", smc, "C:\\x.tvk", {Saved}, Package("Nome comprido", "")},
+      {"Nome comprido", smc, "C:\\x", {Saved}, Rom},
+      {"Super Jogo", both, "", {}, {}},  // cancelled
+      {"Super Jogo", both, "C:\\old.zip", {ReplaceFile}, "old", No},
+      {"Super Jogo", both, "C:\\old.zip", {ReplaceFile, Saved}, Rom, Yes},
+      {"Super Jogo", both, "Q:\\x.zip", {WriteError}, {}},
+      {"Super Jogo", both, "C:\\x.zip", {WriteError}, {}, FullDisk},
+      {"Super Jogo", both, "C:\\old.tvk", {ReplaceFile, WriteError}, "old", FullDisk},
+      {"Super Jogo", both, "C:\\x.zip", {ReadError}, {}, Locked(rom)},
+      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(rom)},
+      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(picture)},
+      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, putLongRom},
+  };
+  for (const auto& each : cases) {
+    SCOPED_TRACE(each.Name + " to " + each.Target + testing::PrintToString(each.Shown));
+    SetUpMachine();
+    for (const char* old : {"C:\\old.zip", "C:\\old.tvk"}) PutFile(old, "old");
+    StartAndPick(each.Name);
+    each.Happens();
+    Files expected = Standing();
+    if (each.Left) expected[each.Target] = each.Left;
+    ChooseFile(form->Command5, each.Target);
+    EXPECT_EQ(Messages(), each.Shown);
+    EXPECT_TRUE(Standing() == expected);
+    EXPECT_EQ(States(), NothingSelected);  // the game commands wait for the next click
+    const auto& asked = ShownFileDialogs().back();
+    EXPECT_EQ(asked.DefaultExtension + asked.Filter, each.Offered);
+    EXPECT_EQ(asked.Title + asked.File.substr(0, each.Name.size() + 1), "Salvar como..." + each.Name + " ");
+  }
+}
+
+}  // namespace
+}  // namespace menu

@@ -1,0 +1,127 @@
+// The commands that lead to other programs and windows: play, the downloader and the save manager.
+#include "support/mod_Globais.h"
+#include "tests/mainwindow/menu.h"
+
+namespace menu {
+namespace {
+
+std::string Configuration(const std::string& saves) {
+  return "x\r\nSaveDirectory = " + saves + "\r\nGameDirectory = C:\\Tolvaris\\Roms\r\ny";
+}
+
+class Play : public Menu {};
+
+TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
+  PutText(Key, "AvisoALTF4", "");
+  StartAndPick("Nome comprido");
+  form->SetLeft(1500);
+  form->SetTop(1200);
+  Click(form->Command1);
+  ASSERT_EQ(StartedProcesses().size(), 1U);
+  const auto& started = StartedProcesses()[0];
+  EXPECT_EQ(started.CommandLine, Emulator + " " + Form1::CaminhoCurto(Roms + "Nome comprido.smc"));
+  EXPECT_EQ(started.Directory, "C:\\Emu");
+  EXPECT_EQ(started.CreationFlags, 0x20U);
+  EXPECT_EQ(Content(EmulatorConfig), Configuration("C:\\Tolvaris\\Saves"));
+  const std::pair<const char*, const char*> settings[] = {
+      {"AvisoALTF4", "1"}, {"LRom", "Nome comprido"}, {"Disquete", "0"}, {"pl", "1500"}, {"pt", "1200"}};
+  for (const auto& [name, value] : settings) EXPECT_EQ(StoredText(Key, name), value) << name;
+  const std::string notice =
+      "Informação: Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'"_ansi;
+  EXPECT_EQ(Messages(), Texts{notice});
+  EXPECT_EQ(States(), GameSelected);
+
+  const auto writes = WriteCount(EmulatorConfig);
+  DoubleClick(form->List1);
+  PressKey(form->List1, 13);
+  PressKey(form->List1, 32);
+  EXPECT_EQ(StartedProcesses().size(), 3U);
+  EXPECT_EQ(WriteCount(EmulatorConfig), writes);  // nothing to change, nothing written
+
+  const std::string fresh = "\r\nSaveDirectory = C:\\Tolvaris\\Saves\r\nGameDirectory = C:\\Tolvaris\\Roms\r\n";
+  for (const auto& [before, attributes, after] : {std::tuple("", 0x20U, fresh), {"read-only", 0x21U, "read-only"}}) {
+    PutFile(EmulatorConfig, before, attributes);
+    Click(form->Command1);
+    EXPECT_EQ(Content(EmulatorConfig), after);
+  }
+  EXPECT_EQ(StartedProcesses().size(), 5U);
+  EXPECT_EQ(Messages(), Texts{});
+}
+
+TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
+  StartAndPick("Super Jogo");
+  Click(form->Check1);
+  int opened = 0;
+  QueueModal([&](platform::Window& window) { opened += window.Caption() == "Salvamentos dos jogos"; });
+  Click(form->Command2);
+  EXPECT_EQ(opened, 0);
+  QueueAnswer(Answer::Retry);
+  QueueAnswer(Answer::Cancel);
+  Click(form->Command1);
+  const ShownMessage prompt{"Não há disquete na unidade A:\\\r\n\r\nColoque um disquete e clique em 'Repetir'."_ansi,
+                            "Disquete A:", Buttons::RetryCancel, Icon::Exclamation};
+  EXPECT_EQ(ShownMessages(), (std::vector{prompt, prompt, prompt}));
+  EXPECT_TRUE(StartedProcesses().empty());
+  EXPECT_EQ(StoredText(Key, "Disquete"), std::nullopt);
+  EXPECT_EQ(States(), GameSelected);
+  EXPECT_EQ(Focused(), &form->List1);
+
+  QueueAnswer(Answer::Retry, [] { AddDisk('A', 1457664); });
+  Click(form->Command1);
+  EXPECT_EQ(StartedProcesses().size(), 1U);
+  EXPECT_EQ(Content(EmulatorConfig), Configuration("A:"));
+  EXPECT_EQ(StoredText(Key, "Disquete"), "1");
+  EXPECT_EQ(DirSaves, Home + "Saves\\");  // only this launch keeps its saves there
+  Click(form->Command2);
+  EXPECT_EQ(opened, 1);
+}
+
+const std::string Downloader = Home + "tolvarisdownload.exe";
+
+class HandOver : public Menu {
+ protected:
+  HandOver() { PutText(Key, "LRom", "Super Jogo"); }
+};
+
+TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
+  PutFile(Downloader, "MZ");
+  ASSERT_TRUE(Start());
+  Click(form->Command3);
+  ASSERT_EQ(StartedProcesses().size(), 1U);
+  const std::string handles = std::to_string(form->Handle()) + "@" + std::to_string(form->List1.Handle());
+  EXPECT_EQ(StartedProcesses()[0].CommandLine, Downloader + " " + handles);
+  EXPECT_EQ(StartedProcesses()[0].Directory, Home);
+  EXPECT_FALSE(form->Enabled());
+  EXPECT_EQ(Selected(), "");
+  EXPECT_EQ(OpenFiles(), 0U) << "the catalogue is closed";
+
+  Tick(form->Timer1);
+  EXPECT_EQ(form->Caption(), "...");
+  PutFile(Roms + "B.smc", Rom);
+  PutFile(Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||B=Jogo B|");
+  form->Enable(true);
+  Tick(form->Timer1);
+  EXPECT_FALSE(form->Timer1.Enabled());
+  EXPECT_GE(form->List1.FindExact("Jogo B"), 0);
+  EXPECT_EQ(Selected(), "Super Jogo");
+  EXPECT_EQ(form->Caption(), "Tolvaris");
+  EXPECT_EQ(States(), GameSelected);
+}
+
+TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
+  ASSERT_TRUE(Start());
+  Click(form->Command3);
+  EXPECT_EQ(Messages(), Texts{"Erro: O programa de download não foi encontrado."_ansi});
+  EXPECT_EQ(States(), GameSelected);
+
+  PutFile(Downloader, "no program");
+  RefuseToStart(Downloader);
+  Click(form->Command3);
+  EXPECT_TRUE(form->Enabled() && !form->Timer1.Enabled());
+  EXPECT_EQ(form->Caption(), "Tolvaris");
+  EXPECT_EQ(Selected(), "Super Jogo");
+  EXPECT_EQ(States(), GameSelected);
+}
+
+}  // namespace
+}  // namespace menu
