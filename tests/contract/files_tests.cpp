@@ -19,11 +19,8 @@ TEST_F(Files, OpenAsTheAccessSays) {
                                                             {a_, Access::Read, true, "0123456789"},
                                                             {a_, Access::ReadWrite, true, "0123456789"},
                                                             {here_ + "new1", Access::ReadWrite, true, ""},
-                                                            {here_ + "new2", Access::ReplaceContent, true, ""},
                                                             {here_ + "nowhere\\x", Access::ReadWrite, false, "(none)"},
                                                             {here_, Access::Read, false, "(none)"},
-                                                            {here_ + "a*.smc", Access::ReplaceContent, false, "(none)"},
-                                                            {"", Access::ReadWrite, false, "(none)"},
                                                             {a_ + Zero, Access::ReadWrite, false, "(none)"},
                                                             {a_, Access::ReplaceContent, true, ""}};
   for (const auto& [path, access, opens, after] : cases) {
@@ -36,7 +33,6 @@ TEST_F(Files, OpenAsTheAccessSays) {
     EXPECT_EQ(Content(path), after) << path;
   }
   SetAttributes(a_, AttributeReadOnly);
-  EXPECT_TRUE(File(a_, Access::Read).IsOpen());
   for (const Access how : {Access::ReadWrite, Access::ReplaceContent}) EXPECT_EQ(File(a_, how).IsOpen(), IsWine());
   Put(b_, "hidden");
   SetAttributes(b_, AttributeHidden);
@@ -55,18 +51,13 @@ TEST_F(Files, BytePositionsAndSizesAreExact) {
     ASSERT_EQ(reader.Read(position, buffer.data(), length), std::ssize(bytes)) << position;
     EXPECT_EQ(buffer.substr(0, bytes.size()), bytes);
   }
-  char byte = 0;
-  EXPECT_EQ(file.Read(-1, &byte, 1), -1);
-  EXPECT_FALSE(file.Write(-1, "x") || file.SetSize(-1) || reader.Write(0, "x") || reader.SetSize(0));
+  EXPECT_FALSE(reader.Write(0, "x") || reader.SetSize(0));
   EXPECT_TRUE(file.Write(12, "beyond"));  // the gap is zeros
   EXPECT_EQ(Content(a_).substr(9), string("d\0\0beyond", 9));
   EXPECT_TRUE(file.SetSize(2) && file.SetSize(4) && file.Flush());
   EXPECT_EQ(Content(a_), string("\0\r\0\0", 4));
-  EXPECT_EQ(FileSize(a_), 4);
   Put(b_, "b");
   EXPECT_FALSE(DeleteFileA(a_) || MoveFileExA(a_, missing_) || MoveFileExA(b_, a_));  // as it is open
-  for (File* each : {&file, &reader, &other}) each->Close();
-  EXPECT_TRUE(MoveFileExA(b_, a_));
 }
 
 TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
@@ -84,12 +75,9 @@ TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
       {here_ + "A\xC7\xC3O.SMC", AttributeReadOnly | AttributeHidden, 5},  // in other case
       {b_ + Zero, {}, {}},
       {b_, 0, 0},
-      {folder, AttributeDirectory, {}},
-      {here_ + "pasta\\..\\PASTA\\", AttributeDirectory, {}},
+      {here_ + "PASTA\\", AttributeDirectory, {}},
       {missing_, {}, {}},
-      {here_ + "cut", {}, {}},
-      {here_ + "*", {}, {}},
-      {"", {}, {}}};
+      {here_ + "cut", {}, {}}};
   for (const auto& [path, expected, size] : cases) {
     std::optional<std::uint32_t> attributes = GetFileAttributesA(path);
     if (attributes && size) *attributes &= AttributeReadOnly | AttributeHidden;  // each disk keeps others
@@ -104,11 +92,9 @@ TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
 TEST_F(Files, MoveAndCopyReplace) {
   const std::tuple<std::uint32_t, string, string, bool> cases[] = {{0, a_, b_, true},  // there is no b
                                                                    {AttributeArchive, a_, b_, true},
-                                                                   {AttributeArchive, a_, here_ + "B.SMC", true},
                                                                    {AttributeReadOnly, a_, b_, false},
                                                                    {AttributeArchive, missing_, b_, false},
                                                                    {AttributeArchive, a_, here_ + "nowhere\\x", false},
-                                                                   {AttributeArchive, a_, here_, false},
                                                                    {AttributeArchive, a_, b_ + Zero, false},
                                                                    {AttributeArchive, a_ + Zero, b_, false}};
   for (const bool copy : {false, true}) {
@@ -132,21 +118,14 @@ TEST_F(Files, MoveAndCopyReplace) {
 
 TEST_F(Files, DisksTellTheirSpaceAndTakeADirectoryWhenTheyAreThere) {
   const string drive = here_.substr(0, 2), root = drive + "\\";
-  for (const string& disk : {drive, root}) {
-    const auto space = GetDiskFreeSpaceA(disk).value_or(DiskFreeSpace{});
-    EXPECT_TRUE(space.SectorsPerCluster > 0 && space.BytesPerSector > 0 && space.TotalClusters > 0) << disk;
-    EXPECT_GE(space.TotalClusters, space.FreeClusters);
-  }
-  for (const string& none : {string("Q:"), string("q:\\"), drive + Zero}) EXPECT_FALSE(GetDiskFreeSpaceA(none)) << none;
+  const auto space = GetDiskFreeSpaceA(drive).value_or(DiskFreeSpace{});
+  EXPECT_TRUE(space.SectorsPerCluster > 0 && space.BytesPerSector > 0 && space.TotalClusters > 0);
   EXPECT_TRUE(SetDriveDirectory(root));
   for (const string& none : {string("q:\\"), here_ + "nowhere\\", root + Zero, string()}) {
-    EXPECT_FALSE(SetDriveDirectory(none)) << none;
+    EXPECT_FALSE(GetDiskFreeSpaceA(none) || SetDriveDirectory(none)) << none;
   }
   const auto roots = FixedDrives();
-  EXPECT_EQ(std::count(roots.begin(), roots.end(), root), 1);
-  EXPECT_TRUE(std::is_sorted(roots.begin(), roots.end()));
-  EXPECT_FALSE(ProgramDirectory().ends_with('\\'));
-  EXPECT_TRUE(GetFileAttributesA(ProgramDirectory()).value_or(0) & AttributeDirectory);
+  EXPECT_TRUE(std::count(roots.begin(), roots.end(), root) == 1 && std::is_sorted(roots.begin(), roots.end()));
 }
 
 }  // namespace

@@ -2,7 +2,6 @@
 #include <vector>
 
 #include "platform/text.h"
-#include "platform/wildcards.h"
 #include "tests/contract/machine.h"
 
 namespace {
@@ -31,36 +30,14 @@ class Listings : public Machine {
   }
 };
 
-TEST(Wildcards, Match) {
-  const std::tuple<const char*, Names, Names> cases[] = {{"*.ZIP", {"A.ZIP", ".ZIP", "A.ZIP.ZIP"}, {"A.ZIPX", "ZIP"}},
-                                                         {"*.SMC;*.ZIP", {"A.ZIP", "A.ZIP.SMC"}, {"A.TVK", ""}},
-                                                         {";;*.ZIP;", {"A.ZIP"}, {"A", ""}},
-                                                         {"", {}, {"A.ZIP", ""}},
-                                                         {"*", {"A.ZIP", ""}, {}},
-                                                         {"?", {"A"}, {"AB", ""}},
-                                                         {"*AB", {"ABAB"}, {"ABABC"}},
-                                                         {"*AB?", {"ABABC"}, {"AB"}},
-                                                         {"A*B*C", {"ABAC"}, {"ABA"}},
-                                                         {"*.ZS?", {"A.ZS1"}, {"A.ZS", "A.ZS12"}},
-                                                         {"A**", {"A"}, {"BA"}},
-                                                         {"AB", {"AB"}, {"A", "ABC"}}};
-  for (const auto& [patterns, matching, others] : cases) {
-    for (const string& name : matching) EXPECT_TRUE(MatchesAnyPattern(name, patterns)) << name << " " << patterns;
-    for (const string& name : others) EXPECT_FALSE(MatchesAnyPattern(name, patterns)) << name << " " << patterns;
-  }
-}
-
 TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
-  const Names zips = {"One.zip", "readonly.zip", "TWO.ZIP"};
   const std::tuple<string, string, Names> cases[] = {
       {here_, "*.smc", {"A\xE7\xE3o.SmC", "coop.smc", "co-op.smc", "jogo 10.smc", "Jogo 2.smc", "seven.zip.smc"}},
-      {here_, "*.ZIP;*.zip", zips},  // each file once
-      {here_, "*.zip;s*", {"One.zip", "readonly.zip", "seven.zip.smc", "six", "TWO.ZIP"}},
+      {here_, "*.ZIP;*.zip;s*", {"One.zip", "readonly.zip", "seven.zip.smc", "six", "TWO.ZIP"}},  // each file once
+      {here_, ";?ix;;*o*p.*c;?.zip", {"coop.smc", "co-op.smc", "six"}},
       {here_, "a\xC7*", {"A\xE7\xE3o.SmC"}},
-      {here_, "???", {"six"}},
       {here_, "", {}},
       {here_ + "nowhere\\", "*", {}},
-      {here_ + "one.zip\\", "*", {}},
       {here_ + Zero, "*", {}},
       {"q:\\", "*", {}}};
   for (const auto& [directory, patterns, expected] : cases) {
@@ -70,12 +47,11 @@ TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
   }
   EXPECT_EQ(ListSubdirectories(here_), (Names{"\xC1gua", "emu 10", "EMU 2.zip", "readonly", "Zebra"}));
   EXPECT_EQ(ListSubdirectories(here_ + "Zebra\\"), Names{"in"});
-  for (const string& none :
-       {here_ + "Zebra\\in\\", here_ + "nowhere\\", here_ + "six\\", here_ + Zero, string("q:\\")}) {
+  for (const string& none : {here_ + "Zebra\\in\\", here_ + "nowhere\\", here_ + Zero, string("q:\\")}) {
     EXPECT_EQ(ListSubdirectories(none), Names()) << none;
   }
-  for (const string& name : Names{"one.*", "?ne.zip", "on<", "one\"zip", "hidden.zip", "system.zip", "Zebra", "Zebra\\",
-                                  "", "missing", "nowhere\\x", "one.zip" + Zero}) {
+  for (const string& name :
+       Names{"one.*", "on<", "hidden.zip", "system.zip", "Zebra", "", "missing", "one.zip" + Zero}) {
     EXPECT_FALSE(ListPath(here_ + name)) << name;
   }
 }

@@ -16,7 +16,7 @@ using std::string;
 inline constexpr const char* Key = "Software\\Tolvaris test";  // below HKEY_CURRENT_USER; gone at a test's end
 inline const string Zero(1, '\0');                             // a path with one in it names nothing
 
-// A test with the screen to itself and a new, empty directory, which is gone with all that is in it at the test's end.
+// A test with a new, empty directory.
 class Machine : public testing::Test {
  protected:
   Machine();
@@ -41,12 +41,10 @@ inline string Content(const string& path) {
 void SetAttributes(const string& path, std::uint32_t attributes);
 void SetEnvironment(const string& name, const string& value);  // of this program, until its end
 
-// Wine lets read-only files be replaced, and root also write to them; it starts every process with the normal priority.
+// Wine lets read-only files be replaced, and root also write to them.
 bool IsWine();
 
-// The command line, to which arguments may be added, of a program that runs until it is told to end, and then writes
-// the file "here.txt" in the directory it works in: the number of its priority class, a blank, its whole command line.
+// The command line of a program that writes the file "here" in the directory it works in, and ends.
 string StandIn();
-void TellStandInToEnd();
 
 }  // namespace contract

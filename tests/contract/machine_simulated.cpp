@@ -1,5 +1,5 @@
 #include "platform/simulated/simulated.h"
-#include "tests/contract/machine.h"
+#include "tests/contract/hand.h"
 
 namespace contract {
 
@@ -18,13 +18,19 @@ bool IsWine() { return false; }
 string StandIn() {
   const string program = "C:\\Substituto.exe";
   simulated::PutFile(program, "program");
-  simulated::OnProcess(program, 2, [] {
-    const auto& [commandLine, directory, flags] = simulated::StartedProcesses().back();
-    simulated::PutFile(directory + "\\here.txt", std::to_string(flags) + " " + commandLine);
-  });
+  simulated::OnProcess(program, 2,
+                       [] { simulated::PutFile(simulated::StartedProcesses().back().Directory + "\\here", ""); });
   return program;
 }
 
-void TellStandInToEnd() {}
+void Click(Button& button) { simulated::Click(button); }
+void Click(ImageButton& button) { simulated::Click(button); }
+void Click(CheckBox& box) { simulated::Click(box); }
+void Choose(ListBox& list, int index) { simulated::Choose(list, index); }
+void UseCloseBox(Window& window) { simulated::CloseWindow(window); }
+void QueueEvent(std::function<void()> event) { simulated::QueueEvent(std::move(event)); }
+void QueueModal(std::function<void()> script) {
+  simulated::QueueModal([script = std::move(script)](Window&) { script(); });
+}
 
 }  // namespace contract

@@ -1,72 +1,73 @@
 #include <windows.h>
 
-// After it, as it needs its types.
-#include <shellapi.h>
-
 #include <cstdlib>
+#include <deque>
 
-#include "tests/contract/machine.h"
+#include "platform/windows/state.h"
+#include "tests/contract/hand.h"
 
 namespace contract {
-namespace {
 
-constexpr DWORD Limit = 60'000;  // milliseconds that a stand-in lives on, and that a test waits for its turn
-
-// The stand-in is this very test program. Its first argument is an inherited event, as a number.
-bool PlayStandIn() {
-  const string commandLine = ::GetCommandLineA(), mark = " --stand-in=";
-  const std::size_t place = commandLine.find(mark);
-  if (place == string::npos) return false;
-  const auto event = std::strtoull(commandLine.c_str() + place + mark.size(), nullptr, 10);
-  if (::WaitForSingleObject(reinterpret_cast<HANDLE>(event), Limit) != WAIT_OBJECT_0) ::ExitProcess(1);
-  Put("here.txt", std::to_string(::GetPriorityClass(::GetCurrentProcess())) + " " + commandLine);
-  ::ExitProcess(0);
-}
-const bool standIn = PlayStandIn();  // before any test
-
-SECURITY_ATTRIBUTES inherited{sizeof inherited, nullptr, TRUE};
-const HANDLE endSignal = ::CreateEventA(&inherited, TRUE, FALSE, nullptr);
-
-// One test program at a time has the screen: another would take the keyboard away.
-const HANDLE turn = ::CreateMutexA(nullptr, FALSE, "Tolvaris contract tests");
-
-string MakeDirectory() {
-  char temporary[MAX_PATH] = "", path[MAX_PATH] = "";
-  ::GetTempPathA(MAX_PATH, temporary);
-  ::GetLongPathNameA(temporary, path, MAX_PATH);
-  ::lstrcatA(path, ("tolvaris-" + std::to_string(::GetCurrentProcessId())).c_str());
-  ::CreateDirectoryA(path, nullptr);
-  return path + string("\\");
+// In the test program's own directory, where the last test's files are left.
+Machine::Machine() : here_(ProgramDirectory() + "\\Pasta de teste\\") {
+  std::system(("rmdir /s /q \"" + here_.substr(0, here_.size() - 1) + "\"").c_str());
+  EXPECT_TRUE(CreateDirectoryA(here_));
 }
 
-}  // namespace
-
-Machine::Machine() : here_(MakeDirectory()) {
-  ::WaitForSingleObject(turn, Limit);
-  ::RegDeleteTreeA(HKEY_CURRENT_USER, Key);  // of a run that was ended
-}
-
-Machine::~Machine() {
-  TellStandInToEnd();
-  ::RegDeleteTreeA(HKEY_CURRENT_USER, Key);
-  ::ReleaseMutex(turn);
-  const string paths = here_.substr(0, here_.size() - 1) + Zero;  // a list that ends with an empty path
-  constexpr FILEOP_FLAGS silently = FOF_SILENT | FOF_NOCONFIRMATION | FOF_NOERRORUI;
-  SHFILEOPSTRUCTA removal{nullptr, FO_DELETE, paths.c_str(), nullptr, silently, FALSE, nullptr, nullptr};
-  EXPECT_EQ(::SHFileOperationA(&removal), 0) << here_;
-}
+Machine::~Machine() { ::RegDeleteTreeA(HKEY_CURRENT_USER, Key); }
 
 void SetAttributes(const string& path, std::uint32_t attributes) { ::SetFileAttributesA(path.c_str(), attributes); }
 void SetEnvironment(const string& name, const string& value) { ::SetEnvironmentVariableA(name.c_str(), value.c_str()); }
 bool IsWine() { return ::GetProcAddress(::GetModuleHandleA("ntdll.dll"), "wine_get_version") != nullptr; }
 
+// This very test program, told to run no test and to write down so.
 string StandIn() {
   char program[MAX_PATH] = "";
   ::GetModuleFileNameA(nullptr, program, MAX_PATH);
-  ::ResetEvent(endSignal);
-  return program + (" --stand-in=" + std::to_string(reinterpret_cast<std::uintptr_t>(endSignal)));
+  return program + string(" --gtest_filter=-* --gtest_output=xml:here");
 }
 
-void TellStandInToEnd() { ::SetEvent(endSignal); }
+namespace {
+
+// Presses the mouse in the middle of the control, or of an entry of it, if the user can reach the control.
+void Press(const Control& control, int entry = -1) {
+  const HWND handle = control.State().Handle;
+  for (const HWND window : {handle, ::GetAncestor(handle, GA_ROOT)}) {
+    if (!::IsWindowVisible(window) || !::IsWindowEnabled(window)) return;
+  }
+  RECT area = {};
+  ::GetClientRect(handle, &area);
+  if (entry >= 0) ::SendMessageA(handle, LB_GETITEMRECT, static_cast<WPARAM>(entry), reinterpret_cast<LPARAM>(&area));
+  const LPARAM place = MAKELPARAM((area.left + area.right) / 2, (area.top + area.bottom) / 2);
+  ::PostMessageA(handle, WM_LBUTTONDOWN, MK_LBUTTON, place);
+  ::PostMessageA(handle, WM_LBUTTONUP, 0, place);
+  RunPendingEvents();
+}
+
+}  // namespace
+
+void Click(Button& button) { Press(button); }
+void Click(ImageButton& button) { Press(button); }
+void Click(CheckBox& box) { Press(box); }
+void Choose(ListBox& list, int index) { Press(list, index); }
+void UseCloseBox(Window& window) { ::SendMessageA(window.State().Handle, WM_CLOSE, 0, 0); }
+
+// Sent to a window of their own through the thread's message queue.
+void QueueEvent(std::function<void()> event) {
+  static std::deque<std::function<void()>> events;
+  static const HWND window = ::CreateWindowExA(0, "STATIC", "", 0, 0, 0, 0, 0, HWND_MESSAGE, nullptr, nullptr, nullptr);
+  const WNDPROC run = [](HWND handle, UINT message, WPARAM wParam, LPARAM lParam) -> LRESULT {
+    if (message != WM_APP || events.empty()) return ::DefWindowProcA(handle, message, wParam, lParam);
+    const std::function<void()> next = std::move(events.front());
+    events.pop_front();
+    next();
+    return 0;
+  };
+  ::SetWindowLongPtrA(window, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(run));
+  events.push_back(std::move(event));
+  ::PostMessageA(window, WM_APP, 0, 0);
+}
+
+void QueueModal(std::function<void()> script) { QueueEvent(std::move(script)); }
 
 }  // namespace contract

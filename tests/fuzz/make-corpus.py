@@ -19,18 +19,11 @@ SEEDS = {
     "key-in-name": build(b"Jogo CRC=5 tROM=1", b"iROM=1", b"1", b"I", b"R"),
     "marker-in-name": build(b"Jogo |IMGROMDAT|", b"JOGO", b"1", b"I", b"R"),
     "elsewhere": build(b"..\\Jogo", b"COM1", b"1", b"I", b"R"),
-    "no-marker": EXAMPLE[:95],
     "huge-numbers": EXAMPLE.replace(b"tROM=9", b"tROM=2147483647").replace(b"iROM=7", b"iROM=2147483647"),
     "longest-header": build(b"x" * LONGEST, b"", b"1", b"I", b"R"),
     "pieces": b"Super Jogo\nSUPERJOG\n-873187034\nGIF89a\n123456789",
     "pieces-odd": b" \xe7.\nLPT0 .a\n\r\r\n\0\n\n",
 }
 
-
-def main(directory):
-    directory.mkdir(parents=True, exist_ok=True)
-    for name, content in SEEDS.items():
-        (directory / name).write_bytes(content)
-
-
-main(Path(sys.argv[1]))
+for file, content in SEEDS.items():
+    (Path(sys.argv[1]) / file).write_bytes(content)
