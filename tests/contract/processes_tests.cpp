@@ -13,13 +13,9 @@ class Processes : public Machine {};
 TEST_F(Processes, WorkInTheirDirectoryAndAreWaitedForUnlessTheyCannotBeStarted) {
   const string program = StandIn(), directory = here_ + "A\xE7\xE3o e mais", note = directory + "\\here";
   EXPECT_TRUE(CreateDirectoryA(directory));
-  const std::tuple<string, string, bool> cases[] = {{program, directory, true},
-                                                    {program, directory + "\\", true},
-                                                    {program, here_ + "nowhere", false},
-                                                    {program, directory + Zero, false},
-                                                    {program + Zero, directory, false},
-                                                    {here_ + "nowhere", directory, false},
-                                                    {"", directory, false}};
+  const std::tuple<string, string, bool> cases[] = {
+      {program, directory, true},         {program, directory + "\\", true},  {program, here_ + "nowhere", false},
+      {program, directory + Zero, false}, {program + Zero, directory, false}, {here_ + "nowhere", directory, false}};
   for (const auto& [commandLine, where, starts] : cases) {
     const Process process = CreateProcessA(commandLine, PriorityIdle, where);
     EXPECT_EQ(process.Started(), starts) << commandLine << " in " << where;

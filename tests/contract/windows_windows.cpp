@@ -11,6 +11,16 @@ using namespace contract;
 
 class NativeWindow : public AllControls {};
 
+TEST_F(NativeWindow, KeepsTheKeyboardForAControlThatIsSwitchedOff) {
+  combo.SetFocus();
+  for (const auto change : {&Control::Enable, &Control::Show}) {
+    (combo.*change)(false);
+    EXPECT_EQ(::GetFocus(), window.State().Handle);
+    (combo.*change)(true);
+    EXPECT_EQ(::GetFocus(), combo.State().Handle);
+  }
+}
+
 TEST_F(NativeWindow, IsCentredAndLaidOutAgainAtAnotherResolution) {
   EXPECT_NEAR(window.Left() + window.Width() / 2, ScreenWidth() / 2, 30);
   const HWND native = window.State().Handle;
