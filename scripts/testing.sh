@@ -8,6 +8,8 @@ prepare_test_machine() {
   start_display
   prepare_prefix build/prefixes/tests
   mount_floppy "$WINEPREFIX/drive_c/Disquete1440" || say "No floppy-sized disk can be mounted here"
+  # A disk is in drive A: while a test has made this directory.
+  set_drive a "$WINEPREFIX/drive_c/Disquete1440/Disco"
   hold_wine
   export TOLVARIS_WINE_READY=1
 }

@@ -1,127 +1,91 @@
 // Exporting games through the system's dialog.
-#include "tests/windows/collection.h"
+#include "tests/windows/installation.h"
 
 namespace {
 
-using driver::Answer;
-using driver::Message;
-
 const Message Saved = {"Ok", "Arquivo salvo.", {IDOK}};
-const Message CannotWrite = {"Erro", "Erro ao gravar arquivo.", {IDOK}};
-const Message IsThere = {"Confirmar", "Arquivo já existente.\r\n\r\nSubstituir ?", {IDYES, IDNO, IDCANCEL}};
+const Message CannotWrite = Failure("Erro ao gravar arquivo.");
 
-const std::string Package = "Arquivo Tolvaris (*.tvk)", Zip = "Arquivo ZIP (*.zip)", Smc = "Arquivo SMC (*.smc)";
+const std::string Tvk = "Arquivo Tolvaris (*.tvk)", Zip = "Arquivo ZIP (*.zip)", Smc = "Arquivo SMC (*.smc)";
 
-class ExportGame : public Collection {
+class ExportGame : public Installation {
  protected:
   ExportGame() {
-    for (const char* name : {"Élan.bmp", "abelha.gif"}) installation.Put(std::string("Imgs\\") + name, picture);
-    installation.Put("Roms\\elan.ZIP", rom);
+    Put("Imgs\\Élan.bmp", Gif(RGB(10, 200, 60)));
+    Put("Imgs\\abelha.gif", Gif(RGB(10, 200, 60)));
+    Put("Roms\\elan.ZIP", rom);
+    Start();
   }
 
-  const std::string picture = Bmp(RGB(10, 200, 60), 3, 2), rom = Bytes(1, (2 << 20) + 5);
+  const std::string rom = Bytes(1, (2 << 20) + 5);
+  const std::string package = Package("Élan", "ELAN", "-849089814", Gif(RGB(10, 200, 60)), rom);
 };
 
 TEST_F(ExportGame, OffersWhatAGameCanBeSavedAs) {
   const struct {
     std::string Game;
     Texts Types;
-    int Chosen;           // the place of the type that is chosen
-    std::string Typed;    // empty: the name that is offered is taken
-    std::string Written;  // with the type's extension
+    int Chosen;                 // the place of the type that is chosen
+    std::string Typed;          // empty: the name that is offered is taken
+    std::string File, Content;  // with the type's extension
   } cases[] = {
-      {"Zebra", {Smc}, 0, Outside + "cópia", "Fora\\cópia.smc"},
-      {"abelha", {Zip}, 0, Outside + "b", "Fora\\b.zip"},  // not in the catalogue
-      {"Élan", {Package, Zip}, 0, Outside + "d", "Fora\\d.tvk"},
-      {"Élan", {Package, Zip}, 1, Outside + "c", "Fora\\c.zip"},
-      {"Zebra", {Smc}, 0, Outside + "e.zip", "Fora\\e.zip"},  // the type of the file is not asked
-      {"Élan", {Package, Zip}, 0, "", "Fora\\Élan.tvk"},      // where the dialog was last
+      {"Zebra", {Smc}, 0, Outside + "cópia", "cópia.smc", "jogo"},
+      {"abelha", {Zip}, 0, Outside + "b", "b.zip", "jogo"},  // not in the catalogue
+      {"Élan", {Tvk, Zip}, 0, Outside + "d", "d.tvk", package},
+      {"Élan", {Tvk, Zip}, 1, Outside + "c", "c.zip", rom},
+      {"Zebra", {Smc}, 0, Outside + "e.zip", "e.zip", "jogo"},  // the type of the file is not asked
+      {"Élan", {Tvk, Zip}, 0, "", "Élan.tvk", package},         // where the dialog was last
   };
-  Start();
-  const Files before = Kept();
-  for (const auto& [game, types, chosen, typed, written] : cases) {
-    SCOPED_TRACE(written);
+  const Files before = FilesIn(Home);
+  Files expected = FilesIn(Outside);
+  for (const auto& [game, types, chosen, typed, file, content] : cases) {
+    SCOPED_TRACE(file);
     Select(game);
-    const driver::FileDialog dialog = Press(Export);
+    Click(Export);
+    const FileDialog dialog(*program);
     EXPECT_EQ(dialog.Title(), "Salvar como...");
     EXPECT_EQ(dialog.FileName(), game);
     EXPECT_EQ(dialog.FileTypes(), types);
     for (int i = 0; i < chosen; ++i) dialog.ChooseNextType();
     if (!typed.empty()) dialog.Type(typed);
-    dialog.Press(IDOK);
-    EXPECT_EQ(Answer(*program, IDOK), Saved);
+    dialog.Press(VK_RETURN);
+    EXPECT_EQ(Answer(IDOK), Saved);
     ExpectQuietEnd();
-    if (written.ends_with(".tvk")) {
-      EXPECT_TRUE(installation.Content(written).starts_with("TOLVARIS\r\nNOME=Élan\r\nNOMEDOS=ELAN\r\n"));
-    } else {
-      EXPECT_TRUE(installation.Content(written) == (game == "Élan" ? rom : "jogo"));
-    }
+    expected[file] = content;
+    ExpectFiles(expected, FilesIn(Outside));
   }
-  ExpectKept(before);
-}
-
-TEST_F(ExportGame, WritesAPackageThatAnotherReaderTakes) {
-  Start();
-  Select("Élan");
-  Choose(Export, Outside + "Saída.TVK");
-  EXPECT_EQ(Answer(*program, IDOK), Saved);
-  ExpectQuietEnd();
-  MoveFileA((Outside + "Saída.TVK").c_str(), (Outside + "saida").c_str());
-  const std::string read = Pacote("ler '" + HostPath(Outside + "saida") + "' '" + HostPath(Outside + "figura") + "' '" +
-                                  HostPath(Outside + "rom") + "'");
-  const std::string checksum = Pacote("crc '" + HostPath(installation.Directory + "Roms\\elan.ZIP") + "'");
-  EXPECT_EQ(read, "Élan\nELAN\n" + checksum + checksum);
-  EXPECT_EQ(installation.Content("Fora\\figura"), picture);
-  EXPECT_TRUE(installation.Content("Fora\\rom") == rom);
+  ExpectFiles(before, FilesIn(Home));
 }
 
 TEST_F(ExportGame, AsksBeforeItReplacesAFile) {
-  installation.Put("Fora\\antigo.smc", "antigo");
-  Start();
+  PutFile(Outside + "antigo.smc", "antigo");
   for (const int answer : {IDNO, IDCANCEL, IDYES}) {
     Select("Zebra");
     Choose(Export, Outside + "antigo.smc");
-    EXPECT_EQ(Answer(*program, answer), IsThere);
+    EXPECT_EQ(Answer(answer), Question("Confirmar", "Arquivo já existente.\r\n\r\nSubstituir ?"));
     if (answer == IDYES) {
-      EXPECT_EQ(Answer(*program, IDOK), Saved);
+      EXPECT_EQ(Answer(IDOK), Saved);
     }
     ExpectQuietEnd();
-    EXPECT_EQ(FilesIn(Outside), (Files{{"antigo.smc", answer == IDYES ? "jogo" : "antigo"}, {"leia.txt", "texto"}}));
+    EXPECT_EQ(ContentOf(Outside + "antigo.smc"), answer == IDYES ? "jogo" : "antigo");
   }
   Select("Zebra");
-  Press(Export).Press(IDCANCEL);
+  Click(Export);
+  FileDialog(*program).Press(VK_ESCAPE);
   ExpectQuietEnd();
 }
 
-TEST_F(ExportGame, SaysWhenItCannotWriteAndLeavesWhatWasThere) {
-  installation.Put("Roms\\zebra.smc", std::string(1 << 20, 'z'));  // such a length has no checksum
-  const Message unexpected = {"Erro", "Erro ao salvar arquivo.", {IDOK}};
-  const struct {
-    std::string Game, Path;
-    const Message* Shown;
-  } cases[] = {{"Élan", Outside + "falta\\e.zip", &CannotWrite}, {"Zebra", Outside + "z.tvk", &unexpected}};
-  Start();
-  for (const auto& [game, path, shown] : cases) {
-    Select(game);
-    Choose(Export, path);
-    EXPECT_EQ(Answer(*program, IDOK), *shown) << path;
-    ExpectQuietEnd();
-  }
-  EXPECT_EQ(FilesIn(Outside), (Files{{"leia.txt", "texto"}}));
-}
-
-TEST_F(ExportGame, ToAFullDiskLeavesItAsItWas) {
-  const FloppyDisk disk(FloppyDisk::SmallDirectory);
-  if (!disk.IsSmall()) GTEST_SKIP() << "no file system of 1440 KiB at " << FloppyDisk::SmallDirectory;
-  const Files before = FilesIn("A:\\");
-  Start();
-  for (const char* path : {"A:\\cheio.zip", "A:\\cheio.tvk"}) {
+TEST_F(ExportGame, ThatCannotBeWrittenIsToldAndLeavesWhatWasThere) {
+  const FloppyDisk disk;
+  if (!disk.IsSmall()) GTEST_SKIP() << "drive A: has more than 1440 KiB: no file system could be mounted for it";
+  for (const std::string& path : {Outside + "falta\\e.zip", std::string("A:\\cheio.zip"), std::string("A:\\e.tvk")}) {
     Select("Élan");
     Choose(Export, path);
-    EXPECT_EQ(Answer(*program, IDOK), CannotWrite);
+    EXPECT_EQ(Answer(IDOK), CannotWrite) << path;
     ExpectQuietEnd();
-    EXPECT_TRUE(FilesIn("A:\\") == before);
   }
+  ExpectFiles({{"leia.txt", "texto"}}, FilesIn(Outside));
+  ExpectFiles({}, FilesIn("A:\\"));
 }
 
 }  // namespace

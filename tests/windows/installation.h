@@ -1,82 +1,90 @@
-// A fresh installation of the program with its games, on a machine whose user never ran it before.
+// The program in a directory of its own with games, settings and an emulator, and its main window while it runs.
 #pragma once
 
-#include <map>
 #include <optional>
-#include <string>
+#include <set>
 
-#include "tests/windows/driver/program.h"
+#include "tests/windows/driver/file_dialog.h"
+#include "tests/windows/driver/waiting.h"
+#include "tests/windows/files.h"
+#include "tests/windows/program_windows.h"
 
-// The directory "C:\Ensaio\" with a copy of the program, and none of the program's settings. Both are removed at the
-// beginning only, so that a failure can be looked into.
-class Installation {
- public:
+using Texts = std::vector<std::string>;
+
+const std::string Home = "C:\\Ensaio\\";
+const std::string Emulator = Home + "Emulador\\zsnesw.exe";
+const std::string Outside = "C:\\Fora\\";  // a directory that is not the program's
+
+// The names of the games that are there at a test's beginning, as the list sorts them.
+const Texts Games = {"abelha", "Água Viva", "Corrida das Nuvens", "Élan", "Zebra"};
+
+inline Message Failure(const std::string& text) { return {"Erro", text, {IDOK}}; }
+inline Message Question(const std::string& title, const std::string& text) {
+  return {title, text, {IDYES, IDNO, IDCANCEL}};
+}
+const Message NoDisk = {"Disquete A:",
+                        "Não há disquete na unidade A:\\\r\n\r\nColoque um disquete e clique em 'Repetir'.",
+                        {IDRETRY, IDCANCEL}};
+
+// A test whose installation is as one that was just configured, with all one-time notices shown. What a test before
+// left is removed first: a failure can be looked into.
+class Installation : public testing::Test {
+ protected:
+  enum Command { ManageSaves, Download, Import, Export, Delete };  // as MainWindow::Pictures has them
+
   Installation();
 
-  const std::string Directory = "C:\\Ensaio\\";
-  const std::string Emulator = Directory + "Emulador\\zsnesw.exe";
-  const std::string Configuration = Directory + "Emulador\\zsnesw.cfg";
-  const std::string Autoconfiguration = Directory + "tolvariscfg.exe";
+  // Files are named relative to the installation.
+  static void Put(const std::string& name, const std::string& content) { PutFile(Home + name, content); }
+  static std::string Content(const std::string& name) { return ContentOf(Home + name); }
+  static void Remove(const std::string& name) { DeleteFileA((Home + name).c_str()); }
+  static bool Exists(const std::string& name) {
+    return GetFileAttributesA((Home + name).c_str()) != INVALID_FILE_ATTRIBUTES;
+  }
+  static void PutStandIn(const std::string& name);
 
-  // Files are named relative to the directory; directories on their way are created.
-  void Put(const std::string& name, const std::string& content) const;
-  std::string Content(const std::string& name) const;
-  void Remove(const std::string& name) const;
+  static void Set(const std::string& setting, const std::string& text);
+  static void RemoveSettings();
+  static std::map<std::string, std::string> Settings();  // those that are texts
 
-  void Set(const std::string& setting, const std::string& text) const;
+  // Starts the program, after it was ended; what is put into the installation before is there from the beginning.
+  void Run();
+  void Start();  // and waits for its main window
 
-  // Puts the stand-in of the emulator, points the settings at it, and has all one-time notices shown already.
-  void Configure() const;
+  // Selects a game and waits until it can be used.
+  void Select(const std::string& game) const;
 
-  // A game without and one with an entry in a catalogue of accented names, and two more.
-  void PutGames() const;
+  // The game that the list shows selected; the empty text when there is none.
+  std::string Selected() const;
 
-  // All settings that are texts, as the system's own tool tells them.
-  std::map<std::string, std::string> Settings() const;
+  void Click(Command command) const { window->Pictures[command].Click(); }
 
-  std::string CommandLine() const { return Directory + "tolvaris.exe"; }
+  // Names a file in the dialog that the command opens.
+  void Choose(Command command, const std::string& path) const;
+
+  Message Answer(int button) const { return ::Answer(*program, button); }
+
+  // The command ends, with nothing shown, and the game commands wait for the next selection.
+  void ExpectQuietEnd() const;
+
+  // The emulator is started in its directory, with the short path of a file of the ROM directory.
+  static void ExpectPlayed(const std::string& rom);
+
+  std::optional<Program> program;
+  std::optional<MainWindow> window;
 };
 
-// How a stand-in was started.
-struct Call {
-  std::string CommandLine, Directory;
-  bool operator==(const Call&) const = default;
-};
-void PrintTo(const Call& call, std::ostream* out);
+// What the system's own tool tells of a registry key and those below it: "KEY", or "KEY    NAME    TYPE    VALUE".
+std::set<std::string> Registry(const std::string& key);
 
-// Waits for the call that the program at this path recorded and forgets it, so that the next one can be waited for.
-// Empty when there is none in time.
-Call NextCall(const std::string& program);
-
-// All bytes of a file; the empty text when it is missing.
-std::string ContentOf(const std::string& path);
-
-// Contents by name.
-using Files = std::map<std::string, std::string>;
-
-// The files in a directory, whose path ends with a backslash.
-Files FilesIn(const std::string& directory);
-
-// Every byte there is, and no two contents of different kinds alike by chance.
-std::string Bytes(unsigned kind, size_t size);
-
-// The host's name for a path of ours; empty without a host.
-std::string HostPath(const std::string& path);
-
-// The path with each part in its short form, as the system makes it.
-std::string ShortPath(const std::string& path);
-
-// A disk in drive A:, which is a directory of the host. The drive has no disk before and afterwards.
+// A disk in drive A:, which holds 1440 KiB where a file system could be mounted for it. The drive has no disk before
+// and afterwards.
 class FloppyDisk {
  public:
-  explicit FloppyDisk(const std::string& directory);
+  FloppyDisk();
   ~FloppyDisk();
   FloppyDisk(const FloppyDisk&) = delete;
   FloppyDisk& operator=(const FloppyDisk&) = delete;
 
-  static bool IsReady();
-
-  // Where a file system as large as a real disk is mounted, on machines that let us.
-  static constexpr char SmallDirectory[] = "C:\\Disquete1440";
-  static bool IsSmall();  // whether such a disk is in the drive
+  static bool IsSmall();
 };

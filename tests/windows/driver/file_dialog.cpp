@@ -2,8 +2,6 @@
 
 #include "tests/windows/driver/waiting.h"
 
-namespace driver {
-
 namespace {
 
 // The identifiers of the dialog's controls, which the system's header dlgs.h gives to those who extend it.
@@ -25,8 +23,6 @@ FileDialog::FileDialog(const Program& program) {
   EXPECT_SOON(name_.Focused());
 }
 
-std::vector<std::string> FileDialog::FileTypes() const { return Choices(types_); }
-
 void FileDialog::ChooseNextType() const {
   const std::string before = types_.Text();
   types_.Click();
@@ -38,14 +34,12 @@ void FileDialog::ChooseNextType() const {
 void FileDialog::Type(const std::string& path) const {
   if (!name_.Focused()) name_.Click();
   EXPECT_SOON(name_.Focused());
-  SendMessageA(name_.Handle(), EM_SETSEL, 0, -1);
+  PressWith(VK_CONTROL, 'A');
   TypeText(path);
   EXPECT_SOON_EQ(path, name_.Text());
 }
 
-void FileDialog::Press(int button) const {
-  Part(dialog_, "Button", button).Click();
+void FileDialog::Press(WORD key) const {
+  PressKey(key);
   EXPECT_SOON(!dialog_.Visible()) << "\nthe dialog stays";
 }
-
-}  // namespace driver

@@ -1,12 +1,7 @@
 // The system's dialogs that ask for a file, seen and used as a person does.
 #pragma once
 
-#include <string>
-#include <vector>
-
 #include "tests/windows/driver/window.h"
-
-namespace driver {
 
 class FileDialog {
  public:
@@ -15,16 +10,14 @@ class FileDialog {
 
   std::string Title() const { return dialog_.Text(); }
   std::string FileName() const { return name_.Text(); }  // what stands in its box
-  std::vector<std::string> FileTypes() const;
+  std::vector<std::string> FileTypes() const { return Entries(types_); }
 
   void ChooseNextType() const;
   void Type(const std::string& path) const;  // over what stands in the box
 
-  // Presses OK or Cancel, by the identifier of the button, and waits until the dialog is gone.
-  void Press(int button) const;
+  // Presses Enter or Escape, and waits until the dialog is gone.
+  void Press(WORD key) const;
 
  private:
   Window dialog_, name_, types_;
 };
-
-}  // namespace driver

@@ -5,28 +5,19 @@
 
 #include <string>
 
-namespace driver {
-
-// A running program with all that it starts: at the end of its life, or of the test's process, they are ended.
+// A running program with all that it starts: at the end of its life, or of the test's process, they are ended. It works
+// in C:\, which is no directory of its own.
 class Program {
  public:
-  explicit Program(std::string commandLine, const std::string& directory = "");
+  explicit Program(std::string commandLine);
   ~Program();
   Program(const Program&) = delete;
   Program& operator=(const Program&) = delete;
 
   DWORD Id() const { return process_.dwProcessId; }
-  bool HasEnded() const;
+  bool HasEnded() const { return WaitForSingleObject(process_.hProcess, 0) == WAIT_OBJECT_0; }
 
  private:
   HANDLE job_;
   PROCESS_INFORMATION process_{};
 };
-
-// Runs a program to its end and gives what it wrote; its output in the console's code page is converted.
-std::string OutputOf(std::string commandLine);
-
-// Starts a program of the Linux machine below Wine; how it ends cannot be told, only what it does.
-void StartOnHost(std::string commandLine);
-
-}  // namespace driver

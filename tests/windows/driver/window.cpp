@@ -3,23 +3,22 @@
 #include <algorithm>
 #include <array>
 #include <functional>
-#include <utility>
 
 #include "tests/windows/driver/waiting.h"
-
-namespace driver {
 
 namespace {
 
 constexpr char DialogClass[] = "#32770";
 constexpr UINT AnswerLimit = 5000;  // milliseconds that a window may take to answer
 constexpr DWORD PressLimit = 3000;  // and a control to go down under the mouse
+constexpr int MostControls = 12;    // of one window
 
-int Pixels(int twips) {
-  const HDC screen = GetDC(nullptr);
-  const int pixels = MulDiv(twips, GetDeviceCaps(screen, LOGPIXELSX), 1440);
-  ReleaseDC(nullptr, screen);
-  return pixels;
+// A place of the client area, in twips, as pixels of the screen.
+POINT OnScreen(HWND window, int left, int top) {
+  const int dotsPerInch = static_cast<int>(GetDpiForSystem());
+  POINT place{MulDiv(left, dotsPerInch, 1440), MulDiv(top, dotsPerInch, 1440)};
+  ClientToScreen(window, &place);
+  return place;
 }
 
 // Sent as Unicode: Wine hands texts of another process over unconverted otherwise.
@@ -28,13 +27,6 @@ LRESULT Ask(HWND window, UINT message, WPARAM number = 0, LPARAM data = 0) {
   return SendMessageTimeoutW(window, message, number, data, SMTO_NORMAL, AnswerLimit, &result) != 0
              ? static_cast<LRESULT>(result)
              : -1;
-}
-
-std::string FromWide(const std::wstring& wide) {
-  std::string text(wide.size(), '\0');
-  WideCharToMultiByte(CP_ACP, 0, wide.data(), static_cast<int>(wide.size()), text.data(), static_cast<int>(text.size()),
-                      nullptr, nullptr);
-  return text;
 }
 
 std::string AskText(HWND window, UINT lengthMessage, UINT textMessage, WPARAM number) {
@@ -47,54 +39,28 @@ std::string AskText(HWND window, UINT lengthMessage, UINT textMessage, WPARAM nu
   return FromWide(text);
 }
 
-std::vector<std::string> AskTexts(HWND window, UINT countMessage, UINT lengthMessage, UINT textMessage) {
-  std::vector<std::string> texts;
-  const LRESULT count = Ask(window, countMessage);
-  for (LRESULT i = 0; i < count; ++i) {
-    texts.push_back(AskText(window, lengthMessage, textMessage, static_cast<WPARAM>(i)));
+// The windows below one; below none, those of all programs.
+std::vector<Window> WindowsBelow(HWND parent) {
+  std::vector<Window> windows;
+  const auto add = [](HWND window, LPARAM list) {
+    reinterpret_cast<std::vector<Window>*>(list)->emplace_back(window);
+    return TRUE;
+  };
+  if (parent == nullptr) {
+    EnumWindows(add, reinterpret_cast<LPARAM>(&windows));
+  } else {
+    EnumChildWindows(parent, add, reinterpret_cast<LPARAM>(&windows));
   }
-  return texts;
+  return windows;
 }
-
-using Visitor = std::function<bool(HWND)>;  // false ends the visit
-
-BOOL CALLBACK Visit(HWND window, LPARAM visitor) { return (*reinterpret_cast<Visitor*>(visitor))(window); }
 
 Window FirstTopWindow(const Program& program, const std::function<bool(const Window&)>& wanted) {
-  Window found;
-  Visitor visitor = [&](HWND handle) {
+  for (const Window& window : WindowsBelow(nullptr)) {
     DWORD owner = 0;
-    GetWindowThreadProcessId(handle, &owner);
-    const Window window(handle);
-    if (owner == program.Id() && window.Visible() && wanted(window)) found = window;
-    return !found;
-  };
-  EnumWindows(Visit, reinterpret_cast<LPARAM>(&visitor));
-  return found;
-}
-
-// A window that has just come takes what a person does only once it is in front.
-void WaitUntilInFront(HWND window) {
-  const HWND top = GetAncestor(window, GA_ROOT);
-  EXPECT_SOON(GetForegroundWindow() == top) << "\nthe window does not come to the front";
-}
-
-// A coordinate as SendInput wants it: the screen's size is 65536.
-LONG Normalised(LONG pixel, int size) { return MulDiv(pixel, 65536, size) + 32768 / size; }
-
-// Presses or releases the mouse's button so many times. Each event carries its own place: a window that has just come
-// under the pointer can set it back to where the display had it.
-void SendMouse(POINT place, const std::vector<DWORD>& events) {
-  std::vector<INPUT> inputs;
-  for (const DWORD event : events) {
-    INPUT input{};
-    input.type = INPUT_MOUSE;
-    input.mi.dwFlags = event | MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE;
-    input.mi.dx = Normalised(place.x, GetSystemMetrics(SM_CXSCREEN));
-    input.mi.dy = Normalised(place.y, GetSystemMetrics(SM_CYSCREEN));
-    inputs.push_back(input);
+    GetWindowThreadProcessId(window.Handle(), &owner);
+    if (owner == program.Id() && window.Visible() && wanted(window)) return window;
   }
-  SendInput(static_cast<UINT>(inputs.size()), inputs.data(), sizeof(INPUT));
+  return {};
 }
 
 GUITHREADINFO ThreadOf(HWND window) {
@@ -104,25 +70,58 @@ GUITHREADINFO ThreadOf(HWND window) {
   return info;
 }
 
+// Presses or releases the mouse's button. Each event carries its own place, in 65536ths of the screen: a window that
+// has just come under the pointer can set it back to where the display had it.
+void UseMouse(POINT place, DWORD event) {
+  const auto normalised = [](LONG pixel, int size) {
+    return static_cast<DWORD>(MulDiv(pixel, 65536, size) + 32768 / size);
+  };
+  mouse_event(event | MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE, normalised(place.x, GetSystemMetrics(SM_CXSCREEN)),
+              normalised(place.y, GetSystemMetrics(SM_CYSCREEN)), 0, 0);
+}
+
 // A person sees a control go down under the mouse before he lets go, and presses again when it did not: while the
 // display still moves the focus to a window that has just come, a press can be lost.
 void ClickOnce(HWND window, POINT place) {
   for (int tries = 0; tries < 3; ++tries) {
-    SendMouse(place, {MOUSEEVENTF_LEFTDOWN});
+    UseMouse(place, MOUSEEVENTF_LEFTDOWN);
     const bool down = Eventually([&] { return ThreadOf(window).hwndCapture != nullptr; }, PressLimit);
-    SendMouse(place, {MOUSEEVENTF_LEFTUP});
+    UseMouse(place, MOUSEEVENTF_LEFTUP);
     if (down) return;
   }
 }
 
-void ClickPlace(HWND window, POINT place, int times) {
-  WaitUntilInFront(window);
+// A window that has just come takes what a person does only once it is in front.
+void ClickMiddle(HWND window, RECT area, int times) {
+  const POINT place = {(area.left + area.right) / 2, (area.top + area.bottom) / 2};
+  const HWND top = GetAncestor(window, GA_ROOT);
+  EXPECT_SOON(GetForegroundWindow() == top) << "\nthe window does not come to the front";
   SetCursorPos(place.x, place.y);
   if (times == 1) return ClickOnce(window, place);
-  SendMouse(place, {MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP, MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP});
+  for (const DWORD event : {MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP, MOUSEEVENTF_LEFTDOWN, MOUSEEVENTF_LEFTUP}) {
+    UseMouse(place, event);
+  }
+}
+
+Message AnswerBy(const Program& program, const std::function<void(HWND)>& press) {
+  Window dialog;
+  if (!Eventually([&] { return static_cast<bool>(dialog = FindMessage(program)); })) return {};
+  Message message{dialog.Text(), "", {}};
+  for (const Window& child : dialog.Children()) {
+    if (child.Class() == "Static" && !child.Text().empty()) message.Text = child.Text();
+    if (child.Class() == "Button" && child.Visible()) message.Buttons.push_back(GetDlgCtrlID(child.Handle()));
+  }
+  press(dialog.Handle());
+  return Eventually([&] { return !dialog.Visible(); }) ? message : Message{};
 }
 
 }  // namespace
+
+std::string FromWide(const std::wstring& wide) {
+  std::string text;
+  for (const wchar_t letter : wide) text += static_cast<char>(letter);
+  return text;
+}
 
 std::string Window::Text() const { return AskText(handle_, WM_GETTEXTLENGTH, WM_GETTEXT, 0); }
 
@@ -140,19 +139,10 @@ RECT Window::Place() const {
   return place;
 }
 
-std::vector<Window> Window::Children() const {
-  std::vector<Window> children;
-  Visitor visitor = [&](HWND handle) {
-    children.emplace_back(handle);
-    return true;
-  };
-  EnumChildWindows(handle_, Visit, reinterpret_cast<LPARAM>(&visitor));
-  return children;
-}
+std::vector<Window> Window::Children() const { return WindowsBelow(handle_); }
 
 Window Window::ChildAt(int left, int top) const {
-  POINT place{Pixels(left), Pixels(top)};
-  ClientToScreen(handle_, &place);
+  const POINT place = OnScreen(handle_, left, top);
   for (const Window& child : Children()) {
     const RECT area = child.Place();
     if (area.left == place.x && area.top == place.y) return child;
@@ -167,9 +157,34 @@ Window Window::Child(const std::string& text) const {
   return {};
 }
 
+std::string Window::Picture() const {
+  const RECT place = Place();
+  BITMAPINFO format{};
+  BITMAPINFOHEADER& header = format.bmiHeader;
+  header = {sizeof header, place.right - place.left, place.bottom - place.top, 1, 32, BI_RGB, 0, 0, 0, 0, 0};
+  const size_t size = static_cast<size_t>(4 * header.biWidth * header.biHeight);
+  void* pixels = nullptr;
+  const HDC screen = GetDC(nullptr);
+  const HDC copy = CreateCompatibleDC(screen);
+  const HBITMAP bitmap = CreateDIBSection(screen, &format, DIB_RGB_COLORS, &pixels, nullptr, 0);
+  const HGDIOBJ before = SelectObject(copy, bitmap);
+  BitBlt(copy, 0, 0, header.biWidth, header.biHeight, screen, place.left, place.top, SRCCOPY);
+  GdiFlush();
+  const auto bytes = [](const void* data, size_t length) {
+    return std::string(static_cast<const char*>(data), length);
+  };
+  const DWORD start = sizeof(BITMAPFILEHEADER) + sizeof header;
+  const BITMAPFILEHEADER file{0x4D42, start + static_cast<DWORD>(size), 0, 0, start};  // "BM"
+  std::string picture = bytes(&file, sizeof file) + bytes(&header, sizeof header) + bytes(pixels, size);
+  SelectObject(copy, before);
+  DeleteObject(bitmap);
+  DeleteDC(copy);
+  ReleaseDC(nullptr, screen);
+  return picture;
+}
+
 COLORREF Window::Colour(int left, int top) const {
-  POINT place{Pixels(left), Pixels(top)};
-  ClientToScreen(handle_, &place);
+  const POINT place = OnScreen(handle_, left, top);
   const HDC screen = GetDC(nullptr);
   const COLORREF colour = GetPixel(screen, place.x, place.y);
   ReleaseDC(nullptr, screen);
@@ -181,16 +196,7 @@ void Window::FinishPainting() const {
   Ask(handle_, WM_NULL);
 }
 
-void Window::Click() const {
-  const RECT place = Place();
-  ClickPlace(handle_, {(place.left + place.right) / 2, (place.top + place.bottom) / 2}, 1);
-}
-
-void Window::ClickAt(int left, int top, int times) const {
-  POINT place{Pixels(left), Pixels(top)};
-  ClientToScreen(handle_, &place);
-  ClickPlace(handle_, place, times);
-}
+void Window::Click() const { ClickMiddle(handle_, Place(), 1); }
 
 void Window::CloseByUser() const { PostMessageW(handle_, WM_SYSCOMMAND, SC_CLOSE, 0); }
 
@@ -203,39 +209,15 @@ Window FindMessage(const Program& program) {
   return FirstTopWindow(program, [](const Window& window) { return window.Class() == DialogClass; });
 }
 
-void PressKey(WORD key) {
-  std::array<INPUT, 2> inputs{};
-  for (INPUT& input : inputs) {
-    input.type = INPUT_KEYBOARD;
-    input.ki.wVk = key;
+std::vector<std::string> Entries(const Window& control) {
+  const bool isList = control.Class() == "ListBox";
+  const LRESULT count = Ask(control.Handle(), isList ? LB_GETCOUNT : CB_GETCOUNT);
+  std::vector<std::string> entries;
+  for (LRESULT i = 0; i < count; ++i) {
+    entries.push_back(AskText(control.Handle(), isList ? LB_GETTEXTLEN : CB_GETLBTEXTLEN,
+                              isList ? LB_GETTEXT : CB_GETLBTEXT, static_cast<WPARAM>(i)));
   }
-  inputs[1].ki.dwFlags = KEYEVENTF_KEYUP;
-  SendInput(UINT{inputs.size()}, inputs.data(), sizeof(INPUT));
-}
-
-void TypeText(const std::string& text) {
-  std::wstring wide(text.size(), L'\0');
-  MultiByteToWideChar(CP_ACP, 0, text.data(), static_cast<int>(text.size()), wide.data(),
-                      static_cast<int>(wide.size()));
-  std::vector<INPUT> inputs;
-  for (const wchar_t letter : wide) {
-    for (const DWORD release : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) {
-      INPUT input{};
-      input.type = INPUT_KEYBOARD;
-      input.ki.wScan = letter;
-      input.ki.dwFlags = KEYEVENTF_UNICODE | release;
-      inputs.push_back(input);
-    }
-  }
-  SendInput(static_cast<UINT>(inputs.size()), inputs.data(), sizeof(INPUT));
-}
-
-std::vector<std::string> Entries(const Window& list) {
-  return AskTexts(list.Handle(), LB_GETCOUNT, LB_GETTEXTLEN, LB_GETTEXT);
-}
-
-std::vector<std::string> Choices(const Window& comboBox) {
-  return AskTexts(comboBox.Handle(), CB_GETCOUNT, CB_GETLBTEXTLEN, CB_GETLBTEXT);
+  return entries;
 }
 
 int SelectedEntry(const Window& list) { return static_cast<int>(Ask(list.Handle(), LB_GETCURSEL)); }
@@ -243,15 +225,42 @@ int SelectedEntry(const Window& list) { return static_cast<int>(Ask(list.Handle(
 void ClickEntry(const Window& list, const std::string& text, int times) {
   const std::vector<std::string> entries = Entries(list);
   const auto entry = std::find(entries.begin(), entries.end(), text);
-  if (entry == entries.end()) {
-    ADD_FAILURE() << "the list has no entry " << text;
-    return;
-  }
+  ASSERT_TRUE(entry != entries.end()) << "the list has no entry " << text;
   RECT area{};
   Ask(list.Handle(), LB_GETITEMRECT, static_cast<WPARAM>(entry - entries.begin()), reinterpret_cast<LPARAM>(&area));
-  POINT middle{(area.left + area.right) / 2, (area.top + area.bottom) / 2};
-  ClientToScreen(list.Handle(), &middle);
-  ClickPlace(list.Handle(), middle, times);
+  MapWindowPoints(list.Handle(), nullptr, reinterpret_cast<POINT*>(&area), 2);
+  ClickMiddle(list.Handle(), area, times);
+}
+
+void PressKey(WORD key) {
+  for (const DWORD event : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) keybd_event(static_cast<BYTE>(key), 0, event, 0);
+}
+
+void PressWith(WORD modifier, WORD key) {
+  keybd_event(static_cast<BYTE>(modifier), 0, 0, 0);
+  PressKey(key);
+  keybd_event(static_cast<BYTE>(modifier), 0, KEYEVENTF_KEYUP, 0);
+}
+
+void TypeText(const std::string& text) {
+  for (const char letter : text) {
+    for (const DWORD event : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) {
+      INPUT input{};
+      input.type = INPUT_KEYBOARD;
+      input.ki.wScan = static_cast<unsigned char>(letter);
+      input.ki.dwFlags = KEYEVENTF_UNICODE | event;
+      SendInput(1, &input, sizeof input);
+    }
+  }
+}
+
+bool TabTo(const Window& control) {
+  for (int i = 0; i < MostControls && !control.Focused(); ++i) {
+    const HWND before = ThreadOf(control.Handle()).hwndFocus;
+    PressKey(VK_TAB);
+    if (!Eventually([&] { return ThreadOf(control.Handle()).hwndFocus != before; })) return false;
+  }
+  return control.Focused();
 }
 
 void PrintTo(const Message& message, std::ostream* out) {
@@ -259,23 +268,13 @@ void PrintTo(const Message& message, std::ostream* out) {
   for (const int button : message.Buttons) *out << ' ' << button;
 }
 
-Message ReadMessage(const Window& dialog) {
-  Message message{dialog.Text(), "", {}};
-  for (const Window& child : dialog.Children()) {
-    if (child.Class() == "Static" && !child.Text().empty()) message.Text = child.Text();
-    if (child.Class() == "Button" && child.Visible()) message.Buttons.push_back(GetDlgCtrlID(child.Handle()));
-  }
-  return message;
-}
-
 Message Answer(const Program& program, int button) {
-  Window dialog;
-  if (!Eventually([&] { return static_cast<bool>(dialog = FindMessage(program)); })) return {};
-  const Message message = ReadMessage(dialog);
-  const Window pressed(GetDlgItem(dialog.Handle(), button));
-  if (!pressed) return {};
-  pressed.Click();
-  return Eventually([&] { return !dialog.Visible(); }) ? message : Message{};
+  return AnswerBy(program, [&](HWND dialog) { Window(GetDlgItem(dialog, button)).Click(); });
 }
 
-}  // namespace driver
+Message AnswerWithKey(const Program& program, WORD key) {
+  return AnswerBy(program, [&](HWND dialog) {
+    EXPECT_SOON(GetForegroundWindow() == dialog && GetAncestor(ThreadOf(dialog).hwndFocus, GA_ROOT) == dialog);
+    PressKey(key);
+  });
+}

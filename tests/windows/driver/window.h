@@ -9,7 +9,8 @@
 
 #include "tests/windows/driver/program.h"
 
-namespace driver {
+// A text in code page 1252; each of its letters must be one of Latin-1, whose codes are those of Unicode.
+std::string FromWide(const std::wstring& wide);
 
 class Window {
  public:
@@ -30,12 +31,12 @@ class Window {
   Window ChildAt(int left, int top) const;
   Window Child(const std::string& text) const;
 
-  // The colour on the screen at a place of the client area.
+  // What is on the screen there: all of it as a BMP file, or the colour at a place of the client area.
+  std::string Picture() const;
   COLORREF Colour(int left, int top) const;
   void FinishPainting() const;  // returns when everything that waits to be drawn is on the screen
 
-  void Click() const;  // in its middle
-  void ClickAt(int left, int top, int times = 1) const;
+  void Click() const;        // in its middle
   void CloseByUser() const;  // as its close box does
 
  private:
@@ -48,16 +49,17 @@ Window FindVisible(const Program& program, const std::string& title);
 // The visible message of the program, or none.
 Window FindMessage(const Program& program);
 
-void PressKey(WORD key);
-void TypeText(const std::string& text);
-
-// Entries of a list box. Positions start at 0.
-std::vector<std::string> Entries(const Window& list);
+// Entries of a list box, or of a combo box. Positions start at 0.
+std::vector<std::string> Entries(const Window& control);
 int SelectedEntry(const Window& list);  // -1: none
 void ClickEntry(const Window& list, const std::string& text, int times = 1);
 
-// Entries of a combo box.
-std::vector<std::string> Choices(const Window& comboBox);
+void PressKey(WORD key);
+void PressWith(WORD modifier, WORD key);
+void TypeText(const std::string& text);
+
+// Presses Tab until the control has the keyboard; false when it does not get it.
+bool TabTo(const Window& control);
 
 // What a message shows.
 struct Message {
@@ -67,10 +69,7 @@ struct Message {
 };
 void PrintTo(const Message& message, std::ostream* out);
 
-Message ReadMessage(const Window& dialog);
-
-// Waits for a message of the program, presses one of its buttons, waits until it is gone, and tells what it showed.
-// Without a message, or without that button, everything of the result is empty.
+// Waits for a message of the program, presses one of its buttons or a key, waits until it is gone, and tells what it
+// showed. Without a message everything of the result is empty.
 Message Answer(const Program& program, int button);
-
-}  // namespace driver
+Message AnswerWithKey(const Program& program, WORD key);

@@ -1,16 +1,10 @@
 // From what is downloaded to a game that runs, and back: the installer and the zip on a machine that never saw either.
-#include <algorithm>
 #include <array>
-#include <fstream>
 
-#include "tests/windows/installation.h"
-#include "tests/windows/main_window.h"
+#include "tests/windows/files.h"
+#include "tests/windows/program_windows.h"
 
 namespace {
-
-using driver::Answer;
-using driver::Program;
-using driver::Window;
 
 constexpr char UninstallKey[] = "Software\\Microsoft\\Windows\\CurrentVersion\\Uninstall\\Tolvaris";
 constexpr char SettingsKey[] = "Software\\Roms\\Tolvaris";
@@ -26,26 +20,10 @@ std::string Registered(const char* key, const char* name) {
   return text.data();
 }
 
-// The files in a directory and in those below it, sorted; a directory without any is named with a backslash.
-std::vector<std::string> Files(const std::string& directory, const std::string& below = "") {
-  std::vector<std::string> files;
-  WIN32_FIND_DATAA found{};
-  const HANDLE search = FindFirstFileA((directory + below + "*").c_str(), &found);
-  if (search == INVALID_HANDLE_VALUE) return files;
-  do {
-    const std::string name = found.cFileName;
-    if (name == "." || name == "..") continue;
-    const bool isDirectory = (found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
-    const std::vector<std::string> inside = isDirectory ? Files(directory, below + name + "\\") : files;
-    if (isDirectory && !inside.empty()) {
-      files.insert(files.end(), inside.begin(), inside.end());
-    } else {
-      files.push_back(below + name + (isDirectory ? "\\" : ""));
-    }
-  } while (FindNextFileA(search, &found));
-  FindClose(search);
-  std::sort(files.begin(), files.end());
-  return files;
+std::vector<std::string> NamesIn(const std::string& directory) {
+  std::vector<std::string> names;
+  for (const auto& [name, content] : FilesIn(directory)) names.push_back(name);
+  return names;
 }
 
 std::string Folder(const char* variable) {
@@ -55,11 +33,6 @@ std::string Folder(const char* variable) {
 }
 
 std::string Shortcut() { return Folder("APPDATA") + "\\Microsoft\\Windows\\Start Menu\\Programs\\Tolvaris.lnk"; }
-
-void Put(const std::string& path, const std::string& content) {
-  CreateDirectoryA(path.substr(0, path.rfind('\\')).c_str(), nullptr);
-  EXPECT_TRUE((std::ofstream(path, std::ios::binary) << content).flush()) << path;
-}
 
 void RunToItsEnd(const std::string& commandLine) {
   const Program program(commandLine);
@@ -76,7 +49,7 @@ void Uninstall() {
 // As a person does it who wants nothing to stay. It goes in place, as one program, and so cannot delete itself.
 void UninstallWithTheSettings(const std::string& directory) {
   const Program program(directory + "desinstalar.exe _?=" + directory.substr(0, directory.size() - 1));
-  const auto button = [&](int id) { return Window(GetDlgItem(driver::FindMessage(program).Handle(), id)); };
+  const auto button = [&](int id) { return Window(GetDlgItem(FindMessage(program).Handle(), id)); };
   ASSERT_SOON(button(IDOK).Visible());
   button(IDOK).Click();
   ASSERT_SOON(button(IDYES));
@@ -99,8 +72,7 @@ class Release : public testing::Test {
  protected:
   Release() {
     RegDeleteTreeA(HKEY_CURRENT_USER, SettingsKey);
-    CreateDirectoryA("C:\\Program Files\\Emulador ZSNES", nullptr);
-    EXPECT_TRUE(CopyFileA(EMULATOR_STANDIN, Emulator, FALSE));
+    PutFile(Emulator, ContentOf(STANDIN));
     EXPECT_TRUE(CopyFileA(INSTALLER, Downloaded, FALSE)) << INSTALLER << " could not be built: is nsis installed?";
   }
 
@@ -119,11 +91,11 @@ class Release : public testing::Test {
 
   // The first start in a directory, and the game that it holds.
   static void PlayFirstGame(const std::string& directory, const Words& words) {
-    Put(directory + Game, "jogo");
+    PutFile(directory + Game, "jogo");
     const Program program(directory + "tolvaris.exe");
     Configure(program, words);
     EXPECT_EQ(Answer(program, IDOK).Title, words.Information);
-    driver::FindVisible(program, words.Controller).Child(words.Close).Click();
+    FindVisible(program, words.Controller).Child(words.Close).Click();
     const MainWindow window(program);
     EXPECT_EQ(window.Play.Text(), words.Play);
     EXPECT_EQ(Entries(window.List), std::vector<std::string>{"Corrida das Nuvens"});
@@ -137,7 +109,7 @@ class Release : public testing::Test {
     EXPECT_EQ(emulator.find(' '), std::string::npos);
     const Call expected = {emulator + " " + ShortPath(directory + Game), emulator.substr(0, emulator.rfind('\\'))};
     EXPECT_EQ(NextCall(Emulator), expected);
-    window.Window.CloseByUser();
+    window.CloseByUser();
     EXPECT_SOON(program.HasEnded());
   }
 };
@@ -147,38 +119,38 @@ TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
   RunToItsEnd(std::string(Downloaded) + " /S");
   const std::vector<std::string> installed = {"CHANGELOG.txt", "LEIAME.txt", "desinstalar.exe", "tolvaris.exe",
                                               "tolvariscfg.exe"};
-  ASSERT_EQ(Files(directory), installed);
+  ASSERT_EQ(NamesIn(directory), installed);
   EXPECT_EQ(Registered(UninstallKey, "InstallLocation") + "\\", directory);
   EXPECT_NE(ContentOf(Shortcut()), "");
   PlayFirstGame(directory, Portuguese);
   {
     const Program program(directory + "tolvaris.exe");
     const MainWindow window(program);
-    const std::vector<std::string> before = Files(directory);
+    const std::vector<std::string> before = NamesIn(directory);
     RunToItsEnd("\"" + directory + "desinstalar.exe\" /S _?=" + directory.substr(0, directory.size() - 1));
-    EXPECT_EQ(Files(directory), before) << "nothing goes while the program is open";
+    EXPECT_EQ(NamesIn(directory), before) << "nothing goes while the program is open";
   }
-  Put(directory + "Imgs\\Corrida das Nuvens.gif", "figura");
-  Put(directory + "language.ini", "[TOLVARIS20]\r\n");
+  PutFile(directory + "Imgs\\Corrida das Nuvens.gif", "figura");
+  PutFile(directory + "language.ini", "[TOLVARIS20]\r\n");
   Uninstall();
   const std::vector<std::string> left = {"Imgs\\Corrida das Nuvens.gif", Game, "language.ini", "tolvaris.dat"};
-  EXPECT_SOON_EQ(left, Files(directory));
+  EXPECT_SOON_EQ(left, NamesIn(directory));
   EXPECT_EQ(Registered(SettingsKey, "LRom"), "Corrida das Nuvens");
 }
 
 TEST_F(Release, InstalledInEnglishWhereThePersonLikes) {
   const std::string directory = "C:\\Área de Jogos\\";
-  Put(directory + "language.ini", "[TOLVARIS20]\r\nJogar=Jugar\r\n");
+  PutFile(directory + "language.ini", "[TOLVARIS20]\r\nJogar=Jugar\r\n");
   RunToItsEnd(std::string(Downloaded) + " /S /INGLES /D=C:\\Área de Jogos");
   PlayFirstGame(directory, English);
   RunToItsEnd(std::string(Downloaded) + " /S");  // once more, over it
   const std::vector<std::string> installed = {"CHANGELOG.txt", "Imgs\\",          "LEIAME.txt",          Game,
                                               "Saves\\",       "desinstalar.exe", "language.antes1.ini", "language.ini",
                                               "tolvaris.dat",  "tolvaris.exe",    "tolvariscfg.exe"};
-  EXPECT_EQ(Files(directory), installed);
+  EXPECT_EQ(NamesIn(directory), installed);
   UninstallWithTheSettings(directory);
   const std::vector<std::string> left = {Game, "desinstalar.exe", "language.antes1.ini", "tolvaris.dat"};
-  EXPECT_EQ(Files(directory), left);
+  EXPECT_EQ(NamesIn(directory), left);
   EXPECT_EQ(Registered(SettingsKey, "LRom"), "");
 }
 
