@@ -81,6 +81,19 @@ std::string Gif(COLORREF colour) {
          size + std::string("\0\2\2\x44\1\0;", 7);
 }
 
+std::string Pacote(const std::string& directory, const std::string& arguments) {
+  // A program of the machine that Wine runs on. Its output takes its name when it is complete.
+  std::string command = "/bin/sh -c \"python3 '" PACOTE_PY "' " + arguments + " >saida- 2>&1; mv saida- saida\"";
+  STARTUPINFOA how{};
+  PROCESS_INFORMATION started{};
+  EXPECT_TRUE(
+      CreateProcessA(nullptr, command.data(), nullptr, nullptr, FALSE, 0, nullptr, directory.c_str(), &how, &started));
+  EXPECT_SOON(std::filesystem::exists(Path(directory + "saida"))) << arguments;
+  const std::string output = ContentOf(directory + "saida");
+  std::filesystem::remove(Path(directory + "saida"));
+  return output;
+}
+
 std::string Package(const std::string& name, const std::string& dosName, const std::string& checksum,
                     const std::string& picture, const std::string& rom) {
   return "TOLVARIS\r\nNOME=" + name + "\r\nNOMEDOS=" + dosName + "\r\nCRC=" + checksum +

@@ -51,7 +51,9 @@ TEST_F(ImportGame, OfAPackageAsksBeforeItReplaces) {
   const COLORREF blue = RGB(30, 60, 230);
   const std::string rom = Bytes(1, (2 << 20) + 5);
   const std::string path = Outside + "jogo.TVK";
-  PutFile(path, Package(name, "CORACAO", "-849089814", Gif(red), rom));
+  PutFile(Outside + "figura", Gif(red));
+  PutFile(Outside + "rom", rom);
+  EXPECT_EQ(Pacote(Outside, "montar jogo.TVK '" + name + "' CORACAO figura rom"), "");
   Start();
   Files expected = FilesIn(Home);
   Choose(Import, path);
