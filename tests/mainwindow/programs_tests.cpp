@@ -46,6 +46,8 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   }
   EXPECT_EQ(StartedProcesses().size(), 5U);
   EXPECT_EQ(Messages(), Texts{});
+  EXPECT_FALSE(form->Form_Load()) << "loaded again once a game was started, the window closes";
+  EXPECT_TRUE(form->IsClosed());
 }
 
 TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
