@@ -85,13 +85,14 @@ HBRUSH TextGround(const WindowState& window, HDC context, HWND sender) {
   return static_cast<HBRUSH>(::GetStockObject(WHITE_BRUSH));
 }
 
-// The mouse's own messages go past a control that is disabled; its place does not.
+// The mouse's own messages go past a control that is disabled, and a frame lies over the controls in it.
 bool MouseAsksForToolTip(const WindowState& window) {
-  POINT place = {};
-  ::GetCursorPos(&place);
-  ::ScreenToClient(window.Handle, &place);
-  const ControlState* control = FindControl(window, ::ChildWindowFromPoint(window.Handle, place));
-  return control != nullptr && !control->ToolTip.empty();
+  POINT mouse = {};
+  ::GetCursorPos(&mouse);
+  return std::any_of(window.Controls.begin(), window.Controls.end(), [&](const ControlState* control) {
+    RECT place = {};
+    return !control->ToolTip.empty() && ::GetWindowRect(control->Handle, &place) && ::PtInRect(&place, mouse);
+  });
 }
 
 // Whether the message is answered here, and the answer.

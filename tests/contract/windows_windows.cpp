@@ -42,6 +42,19 @@ TEST_F(NativeWindow, IsCentredAndLaidOutAgainAtAnotherResolution) {
   }
 }
 
+// The frame lies over the image.
+TEST_F(NativeWindow, HasToolTipsOnceTheMouseComesToAControlWithOne) {
+  const auto tips = [this](const Control& control) {
+    RECT place = {};
+    ::GetWindowRect(control.State().Handle, &place);
+    ::SetCursorPos((place.left + place.right) / 2, (place.top + place.bottom) / 2);
+    ::SendMessageA(window.State().Handle, WM_SETCURSOR, reinterpret_cast<WPARAM>(window.State().Handle), HTCLIENT);
+    return window.State().ToolTips;
+  };
+  EXPECT_EQ(tips(list), nullptr);
+  EXPECT_NE(tips(image), nullptr);
+}
+
 TEST_F(NativeWindow, FileDialogsReturnThePathAndKeepTheCurrentDirectory) {
   const std::function<void()> press = [&] {
     const HWND dialog = ::GetLastActivePopup(window.State().Handle);
