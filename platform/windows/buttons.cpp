@@ -40,16 +40,12 @@ void PressOnEnter(ControlState& control) {
 Button::Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font) {
   CreateControl(*state_, container, bounds, {"BUTTON", WS_TABSTOP | BS_PUSHBUTTON | BS_MULTILINE}, caption, font);
   PressOnEnter(*state_);
-  state_->OnNotification = [this](int code) {
-    if (IsClick(code)) Raise(OnClick);
-  };
+  state_->OnNotification = RaiseWhenClicked(OnClick);
 }
 
 Button::Button(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
   CreateIconButton(*state_, container, bounds, BS_PUSHBUTTON, icon, toolTip);
-  state_->OnNotification = [this](int code) {
-    if (IsClick(code)) Raise(OnClick);
-  };
+  state_->OnNotification = RaiseWhenClicked(OnClick);
 }
 
 void Button::SetIcon(int id) {

@@ -48,9 +48,7 @@ ImageButton::ImageButton(const Container& container, const Bounds& bounds, int p
   state_->Draw = [this](const DRAWITEMSTRUCT& item) { DrawImageButton(item, state_->Shown); };
   state_->NamedByToolTip = true;
   PressOnEnter(*state_);
-  state_->OnNotification = [this](int code) {
-    if (IsClick(code)) Raise(OnClick);
-  };
+  state_->OnNotification = RaiseWhenClicked(OnClick);
   SetToolTip(toolTip);
 }
 

@@ -27,7 +27,8 @@ int FindExactIn(const std::vector<std::string>& texts, const std::string& text) 
   return found == texts.end() ? -1 : static_cast<int>(found - texts.begin());
 }
 
-std::vector<const std::string*> Pointers(const std::vector<std::string>& texts, bool sorted) {
+// The texts as the list is to hold them.
+std::vector<const std::string*> AsListed(const std::vector<std::string>& texts, bool sorted) {
   std::vector<const std::string*> given;
   given.reserve(texts.size());
   for (const std::string& text : texts) given.push_back(&text);
@@ -70,7 +71,7 @@ void ListBox::Fill(const std::vector<std::string>& texts) {
   const bool sorted = (::GetWindowLongPtrA(state_->Handle, GWL_STYLE) & LBS_SORT) != 0;
   ::SendMessageA(state_->Handle, WM_SETREDRAW, FALSE, 0);
   Clear();
-  for (const std::string* text : Pointers(texts, sorted)) {
+  for (const std::string* text : AsListed(texts, sorted)) {
     ::SendMessageA(state_->Handle, LB_INSERTSTRING, static_cast<WPARAM>(-1), reinterpret_cast<LPARAM>(text->c_str()));
   }
   ::SendMessageA(state_->Handle, WM_SETREDRAW, TRUE, 0);

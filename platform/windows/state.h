@@ -110,9 +110,6 @@ void StartToolTips(WindowState& window);
 // Enter presses the button that has the keyboard; a key that is held down does so once.
 void PressOnEnter(ControlState& button);
 
-// A second click that follows at once is a click like any other.
-inline bool IsClick(int notification) { return notification == BN_CLICKED || notification == BN_DOUBLECLICKED; }
-
 // Calls a handler of the program's logic. What it throws ends here.
 template <typename Handler, typename... Arguments>
 void Raise(const Handler& handler, Arguments... arguments) noexcept {
@@ -121,6 +118,13 @@ void Raise(const Handler& handler, Arguments... arguments) noexcept {
     if (kept) kept(arguments...);
   } catch (...) {
   }
+}
+
+// What a button does when it is notified. A second click that follows at once is a click like any other.
+inline auto RaiseWhenClicked(const std::function<void()>& handler) {
+  return [&handler](int code) {
+    if (code == BN_CLICKED || code == BN_DOUBLECLICKED) Raise(handler);
+  };
 }
 
 }  // namespace platform
