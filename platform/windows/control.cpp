@@ -129,6 +129,17 @@ void LayOutControl(ControlState& control) {
   UpdateToolTip(control);
 }
 
+void ApplyState(const ControlState& control) {
+  if (control.Handle == nullptr) return;
+  const bool enabled = ::IsWindowEnabled(control.Handle) != FALSE;
+  const bool visible = (::GetWindowLongPtrA(control.Handle, GWL_STYLE) & WS_VISIBLE) != 0;
+  if (enabled == control.Enabled && visible == control.Visible) return;
+  if (enabled != control.Enabled) ::EnableWindow(control.Handle, control.Enabled);
+  if (visible != control.Visible) ::ShowWindow(control.Handle, control.Visible ? SW_SHOWNA : SW_HIDE);
+  KeepFocus(control, control.Enabled && control.Visible);
+  UpdateToolTip(control);
+}
+
 void SetNativeText(const ControlState& control, const std::string& text) {
   ::SetWindowTextA(control.Handle, text.c_str());
 }
@@ -147,21 +158,17 @@ Control::~Control() {
 bool Control::Enabled() const { return state_->Enabled; }
 
 void Control::Enable(bool enabled) {
-  if (state_->Handle == nullptr) return;
+  if (state_->Handle == nullptr || enabled == state_->Enabled) return;
   state_->Enabled = enabled;
-  ::EnableWindow(state_->Handle, enabled);
-  KeepFocus(*state_, enabled);
-  UpdateToolTip(*state_);
+  if (::IsWindowVisible(state_->Owner->Handle)) ApplyState(*state_);
 }
 
 bool Control::Visible() const { return state_->Visible; }
 
 void Control::Show(bool visible) {
-  if (state_->Handle == nullptr) return;
+  if (state_->Handle == nullptr || visible == state_->Visible) return;
   state_->Visible = visible;
-  ::ShowWindow(state_->Handle, visible ? SW_SHOWNA : SW_HIDE);
-  KeepFocus(*state_, visible);
-  UpdateToolTip(*state_);
+  if (::IsWindowVisible(state_->Owner->Handle)) ApplyState(*state_);
 }
 
 void Control::SetFocus() {

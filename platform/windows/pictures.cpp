@@ -7,6 +7,7 @@
 
 #include "platform/windows/drawing.h"
 #include "platform/windows/gif.h"
+#include "platform/windows/resource.h"
 #include "platform/windows/whole_file.h"
 #include "platform/windows/wic.h"
 
@@ -31,11 +32,6 @@ Picture LoadPicture(std::string_view content) {
   return {};
 }
 
-Picture LoadPictureResource(int id) {
-  const HRSRC resource = ::FindResourceA(nullptr, MAKEINTRESOURCEA(id), "GIF");
-  const HGLOBAL loaded = resource != nullptr ? ::LoadResource(nullptr, resource) : nullptr;
-  if (loaded == nullptr) return {};
-  return LoadPicture({static_cast<const char*>(::LockResource(loaded)), ::SizeofResource(nullptr, resource)});
-}
+Picture LoadPictureResource(int id) { return LoadPicture(Resource(id, "GIF")); }
 
 }  // namespace platform

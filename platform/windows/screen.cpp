@@ -1,5 +1,7 @@
 #include "platform/windows/screen.h"
 
+#include <memory>
+#include <type_traits>
 #include <utility>
 #include <vector>
 
@@ -78,12 +80,6 @@ HFONT FontFor(const Font& font, int dpi) {
   known.push_back({font, dpi, {}});
   known.back().Handle.reset(CreateFontFor(font, dpi));
   return known.back().Handle.get();
-}
-
-IconHandle LoadIconFor(int id, int side, int dpi) {
-  const int pixels = ::MulDiv(side, dpi, UsualDpi);
-  return IconHandle(static_cast<HICON>(
-      ::LoadImageA(::GetModuleHandleA(nullptr), MAKEINTRESOURCEA(id), IMAGE_ICON, pixels, pixels, LR_DEFAULTCOLOR)));
 }
 
 }  // namespace platform

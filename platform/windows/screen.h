@@ -1,10 +1,7 @@
-// What depends on the screen's resolution: lengths, fonts and icons.
+// What depends on the screen's resolution: lengths and fonts.
 #pragma once
 
 #include <windows.h>
-
-#include <memory>
-#include <type_traits>
 
 #include "platform/controls.h"
 
@@ -26,13 +23,5 @@ SIZE WindowSize(const WindowStyle& style, int dpi);
 
 // The font that the controls use; it lives as long as the program.
 HFONT FontFor(const Font& font, int dpi);
-
-struct IconDeleter {
-  void operator()(HICON icon) const { ::DestroyIcon(icon); }
-};
-using IconHandle = std::unique_ptr<std::remove_pointer_t<HICON>, IconDeleter>;
-
-// An icon of the program's resources, as large as `side` pixels are at UsualDpi. Null when there is none.
-IconHandle LoadIconFor(int id, int side, int dpi);
 
 }  // namespace platform

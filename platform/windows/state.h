@@ -1,13 +1,17 @@
 // What stands behind the windows and controls of the program.
 #pragma once
 
+// clang-format off
 #include <windows.h>
+#include <commctrl.h>
+// clang-format on
 
 #include <functional>
 #include <string>
 #include <vector>
 
 #include "platform/controls.h"
+#include "platform/windows/icons.h"
 #include "platform/windows/screen.h"
 
 namespace platform {
@@ -40,7 +44,7 @@ struct ControlState {
   bool NamedByToolTip = false;  // the native text is the tool tip
   bool WhiteGround = false;
   bool Framed = false;  // something lies around its client area
-  IconHandle Icon;
+  ButtonImage Image;
   Picture Shown;
   bool EnterIsKey = false;  // Enter goes to OnKey and not to the window
 
@@ -53,7 +57,8 @@ struct ControlState {
   std::function<void(int code)> OnNotification;       // the high word of WM_COMMAND
   std::function<bool(int key, bool repeated)> OnKey;  // WM_KEYDOWN; true: that was all
   std::function<void(const DRAWITEMSTRUCT&)> Draw;
-  std::function<void()> Remember;  // keeps what is asked for after the window is closed
+  std::function<void(const NMCUSTOMDRAW&)> DrawFace;  // what a button shows in place of its text
+  std::function<void()> Remember;                     // keeps what is asked for after the window is closed
 };
 
 struct TimerState {
@@ -97,6 +102,10 @@ void CreateControl(ControlState& control, const Container& container, const Boun
 
 // Puts the control where its bounds say at the window's resolution, in its font.
 void LayOutControl(ControlState& control);
+
+// Makes the native control enabled and visible as its state says. Until its window is shown that can wait: each change
+// has its price, even unseen.
+void ApplyState(const ControlState& control);
 
 void SetNativeText(const ControlState& control, const std::string& text);
 

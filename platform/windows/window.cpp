@@ -45,6 +45,14 @@ RECT PlaceOf(const WindowState& window) {
   return place;
 }
 
+// Nothing when it is that already: it would be drawn anew.
+void SetNativeCaption(const WindowState& window) {
+  const std::string& caption = window.Style.Caption;
+  std::string shown(caption.size() + 2, '\0');
+  shown.resize(static_cast<std::size_t>(::GetWindowTextA(window.Handle, shown.data(), static_cast<int>(shown.size()))));
+  if (shown != caption) ::SetWindowTextA(window.Handle, caption.c_str());
+}
+
 void MoveTo(const WindowState& window, int left, int top) {
   const RECT place = PlaceOf(window);
   if (place.left == left && place.top == top) return;
@@ -75,6 +83,8 @@ Window::~Window() {
 }
 
 void Window::Show() {
+  for (const ControlState* control : state_->Controls) ApplyState(*control);
+  SetNativeCaption(*state_);
   ::ShowWindow(state_->Handle, SW_SHOWNORMAL);
   ::UpdateWindow(state_->Handle);
 }
@@ -92,7 +102,7 @@ std::string Window::Caption() const { return state_->Style.Caption; }
 void Window::SetCaption(const std::string& caption) {
   if (state_->Handle == nullptr) return;
   state_->Style.Caption = caption;
-  ::SetWindowTextA(state_->Handle, caption.c_str());
+  if (::IsWindowVisible(state_->Handle)) SetNativeCaption(*state_);
 }
 
 int Window::Left() const { return ToTwips(PlaceOf(*state_).left, state_->Dpi); }
