@@ -2,26 +2,18 @@
 #include <memory>
 
 #include "autoconfig/FormCfg.h"
-#include "platform/files.h"
-#include "platform/text.h"
 #include "support/mod_Configuracao.h"
-#include "support/mod_Globais.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
-
-using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
-using namespace std::string_literals;
-using platform::Answer;
-using Textos = std::vector<std::string>;
 
 const std::string Chave = ChaveConfiguracao, ParaDos = "C:\\Tolvaris\\ZSNES\\zsnes.exe";
 const std::string Emulador = "C:\\Tolvaris\\ZSNES\\zsnesw.exe", Configuracao = "C:\\Tolvaris\\ZSNES\\zsnesw.cfg";
 const Textos Nada(5, "-");
 const Textos Padroes = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
 
-struct Janela : testing::Test {
-  Janela() { Reset(), PutFile(Emulador, "MZ"); }
+struct Janela : Maquina {
+  Janela() { PutFile(Emulador, "MZ"); }
 
   void Abrir() {
     form = std::make_unique<FormCfg>();
@@ -36,14 +28,6 @@ struct Janela : testing::Test {
   static Textos Gravados() {
     Textos textos;
     for (const NomeDeAjuste& cada : NomesDosAjustes) textos.push_back(StoredText(Chave, cada.Nome).value_or("-"));
-    return textos;
-  }
-
-  // The messages shown since the last call, as "title: text".
-  static Textos Mensagens() {
-    Textos textos;
-    for (const ShownMessage& cada : ShownMessages()) textos.push_back(cada.Title + ": " + cada.Text);
-    ForgetMessages();
     return textos;
   }
 

@@ -1,17 +1,9 @@
-#include <gtest/gtest.h>
-
 #include "autoconfig/procura.h"
-#include "platform/simulated/simulated.h"
-#include "support/mod_Globais.h"
+#include "tests/maquina.h"
 
 namespace {
 
-using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
-using Textos = std::vector<std::string>;
-
-struct Procurando : testing::Test {
-  void SetUp() override { Reset(), DirPrograma = "C:\\Tolvaris\\"; }
-
+struct Procurando : Maquina {
   Textos Tudo(std::vector<Lugar> lugares) {
     Procura busca(std::move(lugares));
     Textos achados;

@@ -1,16 +1,11 @@
 #include "catalog/cls_DAT.h"
-#include "platform/text.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
 
-using namespace platform::simulated;
-
 const std::string Arquivo = "C:\\Tolvaris\\tolvaris.dat";
 
-struct CatalogoDeJogos : testing::Test {
-  void SetUp() override { Reset(), DirPrograma = "C:\\Tolvaris\\"; }
-
+struct CatalogoDeJogos : Maquina {
   // The name of a DOS name, or "-" when there is none.
   std::string Nome(const std::string& dosName) const {
     Booleano encontrado = 7;

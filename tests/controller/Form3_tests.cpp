@@ -1,28 +1,15 @@
-#include <gtest/gtest.h>
-
 #include "controller/Form3.h"
-#include "platform/simulated/simulated.h"
-#include "platform/text.h"
-#include "support/mod_Globais.h"
+#include "tests/maquina.h"
 
 namespace {
 
-using namespace platform;
-using namespace platform::simulated;
-
-std::string Titulos(const Form3& janela) {
-  std::string titulos = janela.Caption() + "|" + janela.Command1.Caption();
-  for (const Label& label : janela.Label1) titulos += "|" + label.Caption();
-  return titulos;
-}
-
 // Opens a window: what it shows of both players, and that only its first tick reminds.
 void Usar(const std::string& primeiro, const std::string& segundo, void (*fechar)(Form3&)) {
-  QueueModal([&](Window& aberta) {
+  QueueModal([&](platform::Window& aberta) {
     auto& janela = static_cast<Form3&>(aberta);
-    EXPECT_EQ(Titulos(janela), primeiro);
+    EXPECT_EQ(TextosDe(janela), primeiro);
     Choose(janela.Combo1, 1);
-    EXPECT_EQ(Titulos(janela), segundo);
+    EXPECT_EQ(TextosDe(janela), segundo);
     Choose(janela.Combo1, 2);
     EXPECT_EQ(janela.Combo1.Selected(), 1) << "there is no third player";
     for (int vez = 0; vez < 2; ++vez) Tick(janela.Timer1);
@@ -33,17 +20,16 @@ void Usar(const std::string& primeiro, const std::string& segundo, void (*fechar
 }
 
 TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
-  Reset();
-  ArquivoIdioma.clear();
+  Maquina::Reiniciar();
   const std::string teclas2 = "Home|Page Down|Delete|End|Shift d.|ENTER|U|J|I|K|O|L";
   const std::string teclas1 = "Seta direita|Seta esquerda|Seta baixo|Shift e.|CTRL e.|A|Z|S|X|D|C";
-  Usar("Controle|&Fechar|Seta cima|" + teclas1, "Controle|&Fechar|" + teclas2,
+  Usar("Controle||&Fechar|Seta cima|" + teclas1, "Controle||&Fechar|" + teclas2,
        [](Form3& aberta) { Click(aberta.Command1); });
   ArquivoIdioma = "C:\\Tolvaris\\language.ini";
   PutFile(ArquivoIdioma,
           "[TOLVARIS20]\r\nControle=Pad\r\n&Fechar=&Close\r\nSeta cima=Up\r\nInformação=Note\r\n"
           "Guarde os comandos do controle. Se necessário anote-os.=Learn them.\r\n"_ansi);
-  Usar("Pad|&Close|Up|" + teclas1, "Pad|&Close|" + teclas2, [](Form3&) { Form3::Descarregar(); });
+  Usar("Pad||&Close|Up|" + teclas1, "Pad||&Close|" + teclas2, [](Form3&) { Form3::Descarregar(); });
   const std::string lembrete = "Guarde os comandos do controle. Se necessário anote-os."_ansi;
   const std::vector<ShownMessage> lembretes = {{lembrete, "Informação"_ansi, Buttons::Ok, Icon::Information},
                                                {"Learn them.", "Note", Buttons::Ok, Icon::Information}};

@@ -1,18 +1,16 @@
 // What the commands have in common when something is missing or fails, and the simplest of them: delete.
 #include <set>
 
-#include "tests/falhas.h"
 #include "tests/mainwindow/menu.h"
 
-namespace menu {
 namespace {
 
-class Commands : public Menu {};
+struct Commands : Menu {};
 
 TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
-  const Texts unknown = {"Erro: Erro interno: jogo não encontrado no sistema."_ansi};
-  const Texts gone = {"Erro: O jogo não foi encontrado."_ansi};
-  const std::tuple<const char*, std::function<void()>, Texts, Texts> cases[] = {
+  const Textos unknown = {"Erro: Erro interno: jogo não encontrado no sistema."_ansi};
+  const Textos gone = {"Erro: O jogo não foi encontrado."_ansi};
+  const std::tuple<const char*, std::function<void()>, Textos, Textos> cases[] = {
       // what is missing, what play says, and what export and delete say
       {"a selection", [this] { form->List1.Select(-1); }, {}, unknown},
       {"the game's row", [this] { form->Jogos.clear(); }, unknown, unknown},
@@ -26,12 +24,12 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
     spoil();
     const Files before = Standing();
     Click(form->Command1);
-    EXPECT_EQ(Messages(), playSays);
+    EXPECT_EQ(Mensagens(), playSays);
     EXPECT_EQ(Focused() == &form->List1, playSays.empty());
     EXPECT_EQ(States(), GameSelected);
     for (platform::Button* command : {&form->Command5, &form->Command6}) {
       Click(*command);
-      EXPECT_TRUE(othersSay.empty() || Messages() == othersSay);
+      EXPECT_TRUE(othersSay.empty() || Mensagens() == othersSay);
     }
     EXPECT_TRUE(Standing() == before && StartedProcesses().empty());
     EXPECT_EQ(StoredText(Key, "LRom"), std::nullopt);
@@ -77,7 +75,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
     };
     const auto check = [&] {
       EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
-      const Texts shown = Messages();
+      const Textos shown = Mensagens();
       EXPECT_LE(shown.size(), 1U);
       EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
       EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok: ") || Content(result) != before[result]);
@@ -123,4 +121,3 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
 }
 
 }  // namespace
-}  // namespace menu

@@ -1,9 +1,6 @@
 #include "tests/mainwindow/menu.h"
 
-namespace menu {
 namespace {
-
-using namespace std::string_literals;
 
 const std::string Added = "Ok: Jogo adicionado com sucesso.", Saved = "Ok: Arquivo salvo.";
 const std::string ReadError = "Erro: Erro ao ler arquivo.", WriteError = "Erro: Erro ao gravar arquivo.";
@@ -32,7 +29,7 @@ void AlterOnceWritten(const std::string& path) {
   QueueEvent([path] { AlterOnceWritten(path); });
 }
 
-class Import : public Menu {};
+struct Import : Menu {};
 
 TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   const Before altered = [] { AlterOnceWritten(Roms + "NOVO.zip"); };
@@ -43,7 +40,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   const Files unchecked = {{Roms + "LONGO.zip", WithoutChecksum}, {Imgs + "Longo.gif", "figura"}};
   const struct {
     std::string Path, Content;
-    Texts Shown;
+    Textos Shown;
     std::string Selected = {};
     Files New = {};  // what stands there afterwards, beside what stood there
     Before Happens = Nothing;
@@ -81,7 +78,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
     for (const auto& [path, content] : each.New) expected[path] = content;
     each.Happens();
     ChooseFile(form->Command4, each.Path);
-    EXPECT_EQ(Messages(), each.Shown);
+    EXPECT_EQ(Mensagens(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
     EXPECT_EQ(Selected(), each.Selected);
     EXPECT_EQ(States(), each.Selected.empty() ? NothingSelected : GameSelected);
@@ -90,7 +87,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   }
 }
 
-class Export : public Menu {};
+struct Export : Menu {};
 
 // A package is offered only for a game of the catalogue that has a picture, but it can be written of each.
 TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
@@ -101,7 +98,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
   const struct {
     std::string Name, Offered;  // the extension and the types
     std::string Target;
-    Texts Shown;
+    Textos Shown;
     std::optional<std::string> Left;  // content of the target afterwards
     Before Happens = Nothing;
   } cases[] = {
@@ -130,7 +127,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     Files expected = Standing();
     if (each.Left) expected[each.Target] = each.Left;
     ChooseFile(form->Command5, each.Target);
-    EXPECT_EQ(Messages(), each.Shown);
+    EXPECT_EQ(Mensagens(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
     EXPECT_EQ(States(), NothingSelected);  // the game commands wait for the next click
     const auto& asked = ShownFileDialogs().back();
@@ -140,4 +137,3 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
 }
 
 }  // namespace
-}  // namespace menu

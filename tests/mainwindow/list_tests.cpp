@@ -1,21 +1,18 @@
 #include "tests/contract/small_pictures.h"
 #include "tests/mainwindow/menu.h"
 
-namespace menu {
 namespace {
 
 using contract::SmallBmp, contract::SmallGif, contract::SmallJpeg;
 
-class List : public Menu {};
+struct List : Menu {};
 
 TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
   PutFile(Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||ACAO=Ação||Z.B=zebra||OUTRO=Super Jogo|"_ansi);
   for (const char* rom : {"acao.ZIP", "z.b.zip", "outro.smc", "leiame.txt"}) PutFile(Roms + rom, Rom);
   PutFile(Roms + "oculto.smc", Rom, 0x22);
   ASSERT_TRUE(Start());
-  Texts names;
-  for (int i = 0; i < form->List1.Count(); ++i) names.push_back(form->List1.Text(i));
-  EXPECT_EQ(names, (Texts{"Ação"_ansi, "Nome comprido", "SEMFIG", "Super Jogo", "Super Jogo", "zebra"}));
+  EXPECT_EQ(Entradas(form->List1), "Ação|Nome comprido|SEMFIG|Super Jogo|Super Jogo|zebra|"_ansi);
 
   ASSERT_EQ(form->Jogos.size(), 6U);
   const Jogo &first = form->Jogos[0], &unknown = form->Jogos[1];
@@ -109,4 +106,3 @@ TEST_F(List, PreviewTakesTheFirstPicturePresent) {
 }
 
 }  // namespace
-}  // namespace menu

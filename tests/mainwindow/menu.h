@@ -1,25 +1,16 @@
 // A configured installation with three games on the machine in memory, and the main window on it.
 #pragma once
 
-#include <gtest/gtest.h>
-
 #include <map>
 #include <memory>
 #include <optional>
 #include <string>
-#include <vector>
 
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
 #include "package/pacote.h"
-#include "platform/simulated/simulated.h"
-#include "platform/text.h"
+#include "tests/maquina.h"
 
-namespace menu {
-
-using namespace platform::simulated;  // NOLINT(google-build-using-namespace)
-using platform::Answer, platform::Buttons, platform::Icon;
-using Texts = std::vector<std::string>;
 using Files = std::map<std::string, std::optional<std::string>>;  // contents by full path
 
 inline const std::string Key = "Software\\Roms\\Tolvaris";
@@ -34,8 +25,7 @@ inline std::string Package(const std::string& name, const std::string& dosName, 
                       static_cast<std::int64_t>(rom.size()), picture, rom);
 }
 
-class Menu : public testing::Test {
- protected:
+struct Menu : Maquina {
   Menu() { SetUpMachine(); }
   ~Menu() override { End(); }
 
@@ -46,7 +36,7 @@ class Menu : public testing::Test {
 
   void SetUpMachine() {
     End();
-    Reset();
+    Reiniciar();
     for (const char* shown : {"AvisoControle", "AvisoALTF4"}) PutText(Key, shown, "1");
     PutText(Key, "EmuExe", Emulator);
     PutText(Key, "EmuCFG", EmulatorConfig);
@@ -101,17 +91,7 @@ class Menu : public testing::Test {
     return letters;
   }
 
-  // The messages shown since the last call, as "title: text".
-  static Texts Messages() {
-    Texts texts;
-    for (const ShownMessage& each : ShownMessages()) texts.push_back(each.Title + ": " + each.Text);
-    ForgetMessages();
-    return texts;
-  }
-
   std::unique_ptr<Form1> form;
 };
 
 inline constexpr char NothingSelected[] = "234kli", GameSelected[] = "123456kli";
-
-}  // namespace menu

@@ -1,15 +1,13 @@
 // The commands that lead to other programs and windows: play, the downloader and the save manager.
-#include "support/mod_Globais.h"
 #include "tests/mainwindow/menu.h"
 
-namespace menu {
 namespace {
 
 std::string Configuration(const std::string& saves) {
   return "x\r\nSaveDirectory = " + saves + "\r\nGameDirectory = C:\\Tolvaris\\Roms\r\ny";
 }
 
-class Play : public Menu {};
+struct Play : Menu {};
 
 TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   PutText(Key, "AvisoALTF4", "");
@@ -28,7 +26,7 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   for (const auto& [name, value] : settings) EXPECT_EQ(StoredText(Key, name), value) << name;
   const std::string notice =
       "Informação: Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'"_ansi;
-  EXPECT_EQ(Messages(), Texts{notice});
+  EXPECT_EQ(Mensagens(), Textos{notice});
   EXPECT_EQ(States(), GameSelected);
 
   const auto writes = WriteCount(EmulatorConfig);
@@ -45,7 +43,7 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
     EXPECT_EQ(Content(EmulatorConfig), after);
   }
   EXPECT_EQ(StartedProcesses().size(), 5U);
-  EXPECT_EQ(Messages(), Texts{});
+  EXPECT_EQ(Mensagens(), Textos{});
   EXPECT_FALSE(form->Form_Load()) << "loaded again once a game was started, the window closes";
   EXPECT_TRUE(form->IsClosed());
 }
@@ -80,8 +78,7 @@ TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
 
 const std::string Downloader = Home + "tolvarisdownload.exe";
 
-class HandOver : public Menu {
- protected:
+struct HandOver : Menu {
   HandOver() { PutText(Key, "LRom", "Super Jogo"); }
 };
 
@@ -113,7 +110,7 @@ TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
 TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
   ASSERT_TRUE(Start());
   Click(form->Command3);
-  EXPECT_EQ(Messages(), Texts{"Erro: O programa de download não foi encontrado."_ansi});
+  EXPECT_EQ(Mensagens(), Textos{"Erro: O programa de download não foi encontrado."_ansi});
   EXPECT_EQ(States(), GameSelected);
 
   PutFile(Downloader, "no program");
@@ -126,4 +123,3 @@ TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBac
 }
 
 }  // namespace
-}  // namespace menu

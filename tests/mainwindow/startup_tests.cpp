@@ -1,12 +1,9 @@
 #include "mainwindow/ajustes.h"
-#include "platform/files.h"
-#include "support/mod_Globais.h"
 #include "tests/mainwindow/menu.h"
 
-namespace menu {
 namespace {
 
-class Startup : public Menu {};
+struct Startup : Menu {};
 
 TEST_F(Startup, SavedPositionKeepsPartOfTheWindowOnTheScreen) {
   constexpr std::optional<int> none;
@@ -36,8 +33,8 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   EXPECT_EQ(form->Left(), 1500);
   EXPECT_EQ(form->Top(), 3000);
   EXPECT_EQ(form->Check1.Value(), 1);
-  EXPECT_EQ((Texts{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
-            (Texts{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
+  EXPECT_EQ((Textos{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
+            (Textos{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
   EXPECT_TRUE(DirectoryStands(DirRoms) && DirectoryStands(DirImgs));
 }
 
@@ -90,12 +87,11 @@ TEST_F(Startup, TranslatesTheWindowAndItsMessages) {
           "[TOLVARIS20]\r\nJogar=Play\r\nUsar disquete para salvar o jogo=Keep saves on a floppy\r\n"
           "Deletar jogo=Delete game\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nConfirmar deleção=Confirm\r\n"_ansi);
   StartAndPick("Super Jogo");
-  EXPECT_EQ(
-      (Texts{form->Command1.Caption(), form->Check1.ToolTip(), form->Command5.ToolTip(), form->Command6.ToolTip()}),
-      (Texts{"Play", "Keep saves on a floppy", "Exportar jogo para...", "Delete game"}));
+  EXPECT_EQ(TextosDe(*form),
+            "Tolvaris||Play|Keep saves on a floppy|Ler/Gravar salvamento de jogos do disquete|Baixar jogos da internet|"
+            "Importar jogo de...|Exportar jogo para...|Delete game|");
   Click(form->Command6);
-  EXPECT_EQ(Messages(), Texts{"Confirm: Delete ' Super Jogo ' now?"});
+  EXPECT_EQ(Mensagens(), Textos{"Confirm: Delete ' Super Jogo ' now?"});
 }
 
 }  // namespace
-}  // namespace menu

@@ -5,11 +5,9 @@
 
 #include "package/cls_CRC.h"
 #include "package/crc32.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
-
-using platform::simulated::PutFile;
 
 constexpr std::size_t Pedaco = 1'048'576;
 const std::string Caminho = "C:\\Roms\\JOGO.ZIP";
@@ -23,7 +21,7 @@ TEST(ClsCRC, AddsTheValuesAtTheEndOfEveryChunk) {
       {"", "none"},
       {std::string(2 * Pedaco, 'x'), "none"},
   };
-  platform::simulated::Reset();
+  Reset();
   cls_CRC soma;  // the same for all: nothing is left from one file to the next
   for (const auto& [conteudo, texto] : casos) {
     PutFile(Caminho, conteudo);
@@ -40,7 +38,7 @@ TEST(ClsCRC, AnyReadThatFailsLeavesNoValue) {
   const auto somar = [&] {
     platform::File arquivo(Caminho, platform::Access::Read);
     temValor = cls_CRC().CRC(arquivo).has_value();
-    falhou = platform::simulated::CallFailed();
+    falhou = CallFailed();
   };
   const auto preparar = [] { PutFile(Caminho, std::string(2 * Pedaco + 1, 'x')); };
   EXPECT_GT(ComCadaFalha(preparar, somar, [&] { EXPECT_NE(temValor, falhou); }), 3);  // each of three reads among them

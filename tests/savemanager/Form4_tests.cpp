@@ -1,16 +1,13 @@
 // The save-file manager's window: its two panes, picking in them, copying to the other side and deleting.
 #include "catalog/cls_DAT.h"
-#include "platform/text.h"
 #include "resources/ids.h"
 #include "savemanager/Form4.h"
-#include "support/mod_Globais.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
 
 using namespace platform;
-using namespace platform::simulated;
-using Mensagens = std::vector<ShownMessage>;
+using Mostradas = std::vector<ShownMessage>;
 
 const std::string NosDois = "Corrida 2 [State 0]", Velho = "velho no disquete", Novo = "novo no computador";
 const std::string SemNome = "SEMNOME [State 2]", Fonte = "C:\\Saves\\SEMNOME.zs2", Alvo = "A:\\SEMNOME.zs2";
@@ -29,15 +26,13 @@ ShownMessage JaExiste(const std::string& lado) {
 }
 
 // Saves: one on the floppy, one on the computer, and one on both.
-struct Salvamentos : testing::Test {
-  void SetUp() override { Preparar(); }
+struct Salvamentos : Maquina {
+  Salvamentos() { Preparar(); }
 
   static void Preparar() {
-    Reset();
+    Reiniciar();
     AddDisk('A', 1457664);
-    DirPrograma = "C:\\Tolvaris\\";
     DirSaves = "C:\\Saves\\";
-    ArquivoIdioma.clear();
     PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||DOIS=Corrida 2|");
     PutFile("A:\\UM.srm", "um no disquete");
     PutFile("A:\\DOIS.zst", Velho);
@@ -53,12 +48,6 @@ struct Salvamentos : testing::Test {
     QueueModal([&](Window& janela) { ++vezes, usuario(static_cast<Form4&>(janela)); });
     Form4::Mostrar();
     EXPECT_EQ(vezes, 1);
-  }
-
-  static std::string Textos(const ListBox& lista) {
-    std::string textos;
-    for (int i = 0; i < lista.Count(); ++i) textos += lista.Text(i) + "|";
-    return textos;
   }
 
   static void Escolher(ListBox& lista, const std::string& texto) { Choose(lista, lista.FindExact(texto)); }
@@ -85,8 +74,8 @@ TEST_F(Salvamentos, AreListedUnderTheNamesOfTheirGamesAndThePickedOneDecides) {
       {&Form4::List1, 1, "1 1" + doDisquete + "UM.srm"},
   };
   Abrir([&](Form4& janela) {
-    EXPECT_EQ(Textos(janela.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
-    EXPECT_EQ(Textos(janela.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
+    EXPECT_EQ(Entradas(janela.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
+    EXPECT_EQ(Entradas(janela.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
     for (const auto& [lista, indice, depois] : passos) {
       Choose(janela.*lista, indice);
       EXPECT_EQ(Escolha(janela), depois);
@@ -100,7 +89,7 @@ TEST_F(Salvamentos, OfADirectoryThatCannotBeReadLeaveThePaneEmptyAndEnabled) {
   RemoveDisk('A');
   DirSaves.clear();
   Abrir([](Form4& janela) {
-    EXPECT_EQ(Textos(janela.List1) + Textos(janela.List2), "");
+    EXPECT_EQ(Entradas(janela.List1) + Entradas(janela.List2), "");
     EXPECT_TRUE(janela.List1.Enabled() && janela.List2.Enabled());
     janela.List2_Click();
     janela.Command1_Click();
@@ -125,8 +114,8 @@ TEST_F(Salvamentos, AreCopiedWhateverIsPickedOrClosedMeanwhile) {
       EXPECT_TRUE(Pending() == 0 && janela.IsClosed() == fechar);
       if (fechar) return;
       EXPECT_TRUE(NadaEscolhido(janela));
-      EXPECT_EQ(Textos(janela.List1), "Corrida 2 [State 0]|Jogo Um|") << "the pane of the source is not filled again";
-      EXPECT_EQ(Textos(janela.List2), "Corrida 2 [State 0]|Jogo Um|SEMNOME [State 2]|");
+      EXPECT_EQ(Entradas(janela.List1), "Corrida 2 [State 0]|Jogo Um|") << "the pane of the source is not filled again";
+      EXPECT_EQ(Entradas(janela.List2), "Corrida 2 [State 0]|Jogo Um|SEMNOME [State 2]|");
     });
     EXPECT_EQ(Content("C:\\Saves\\UM.srm"), "um no disquete");
     EXPECT_TRUE(Content("C:\\Saves\\DOIS.zst") == Novo && ShownMessages().empty());
@@ -155,7 +144,7 @@ TEST_F(Salvamentos, AreReplacedAndDeletedOnlyAfterYes) {
     EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), sim && !disquete ? resto : Novo);
     const std::string lado = disquete ? "Disquete (A:)" : "Computador";
     const std::string pergunta = "Deletar o salvamento do jogo '" + NosDois + "' que está no "_ansi + lado + " ?";
-    EXPECT_EQ(ShownMessages(), Mensagens{apagar ? Deletar(pergunta) : JaExiste(lado)});
+    EXPECT_EQ(ShownMessages(), Mostradas{apagar ? Deletar(pergunta) : JaExiste(lado)});
   }
 }
 
@@ -164,7 +153,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
   const Fazer nada = [] {}, tirar = [] { RemoveDisk('A'); };
   const ShownMessage existe = JaExiste("Disquete (A:)");
   // What happens before the copy button is pressed, and during the copy; what is said; what the floppy holds then.
-  const std::tuple<const char*, Fazer, Fazer, Mensagens, std::optional<std::string>> casos[] = {
+  const std::tuple<const char*, Fazer, Fazer, Mostradas, std::optional<std::string>> casos[] = {
       {"just room", [] { SetFreeSpace('A', 512); }, nada, {}, "sem nome"},
       {"no room", [] { SetFreeSpace('A', 0); }, nada, {DiscoCheio}, {}},
       {"no disk", tirar, nada, {DiscoCheio}, {}},
@@ -178,7 +167,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
     SCOPED_TRACE(nome);
     Preparar();
     QueueAnswer(Answer::Yes);
-    const bool tentado = ditas != Mensagens{DiscoCheio};
+    const bool tentado = ditas != Mostradas{DiscoCheio};
     Abrir([&, &antes = antes, &durante = durante, &noDisquete = noDisquete](Form4& janela) {
       Escolher(janela.List2, SemNome);
       antes();
@@ -227,12 +216,10 @@ TEST_F(Salvamentos, AreShownAndDeletedInTheLanguageOfTheTranslation) {
       "Deletar o salvamento do jogo '=|Delete '|\r\n' que está no Computador ?=|' here?|"_ansi);
   Abrir([](Form4& janela) {
     Escolher(janela.List2, SemNome);
-    EXPECT_EQ(janela.Caption() + janela.Frame1.Caption() + janela.Frame2.Caption() + janela.Command2.Caption() +
-                  janela.Image1.ToolTip() + janela.Image2.ToolTip() + janela.Command1.ToolTip(),
-              "Saves Floppy PC&CloseDeleteDeleteTo the floppy");
+    EXPECT_EQ(TextosDe(janela), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
     PressKey(janela.List2, 46);
   });
-  EXPECT_EQ(ShownMessages(), Mensagens{Deletar("Delete 'SEMNOME [State 2]' here?")});
+  EXPECT_EQ(ShownMessages(), Mostradas{Deletar("Delete 'SEMNOME [State 2]' here?")});
 }
 
 }  // namespace

@@ -1,17 +1,12 @@
-#include <gtest/gtest.h>
-
 #include "catalog/cls_DAT.h"
-#include "platform/simulated/simulated.h"
-#include "platform/text.h"
 #include "savemanager/nomes.h"
+#include "tests/maquina.h"
 
 namespace {
 
-struct Nomes : testing::Test {
-  void SetUp() override {
-    platform::simulated::Reset();
-    DirPrograma = "C:\\Tolvaris\\";
-    platform::simulated::PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||A=Igual||B=Igual||ACAO=Ação|"_ansi);
+struct Nomes : Maquina {
+  Nomes() {
+    PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||A=Igual||B=Igual||ACAO=Ação|"_ansi);
     Catalogo.Carregar();
   }
   cls_DAT Catalogo;

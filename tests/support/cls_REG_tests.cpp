@@ -1,18 +1,13 @@
 #include "support/cls_REG.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
-
-using namespace platform::simulated;
-using namespace std::string_literals;
 
 constexpr std::uint32_t Raiz = platform::RootCurrentUser;
 const std::string Chave = ChaveConfiguracao;
 const cls_REG Registro;
 
-struct Registros : testing::Test {
-  void SetUp() override { Reset(); }
-};
+struct Registros : Maquina {};
 
 TEST_F(Registros, AValueIsReadByItsTypeAndKeepsItWhenItIsSet) {
   const std::string um = "\x01\0\0\0"s, longo(254, 'x');

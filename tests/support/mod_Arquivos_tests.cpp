@@ -1,18 +1,13 @@
 // Reading, writing and copying files, also when something goes wrong.
 #include "platform/files.h"
 #include "support/mod_Arquivos.h"
-#include "tests/falhas.h"
+#include "tests/maquina.h"
 
 namespace {
 
-using namespace platform::simulated;
-using namespace std::string_literals;
-
 const std::string Alvo = "C:\\Jogos\\alvo.smc", AoLado = Alvo + ".novo~";
 
-struct Arquivos : testing::Test {
-  void SetUp() override { Reset(); }
-};
+struct Arquivos : Maquina {};
 
 TEST_F(Arquivos, LerArquivoGivesTheWantedBytesAndBlanksForWhatIsMissing) {
   const std::string dez = "012345678\0"s;
@@ -74,6 +69,7 @@ TEST_F(Arquivos, AreOldOrNewWhicheverCallFailsAndWhenThePowerIsCutAfterwards) {
     for (const bool noLugar : {false, true}) {
       SCOPED_TRACE(depois + (noLugar ? ", in place" : ""));
       bool gravado = false;
+      const auto operar = [&, &operacao = operacao] { gravado = operacao(); };
       const auto preparar = [&] {
         AddDisk('A', 1 << 20);
         PutFile("A:\\origem", "copiado");
@@ -88,9 +84,7 @@ TEST_F(Arquivos, AreOldOrNewWhicheverCallFailsAndWhenThePowerIsCutAfterwards) {
           EXPECT_EQ(AllFiles().size(), Content(Alvo) ? 3u : 2u);
         }
       };
-      EXPECT_GE(ComCadaFalha(
-                    preparar, [&] { gravado = operacao(); }, conferir),
-                3);
+      EXPECT_GE(ComCadaFalha(preparar, operar, conferir), 3);
       EXPECT_TRUE(gravado);  // by the last run, in which nothing failed
     }
   }

@@ -1,21 +1,12 @@
 // Translation, starting programs, and the file dialogs.
-#include <gtest/gtest.h>
-
-#include "platform/simulated/simulated.h"
-#include "platform/text.h"
 #include "support/mod_CommonDialog.h"
-#include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
 #include "support/mod_exe.h"
+#include "tests/maquina.h"
 
 namespace {
 
-using namespace platform::simulated;
-using namespace std::string_literals;
-
-struct Servicos : testing::Test {
-  void SetUp() override { Reset(), ArquivoIdioma.clear(); }
-};
+struct Servicos : Maquina {};
 
 TEST_F(Servicos, TraduzirTakesTheValueOfTheTranslationFileWithoutItsBars) {
   const std::string longo(254, 'x'), arquivo = "C:\\Tolvaris\\language.ini";
@@ -47,8 +38,7 @@ TEST_F(Servicos, AProgramStartsWithItsPriorityInItsDirectory) {
   PutDirectory("C:\\Roms");
   for (const auto& [comando, pedido, prioridade, usado, classe] : casos) {
     std::string diretorio = pedido;
-    EXPECT_TRUE(ExecutarPrograma(comando, 100, false, prioridade, diretorio)) << comando;
-    ASSERT_FALSE(StartedProcesses().empty());
+    ASSERT_TRUE(ExecutarPrograma(comando, 100, false, prioridade, diretorio)) << comando;
     const StartedProcess& processo = StartedProcesses().back();
     EXPECT_EQ(processo.CommandLine + "|" + processo.Directory + "|" + diretorio, comando + "|" + usado + "|" + usado);
     EXPECT_EQ(processo.CreationFlags, classe);
