@@ -77,6 +77,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
     Files expected = Standing();
     for (const auto& [path, content] : each.New) expected[path] = content;
     each.Happens();
+    QueueEvent([this] { EXPECT_EQ(States(), Busy); });
     ChooseFile(form->Command4, each.Path);
     EXPECT_EQ(Mensagens(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
@@ -126,6 +127,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     each.Happens();
     Files expected = Standing();
     if (each.Left) expected[each.Target] = each.Left;
+    QueueEvent([this] { EXPECT_EQ(States(), Busy); });
     ChooseFile(form->Command5, each.Target);
     EXPECT_EQ(Mensagens(), each.Shown);
     EXPECT_TRUE(Standing() == expected);

@@ -68,23 +68,6 @@ TEST_F(List, WhileItIsReadNothingCanBeStartedAndTheWindowLives) {
   EXPECT_EQ(States(), NothingSelected);
 }
 
-TEST_F(List, BusyStateDisablesAndAClickEnablesTheGameCommands) {
-  ASSERT_TRUE(Start());
-  const std::tuple<const char*, std::function<void()>, const char*> steps[] = {
-      {"a click", [this] { Choose(form->List1, 0); }, GameSelected},
-      {"Desativar()", [this] { form->Desativar(); }, "li"},
-      {"Ativar(true)", [this] { form->Ativar(true); }, NothingSelected},
-      {"Ativar()", [this] { form->Ativar(); }, GameSelected},
-      {"Desativar(true)", [this] { form->Desativar(true); }, ""},
-      {"selection cleared", [this] { form->List1.Select(-1); }, ""},
-      {"Ativar() without a selection", [this] { form->Ativar(); }, NothingSelected},
-  };
-  for (const auto& [name, step, states] : steps) {
-    step();
-    EXPECT_EQ(States(), states) << name;
-  }
-}
-
 TEST_F(List, PreviewTakesTheFirstPicturePresent) {
   ASSERT_TRUE(Start());
   const std::tuple<const char*, std::string, std::string> steps[] = {

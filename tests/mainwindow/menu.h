@@ -94,4 +94,4 @@ struct Menu : Maquina {
   std::unique_ptr<Form1> form;
 };
 
-inline constexpr char NothingSelected[] = "234kli", GameSelected[] = "123456kli";
+inline constexpr char NothingSelected[] = "234kli", GameSelected[] = "123456kli", Busy[] = "li";
