@@ -77,6 +77,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
       EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
       const Textos shown = Mensagens();
       EXPECT_LE(shown.size(), 1U);
+      EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
       EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
       EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok: ") || Content(result) != before[result]);
       for (const bool cut : {false, true}) {

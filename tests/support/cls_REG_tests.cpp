@@ -37,18 +37,6 @@ TEST_F(Registros, AValueIsReadByItsTypeAndKeepsItWhenItIsSet) {
   EXPECT_EQ(Registro.GetValue(Raiz, "Software\\Outro", "text"), Valor());
 }
 
-TEST_F(Registros, SetValueLeavesTheOldOrTheNewValueWhicheverCallFails) {
-  std::optional<std::string> texto;
-  const auto preparar = [] { PutText(Chave, "LRom", "velho"); };
-  const auto gravar = [] { EXPECT_TRUE(Registro.SetValue(Raiz, Chave, "LRom", "novo")); };
-  const auto conferir = [&] {
-    texto = StoredText(Chave, "LRom");
-    EXPECT_TRUE(texto == "velho" || texto == "novo");
-  };
-  EXPECT_GE(ComCadaFalha(preparar, gravar, conferir), 3);
-  EXPECT_EQ(texto, "novo");
-}
-
 TEST_F(Registros, WhatCannotBeReachedHoldsNothingAndStays) {
   PutText(Chave, "LRom", "Jogo");
   for (const std::string computador : {"\\\\OUTRO", ""}) {
