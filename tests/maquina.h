@@ -13,7 +13,7 @@
 
 using namespace platform::simulated;
 using namespace std::string_literals;
-using platform::Answer, platform::Buttons, platform::Icon;
+using platform::Answer;
 using Textos = std::vector<std::string>;
 
 // A test on a fresh machine, with the program's texts as they are there.
@@ -27,10 +27,17 @@ struct Maquina : testing::Test {
   }
 };
 
-// The messages shown since the last call, as "title: text".
+inline const std::string Erro = "Erro, OK, critical: ";
+
+// The messages shown since the last call, as "title, buttons, icon: text".
 inline Textos Mensagens() {
+  constexpr const char* botoes[] = {"OK", "Yes/No/Cancel", "Retry/Cancel"};
+  constexpr const char* icones[] = {"critical", "question", "exclamation", "information"};
   Textos textos;
-  for (const ShownMessage& cada : ShownMessages()) textos.push_back(cada.Title + ": " + cada.Text);
+  for (const auto& [texto, titulo, escolha, simbolo] : ShownMessages()) {
+    const std::string botao = botoes[static_cast<int>(escolha)], icone = icones[static_cast<int>(simbolo)];
+    textos.push_back(titulo + ", " + botao + ", " + icone + ": " + texto);
+  }
   ForgetMessages();
   return textos;
 }

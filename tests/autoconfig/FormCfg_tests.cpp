@@ -58,7 +58,7 @@ TEST_F(Janela, ShowsWhatItFoundInEachLanguageAndWritesIt) {
                                  "Pictures|C:\\Tolvaris\\Imgs\\");
   DenyKey(Chave);
   Gravar();
-  EXPECT_EQ(Mensagens(), Textos{"Erro: Não foi possível gravar a configuração."_ansi});
+  EXPECT_EQ(Mensagens(), Textos{Erro + "Não foi possível gravar a configuração."_ansi});
   EXPECT_FALSE(form->IsClosed());
   DenyKey(Chave, false);
   Gravar();
@@ -123,7 +123,7 @@ TEST_F(Janela, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
       {false, "C:\\Meu Tolvaris", "C:\\Meu Tolvaris\\Z\\zsnes.exe", "\\Z\\zsnes.exe", "\\Z\\zsnes.cfg"},
   };
   const std::string aviso =
-      "Informação: O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\n"
+      "Informação, OK, exclamation: O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\n"
       "Se os jogos não abrirem, mude o emulador para um diretório sem espaços.\r\n\r\n"_ansi;
   for (const auto& [curtos, programa, arquivo, gravado, configuracao] : casos) {
     Reset();
@@ -152,9 +152,9 @@ TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused)
   EXPECT_EQ(pedido.InitialDirectory, "C:\\Outro\\");
   EXPECT_EQ(pedido.Title + pedido.Filter,
             "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
-  const std::string demais = "Erro: O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
+  const std::string demais = Erro + "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
   for (const auto& [arquivo, mensagem] :
-       {std::pair("C:\\Outro\\vazio.exe"s, "Erro: O emulador ZSnes não foi encontrado."_ansi),
+       {std::pair("C:\\Outro\\vazio.exe"s, Erro + "O emulador ZSnes não foi encontrado."_ansi),
         {longo + "z.exe", demais + longo + "zsnesw.cfg"}}) {
     Outro(arquivo);
     Gravar();
@@ -174,7 +174,8 @@ const std::string Depois = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPat
 TEST_F(Janela, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
   const std::string antiga = "SaveDirectory = C:\\S\r\n";
   const Textos pergunta = {
-      "Confirmar: Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris não altera ao jogar.\r\n"
+      "Confirmar, Yes/No/Cancel, question: Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris "
+      "não altera ao jogar.\r\n"
       "Com ele a opção de usar disquete não tem efeito.\r\n\r\n"
       "Gravar agora nessa configuração os diretórios de jogos e de salvamentos do Tolvaris ?"_ansi};
   const std::tuple<std::string, Answer, std::string, bool> casos[] = {
@@ -214,7 +215,7 @@ TEST_F(Janela, EveryFaultLeavesWholeFilesAndIsSaid) {
     const std::string conteudo = Content(Configuracao).value_or("");
     EXPECT_TRUE(conteudo == Antes || conteudo == Depois) << conteudo;
     const Textos mensagens = Mensagens();
-    EXPECT_EQ(fechou, mensagens.empty() || !mensagens.back().starts_with("Erro: "));
+    EXPECT_EQ(fechou, mensagens.empty() || !mensagens.back().starts_with("Erro, "));
     EXPECT_TRUE(Gravados() == Padroes || (Gravados()[4] == "-" && !fechou)) << "configured is only what is complete";
     EXPECT_EQ(abertos, 0U);
   };

@@ -30,10 +30,9 @@ TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
           "[TOLVARIS20]\r\nControle=Pad\r\n&Fechar=&Close\r\nSeta cima=Up\r\nInformação=Note\r\n"
           "Guarde os comandos do controle. Se necessário anote-os.=Learn them.\r\n"_ansi);
   Usar("Pad||&Close|Up|" + teclas1, "Pad||&Close|" + teclas2, [](Form3&) { Form3::Descarregar(); });
-  const std::string lembrete = "Guarde os comandos do controle. Se necessário anote-os."_ansi;
-  const std::vector<ShownMessage> lembretes = {{lembrete, "Informação"_ansi, Buttons::Ok, Icon::Information},
-                                               {"Learn them.", "Note", Buttons::Ok, Icon::Information}};
-  EXPECT_EQ(ShownMessages(), lembretes) << "also: both windows were opened";
+  const Textos lembretes = {"Informação, OK, information: Guarde os comandos do controle. Se necessário anote-os."_ansi,
+                            "Note, OK, information: Learn them."};
+  EXPECT_EQ(Mensagens(), lembretes) << "also: both windows were opened";
 }
 
 }  // namespace

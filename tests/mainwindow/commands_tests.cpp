@@ -8,14 +8,14 @@ namespace {
 struct Commands : Menu {};
 
 TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
-  const Textos unknown = {"Erro: Erro interno: jogo não encontrado no sistema."_ansi};
-  const Textos gone = {"Erro: O jogo não foi encontrado."_ansi};
+  const Textos unknown = {Erro + "Erro interno: jogo não encontrado no sistema."_ansi};
+  const Textos gone = {Erro + "O jogo não foi encontrado."_ansi};
   const std::tuple<const char*, std::function<void()>, Textos, Textos> cases[] = {
       // what is missing, what play says, and what export and delete say
       {"a selection", [this] { form->List1.Select(-1); }, {}, unknown},
       {"the game's row", [this] { form->Jogos.clear(); }, unknown, unknown},
       {"the ROM", [] { RemoveFile(Roms + "SEMFIG.SMC"); }, gone, gone},
-      {"the emulator", [] { RemoveFile(Emulator); }, {"Erro: O emulador ZSnes não foi encontrado."_ansi}, {}},
+      {"the emulator", [] { RemoveFile(Emulator); }, {Erro + "O emulador ZSnes não foi encontrado."_ansi}, {}},
   };
   for (const auto& [name, spoil, playSays, othersSay] : cases) {
     SCOPED_TRACE(name);
@@ -79,7 +79,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
       EXPECT_LE(shown.size(), 1U);
       EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
       EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
-      EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok: ") || Content(result) != before[result]);
+      EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok, ") || Content(result) != before[result]);
       for (const bool cut : {false, true}) {
         if (cut) CutPower();
         for (const Files& files : {before, after, Standing()}) {
@@ -116,9 +116,7 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
     EXPECT_EQ(Selected(), neighbour) << name;
     EXPECT_EQ(States(), *neighbour ? GameSelected : NothingSelected) << name;
   }
-  const ShownMessage question{"Deletar o jogo ' Sem figura ' ?", "Confirmar deleção"_ansi, Buttons::YesNoCancel,
-                              Icon::Exclamation};
-  EXPECT_EQ(ShownMessages().front(), question);
+  EXPECT_EQ(Mensagens()[0], "Confirmar deleção, Yes/No/Cancel, exclamation: Deletar o jogo ' Sem figura ' ?"_ansi);
 }
 
 }  // namespace

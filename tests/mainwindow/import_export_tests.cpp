@@ -2,13 +2,16 @@
 
 namespace {
 
-const std::string Added = "Ok: Jogo adicionado com sucesso.", Saved = "Ok: Arquivo salvo.";
-const std::string ReadError = "Erro: Erro ao ler arquivo.", WriteError = "Erro: Erro ao gravar arquivo.";
-const std::string ExportError = "Erro: Erro ao salvar arquivo.";
-const std::string Corrupt =
-    "Erro: Houve uma diferença na medição dos códigos CRC.\r\nEssa mudança indica que o arquivo está corrompido."_ansi;
-const std::string ReplaceGame = "Confirmar: O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?"_ansi;
-const std::string ReplaceFile = "Confirmar: Arquivo já existente.\r\n\r\nSubstituir ?"_ansi;
+const std::string Added = "Ok, OK, information: Jogo adicionado com sucesso.",
+                  Saved = "Ok, OK, information: Arquivo salvo.";
+const std::string ReadError = Erro + "Erro ao ler arquivo.", WriteError = Erro + "Erro ao gravar arquivo.";
+const std::string ExportError = Erro + "Erro ao salvar arquivo.";
+const std::string Corrupt = Erro +
+                            "Houve uma diferença na medição dos códigos CRC.\r\n"
+                            "Essa mudança indica que o arquivo está corrompido."_ansi;
+const std::string ReplaceGame =
+    "Confirmar, Yes/No/Cancel, exclamation: O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?"_ansi;
+const std::string ReplaceFile = "Confirmar, Yes/No/Cancel, exclamation: Arquivo já existente.\r\n\r\nSubstituir ?"_ansi;
 const std::string WithoutChecksum(1048576, 'x');  // a length that has none
 
 // What happens before the command is given.

@@ -25,7 +25,8 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
       {"AvisoALTF4", "1"}, {"LRom", "Nome comprido"}, {"Disquete", "0"}, {"pl", "1500"}, {"pt", "1200"}};
   for (const auto& [name, value] : settings) EXPECT_EQ(StoredText(Key, name), value) << name;
   const std::string notice =
-      "Informação: Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'"_ansi;
+      "Informação, OK, information: Para fechar o jogo precione e segure a tecla 'ALT' e "
+      "simultaneamente aperte e tecla 'F4'"_ansi;
   EXPECT_EQ(Mensagens(), Textos{notice});
   EXPECT_EQ(States(), GameSelected);
 
@@ -58,9 +59,10 @@ TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
   QueueAnswer(Answer::Retry);
   QueueAnswer(Answer::Cancel);
   Click(form->Command1);
-  const ShownMessage prompt{"Não há disquete na unidade A:\\\r\n\r\nColoque um disquete e clique em 'Repetir'."_ansi,
-                            "Disquete A:", Buttons::RetryCancel, Icon::Exclamation};
-  EXPECT_EQ(ShownMessages(), (std::vector{prompt, prompt, prompt}));
+  const std::string prompt =
+      "Disquete A:, Retry/Cancel, exclamation: Não há disquete na unidade A:\\\r\n\r\n"
+      "Coloque um disquete e clique em 'Repetir'."_ansi;
+  EXPECT_EQ(Mensagens(), Textos(3, prompt));
   EXPECT_TRUE(StartedProcesses().empty());
   EXPECT_EQ(StoredText(Key, "Disquete"), std::nullopt);
   EXPECT_EQ(States(), GameSelected);
@@ -110,7 +112,7 @@ TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
 TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
   ASSERT_TRUE(Start());
   Click(form->Command3);
-  EXPECT_EQ(Mensagens(), Textos{"Erro: O programa de download não foi encontrado."_ansi});
+  EXPECT_EQ(Mensagens(), Textos{Erro + "O programa de download não foi encontrado."_ansi});
   EXPECT_EQ(States(), GameSelected);
 
   PutFile(Downloader, "no program");

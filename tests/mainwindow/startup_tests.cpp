@@ -40,13 +40,13 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
 
 TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   const std::string configurator = Home + "tolvariscfg.exe";
-  const ShownMessage missing{
+  const std::string missing =
+      Erro +
       "Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado.\r\n"
-      "Reinstale o programa."_ansi,
-      "Erro", Buttons::Ok, Icon::Critical};
-  const ShownMessage question{
-      "O Tolvaris não foi configurado.\r\nClique em 'Sim' para rodar o programa de auto-configuração."_ansi,
-      "Configuração"_ansi, Buttons::YesNoCancel, Icon::Information};
+      "Reinstale o programa."_ansi;
+  const std::string question =
+      "Configuração, Yes/No/Cancel, information: O Tolvaris não foi configurado.\r\n"
+      "Clique em 'Sim' para rodar o programa de auto-configuração."_ansi;
   PutText(Key, "EmuCFG", "");
   EXPECT_FALSE(Start());
   EXPECT_TRUE(form->IsClosed());
@@ -63,7 +63,7 @@ TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   QueueAnswer(Answer::Yes);
   EXPECT_TRUE(Start());
   EXPECT_EQ(runs, 2);
-  EXPECT_EQ(ShownMessages(), (std::vector{missing, question, question, question}));
+  EXPECT_EQ(Mensagens(), (Textos{missing, question, question, question}));
   EXPECT_EQ(StartedProcesses().back().CommandLine + "|" + StartedProcesses().back().Directory,
             configurator + "|" + Home);
 }
@@ -91,7 +91,7 @@ TEST_F(Startup, TranslatesTheWindowAndItsMessages) {
             "Tolvaris||Play|Keep saves on a floppy|Ler/Gravar salvamento de jogos do disquete|Baixar jogos da internet|"
             "Importar jogo de...|Exportar jogo para...|Delete game|");
   Click(form->Command6);
-  EXPECT_EQ(Mensagens(), Textos{"Confirm: Delete ' Super Jogo ' now?"});
+  EXPECT_EQ(Mensagens(), Textos{"Confirm, Yes/No/Cancel, exclamation: Delete ' Super Jogo ' now?"});
 }
 
 }  // namespace

@@ -7,22 +7,18 @@
 namespace {
 
 using namespace platform;
-using Mostradas = std::vector<ShownMessage>;
 
 const std::string NosDois = "Corrida 2 [State 0]", Velho = "velho no disquete", Novo = "novo no computador";
 const std::string SemNome = "SEMNOME [State 2]", Fonte = "C:\\Saves\\SEMNOME.zs2", Alvo = "A:\\SEMNOME.zs2";
 
-const ShownMessage Erro = {"Erro ao gravar arquivo.", "Erro", Buttons::Ok, Icon::Critical};
-const ShownMessage DiscoCheio = {"Não há espaço livre suficiente em disco para completar a operação."_ansi,
-                                 "Disco cheio", Buttons::Ok, Icon::Exclamation};
+const std::string ErroAoGravar = Erro + "Erro ao gravar arquivo.";
+const std::string DiscoCheio =
+    "Disco cheio, OK, exclamation: Não há espaço livre suficiente em disco para completar a operação."_ansi;
+const std::string Deletar = "Confirmar deleção, Yes/No/Cancel, question: "_ansi;
 
-ShownMessage Deletar(const std::string& pergunta) {
-  return {pergunta, "Confirmar deleção"_ansi, Buttons::YesNoCancel, Icon::Question};
-}
-
-ShownMessage JaExiste(const std::string& lado) {
-  return {"O salvamento selecionado já se encontra no "_ansi + lado + ".\r\nVocê deseja substituí-lo ?"_ansi,
-          "Salvamento já existente"_ansi, Buttons::YesNoCancel, Icon::Question};
+std::string JaExiste(const std::string& lado) {
+  return "Salvamento já existente, Yes/No/Cancel, question: O salvamento selecionado já se encontra no "_ansi + lado +
+         ".\r\nVocê deseja substituí-lo ?"_ansi;
 }
 
 // Saves: one on the floppy, one on the computer, and one on both.
@@ -135,30 +131,30 @@ TEST_F(Salvamentos, AreReplacedAndDeletedOnlyAfterYes) {
     EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), sim && !disquete ? resto : Novo);
     const std::string lado = disquete ? "Disquete (A:)" : "Computador";
     const std::string pergunta = "Deletar o salvamento do jogo '" + NosDois + "' que está no "_ansi + lado + " ?";
-    EXPECT_EQ(ShownMessages(), Mostradas{apagar ? Deletar(pergunta) : JaExiste(lado)});
+    EXPECT_EQ(Mensagens(), Textos{apagar ? Deletar + pergunta : JaExiste(lado)});
   }
 }
 
 TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
   using Fazer = std::function<void()>;
   const Fazer nada = [] {}, tirar = [] { RemoveDisk('A'); };
-  const ShownMessage existe = JaExiste("Disquete (A:)");
+  const std::string existe = JaExiste("Disquete (A:)");
   // What happens before the copy button is pressed, and during the copy; what is said; what the floppy holds then.
-  const std::tuple<const char*, Fazer, Fazer, Mostradas, std::optional<std::string>> casos[] = {
+  const std::tuple<const char*, Fazer, Fazer, Textos, std::optional<std::string>> casos[] = {
       {"just room", [] { SetFreeSpace('A', 512); }, nada, {}, "sem nome"},
       {"no room", [] { SetFreeSpace('A', 0); }, nada, {DiscoCheio}, {}},
       {"no disk", tirar, nada, {DiscoCheio}, {}},
       {"an empty save", [] { PutFile(Fonte, ""); }, nada, {}, ""},
       {"over an empty save", [] { PutFile(Alvo, ""); }, nada, {}, "sem nome"},
-      {"source gone", [] { RemoveFile(Fonte); }, nada, {Erro}, {}},
-      {"full half-way", [] { PutFile(Alvo, "velho"); }, [] { SetFreeSpace('A', 2); }, {existe, Erro}, "velho"},
-      {"disk taken out", nada, tirar, {Erro}, {}},
+      {"source gone", [] { RemoveFile(Fonte); }, nada, {ErroAoGravar}, {}},
+      {"full half-way", [] { PutFile(Alvo, "velho"); }, [] { SetFreeSpace('A', 2); }, {existe, ErroAoGravar}, "velho"},
+      {"disk taken out", nada, tirar, {ErroAoGravar}, {}},
   };
   for (const auto& [nome, antes, durante, ditas, noDisquete] : casos) {
     SCOPED_TRACE(nome);
     Preparar();
     QueueAnswer(Answer::Yes);
-    const bool tentado = ditas != Mostradas{DiscoCheio};
+    const bool tentado = ditas != Textos{DiscoCheio};
     Abrir([&, &antes = antes, &durante = durante, &noDisquete = noDisquete](Form4& janela) {
       Escolher(janela.List2, SemNome);
       antes();
@@ -168,7 +164,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
       EXPECT_EQ(janela.List1.FindExact(SemNome) >= 0, tentado && noDisquete);
       EXPECT_EQ(janela.Caption(), "Salvamentos dos jogos");
     });
-    EXPECT_EQ(ShownMessages(), ditas);
+    EXPECT_EQ(Mensagens(), ditas);
     EXPECT_EQ(Content(Alvo), noDisquete);
   }
 }
@@ -188,8 +184,8 @@ TEST_F(Salvamentos, AreOldOrNewButWholeWhateverCallOfThePlatformFails) {
     });
   };
   const auto conferir = [&] {
-    const ShownMessage ultima = ShownMessages().empty() ? ShownMessage{} : ShownMessages().back();
-    const bool avisado = ultima == Erro || ultima == DiscoCheio;
+    const Textos ditas = Mensagens();
+    const bool avisado = !ditas.empty() && (ditas.back() == ErroAoGravar || ditas.back() == DiscoCheio);
     avisos += avisado ? 1 : 0;
     EXPECT_EQ(Content("A:\\DOIS.zst"), oferecido && !avisado ? Novo : Velho);
     EXPECT_TRUE(Content("C:\\Saves\\DOIS.zst") == Novo && AllFiles().size() == 5) << "a temporary file is left";
@@ -210,7 +206,7 @@ TEST_F(Salvamentos, AreShownAndDeletedInTheLanguageOfTheTranslation) {
     EXPECT_EQ(TextosDe(janela), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
     PressKey(janela.List2, 46);
   });
-  EXPECT_EQ(ShownMessages(), Mostradas{Deletar("Delete 'SEMNOME [State 2]' here?")});
+  EXPECT_EQ(Mensagens(), Textos{Deletar + "Delete 'SEMNOME [State 2]' here?"});
 }
 
 }  // namespace
