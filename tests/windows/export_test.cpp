@@ -3,9 +3,6 @@
 
 namespace {
 
-const Message Saved = {"Ok", "Arquivo salvo.", {IDOK}};
-const Message CannotWrite = Failure("Erro ao gravar arquivo.");
-
 const std::string Tvk = "Arquivo Tolvaris (*.tvk)", Zip = "Arquivo ZIP (*.zip)", Smc = "Arquivo SMC (*.smc)";
 
 class ExportGame : public Installation {
@@ -21,24 +18,27 @@ class ExportGame : public Installation {
   const std::string package = Package("Élan", "ELAN", "-849089814", Gif(RGB(10, 200, 60)), rom);
 };
 
-TEST_F(ExportGame, OffersWhatAGameCanBeSavedAs) {
+TEST_F(ExportGame, OffersWhatAGameCanBeSavedAsAndAsksBeforeItReplacesAFile) {
   const struct {
     std::string Game;
     Texts Types;
     int Chosen;                 // the place of the type that is chosen
     std::string Typed;          // empty: the name that is offered is taken
     std::string File, Content;  // with the type's extension
+    int Answered = 0;           // to the question whether to replace it; 0: it is not asked
   } cases[] = {
       {"Zebra", {Smc}, 0, Outside + "cópia", "cópia.smc", "jogo"},
       {"abelha", {Zip}, 0, Outside + "b", "b.zip", "jogo"},  // not in the catalogue
       {"Élan", {Tvk, Zip}, 0, Outside + "d", "d.tvk", package},
       {"Élan", {Tvk, Zip}, 1, Outside + "c", "c.zip", rom},
-      {"Zebra", {Smc}, 0, Outside + "e.zip", "e.zip", "jogo"},  // the type of the file is not asked
-      {"Élan", {Tvk, Zip}, 0, "", "Élan.tvk", package},         // where the dialog was last
+      {"Zebra", {Smc}, 0, Outside + "leia.txt", "leia.txt", "texto", IDNO},  // the type of the file is not asked
+      {"Zebra", {Smc}, 0, Outside + "leia.txt", "leia.txt", "texto", IDCANCEL},
+      {"Zebra", {Smc}, 0, Outside + "leia.txt", "leia.txt", "jogo", IDYES},
+      {"Élan", {Tvk, Zip}, 0, "", "Élan.tvk", package},  // where the dialog was last
   };
   const Files before = FilesIn(Home);
   Files expected = FilesIn(Outside);
-  for (const auto& [game, types, chosen, typed, file, content] : cases) {
+  for (const auto& [game, types, chosen, typed, file, content, answered] : cases) {
     SCOPED_TRACE(file);
     Select(game);
     Click(Export);
@@ -49,33 +49,24 @@ TEST_F(ExportGame, OffersWhatAGameCanBeSavedAs) {
     for (int i = 0; i < chosen; ++i) dialog.ChooseNextType();
     if (!typed.empty()) dialog.Type(typed);
     dialog.Press(VK_RETURN);
-    EXPECT_EQ(Answer(IDOK), Saved);
+    if (answered != 0) {
+      EXPECT_EQ(Answer(answered), Question("Confirmar", "Arquivo já existente.\r\n\r\nSubstituir ?"));
+    }
+    if (answered == 0 || answered == IDYES) {
+      EXPECT_EQ(Answer(IDOK), (Message{"Ok", "Arquivo salvo.", {IDOK}}));
+    }
     ExpectQuietEnd();
     expected[file] = content;
     ExpectFiles(expected, FilesIn(Outside));
-  }
-  ExpectFiles(before, FilesIn(Home));
-  EXPECT_EQ(Pacote(Outside, "ler d.tvk figura rom"), "\xC3\x89lan\nELAN\n-849089814\n-849089814\n");
-  EXPECT_EQ(ContentOf(Outside + "figura"), Gif(RGB(10, 200, 60)));
-  EXPECT_TRUE(ContentOf(Outside + "rom") == rom);
-}
-
-TEST_F(ExportGame, AsksBeforeItReplacesAFile) {
-  PutFile(Outside + "antigo.smc", "antigo");
-  for (const int answer : {IDNO, IDCANCEL, IDYES}) {
-    Select("Zebra");
-    Choose(Export, Outside + "antigo.smc");
-    EXPECT_EQ(Answer(answer), Question("Confirmar", "Arquivo já existente.\r\n\r\nSubstituir ?"));
-    if (answer == IDYES) {
-      EXPECT_EQ(Answer(IDOK), Saved);
-    }
-    ExpectQuietEnd();
-    EXPECT_EQ(ContentOf(Outside + "antigo.smc"), answer == IDYES ? "jogo" : "antigo");
   }
   Select("Zebra");
   Click(Export);
   FileDialog(*program).Press(VK_ESCAPE);
   ExpectQuietEnd();
+  ExpectFiles(before, FilesIn(Home));
+  EXPECT_EQ(Pacote(Outside, "ler d.tvk figura rom"), "\xC3\x89lan\nELAN\n-849089814\n-849089814\n");
+  EXPECT_EQ(ContentOf(Outside + "figura"), Gif(RGB(10, 200, 60)));
+  EXPECT_TRUE(ContentOf(Outside + "rom") == rom);
 }
 
 TEST_F(ExportGame, ThatCannotBeWrittenIsToldAndLeavesWhatWasThere) {
@@ -84,7 +75,7 @@ TEST_F(ExportGame, ThatCannotBeWrittenIsToldAndLeavesWhatWasThere) {
   for (const std::string& path : {Outside + "falta\\e.zip", std::string("A:\\cheio.zip"), std::string("A:\\e.tvk")}) {
     Select("Élan");
     Choose(Export, path);
-    EXPECT_EQ(Answer(IDOK), CannotWrite) << path;
+    EXPECT_EQ(Answer(IDOK), Failure("Erro ao gravar arquivo.")) << path;
     ExpectQuietEnd();
   }
   ExpectFiles({{"leia.txt", "texto"}}, FilesIn(Outside));

@@ -5,6 +5,7 @@
 #include <fstream>
 #include <iterator>
 
+#include "tests/windows/driver/program.h"
 #include "tests/windows/driver/waiting.h"
 #include "tests/windows/driver/window.h"
 
@@ -83,11 +84,8 @@ std::string Gif(COLORREF colour) {
 
 std::string Pacote(const std::string& directory, const std::string& arguments) {
   // A program of the machine that Wine runs on. Its output takes its name when it is complete.
-  std::string command = "/bin/sh -c \"python3 '" PACOTE_PY "' " + arguments + " >saida- 2>&1; mv saida- saida\"";
-  STARTUPINFOA how{};
-  PROCESS_INFORMATION started{};
-  EXPECT_TRUE(
-      CreateProcessA(nullptr, command.data(), nullptr, nullptr, FALSE, 0, nullptr, directory.c_str(), &how, &started));
+  const Program python("/bin/sh -c \"python3 '" PACOTE_PY "' " + arguments + " >saida- 2>&1; mv saida- saida\"",
+                       directory);
   EXPECT_SOON(std::filesystem::exists(Path(directory + "saida"))) << arguments;
   const std::string output = ContentOf(directory + "saida");
   std::filesystem::remove(Path(directory + "saida"));

@@ -64,17 +64,9 @@ void Installation::Select(const std::string& game) const {
   EXPECT_SOON(window->Pictures[Export].Enabled() && window->Pictures[Delete].Enabled());
 }
 
-std::string Installation::Selected() const {
-  const int selected = SelectedEntry(window->List);
-  const Texts entries = Entries(window->List);
-  return selected >= 0 && selected < static_cast<int>(entries.size()) ? entries[static_cast<size_t>(selected)] : "";
-}
-
 void Installation::Choose(Command command, const std::string& path) const {
   Click(command);
-  const FileDialog dialog(*program);
-  dialog.Type(path);
-  dialog.Press(VK_RETURN);
+  FileDialog(*program).Enter(path);
 }
 
 void Installation::ExpectQuietEnd() const {

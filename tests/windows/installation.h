@@ -38,9 +38,6 @@ class Installation : public testing::Test {
   static void Put(const std::string& name, const std::string& content) { PutFile(Home + name, content); }
   static std::string Content(const std::string& name) { return ContentOf(Home + name); }
   static void Remove(const std::string& name) { DeleteFileA((Home + name).c_str()); }
-  static bool Exists(const std::string& name) {
-    return GetFileAttributesA((Home + name).c_str()) != INVALID_FILE_ATTRIBUTES;
-  }
   static void PutStandIn(const std::string& name);
 
   static void Set(const std::string& setting, const std::string& text);
@@ -54,8 +51,7 @@ class Installation : public testing::Test {
   // Selects a game and waits until it can be used.
   void Select(const std::string& game) const;
 
-  // The game that the list shows selected; the empty text when there is none.
-  std::string Selected() const;
+  std::string Selected() const { return SelectedEntry(window->List); }
 
   void Click(Command command) const { window->Pictures[command].Click(); }
 

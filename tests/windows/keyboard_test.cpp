@@ -11,12 +11,6 @@ class Keyboard : public Installation {
   }
 
   Message Press(WORD key) const { return AnswerWithKey(*program, key); }
-
-  void EnterPath(const std::string& path) const {
-    const FileDialog dialog(*program);
-    dialog.Type(path);
-    dialog.Press(VK_RETURN);
-  }
 };
 
 // Tab leads to the control, and the key is pressed there.
@@ -71,12 +65,12 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   EXPECT_EQ(Press(VK_RETURN).Text, "O programa de download não foi encontrado.");
   EXPECT_SOON(pictures[Download].Focused());
   Use(pictures[Import], VK_SPACE);
-  EnterPath(Outside + "novo.smc");
+  FileDialog(*program).Enter(Outside + "novo.smc");
   EXPECT_EQ(Press(VK_SPACE).Text, "Jogo adicionado com sucesso.");
   EXPECT_SOON_EQ(std::string("novo"), Selected());
   EXPECT_SOON(window->List.Focused() && pictures[Export].Enabled());
   Use(pictures[Export], VK_RETURN);
-  EnterPath(Outside + "copia.smc");
+  FileDialog(*program).Enter(Outside + "copia.smc");
   EXPECT_EQ(Press(VK_RETURN).Text, "Arquivo salvo.");
   EXPECT_EQ(ContentOf(Outside + "copia.smc"), "jogo novo");
   EXPECT_SOON(window->List.Focused());
@@ -85,7 +79,7 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   Use(pictures[Delete], VK_SPACE);
   EXPECT_EQ(Press(VK_RETURN).Title, "Confirmar deleção");
   EXPECT_SOON_EQ(Games, Entries(window->List));
-  EXPECT_FALSE(Exists("Roms\\novo.smc"));
+  EXPECT_EQ(Content("Roms\\novo.smc"), "");
 
   EXPECT_SOON(window->List.Focused());
   PressWith(VK_MENU, VK_F4);
@@ -93,13 +87,16 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
 }
 
 TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
-  const FloppyDisk disk;
-  PutFile("A:\\AGUA.srm", "bateria A");
-  PutFile("A:\\ZEBRA.srm", "bateria Z");
   Put("Saves\\ELAN.srm", "bateria E");
   Start();
   EXPECT_SOON(window->List.Focused());
   Use(window->Pictures[ManageSaves], VK_RETURN);
+  EXPECT_EQ(Press(VK_RETURN), NoDisk);
+  ASSERT_SOON(FindMessage(*program));
+  const FloppyDisk disk;
+  PutFile("A:\\AGUA.srm", "bateria A");
+  PutFile("A:\\ZEBRA.srm", "bateria Z");
+  EXPECT_EQ(Press(VK_RETURN), NoDisk);
   const SaveManager manager(*program);
   const auto& [floppyList, floppyDelete] = manager.Floppy;
   const auto& [computerList, computerDelete] = manager.Computer;
@@ -124,12 +121,9 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   EXPECT_SOON_EQ(ComputerOffered, manager.Offered());
   ExpectTabOrder({computerDelete, manager.Close, floppyList, manager.Copy, computerList});
   Use(computerDelete, VK_RETURN);
-  EXPECT_EQ(Press(VK_ESCAPE).Title, "Confirmar deleção");
-  EXPECT_SOON(computerDelete.Focused());
-  PressKey(VK_SPACE);
   EXPECT_EQ(Press(VK_RETURN).Title, "Confirmar deleção");
   EXPECT_SOON(computerList.Focused());
-  EXPECT_FALSE(Exists("Saves\\ZEBRA.srm"));
+  EXPECT_EQ(Content("Saves\\ZEBRA.srm"), "");
   EXPECT_TRUE(TabTo(floppyList));
   TypeText("Á");
   EXPECT_SOON_EQ(FloppyOffered, manager.Offered());
@@ -141,36 +135,31 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   PressWith(VK_MENU, 'F');
   EXPECT_SOON(!manager);
   EXPECT_SOON(window->Pictures[ManageSaves].Focused());
+  DeleteFileA("A:\\ZEBRA.srm");
   PressKey(VK_SPACE);
   const SaveManager again(*program);
   EXPECT_SOON(again.Floppy.List.Focused());
+  EXPECT_EQ(Entries(again.Floppy.List), Texts{}) << "of an empty disk";
   PressKey(VK_ESCAPE);
   EXPECT_SOON(!again);
 }
 
 TEST_F(Keyboard, ReadsAndClosesTheControllerHelp) {
-  for (const WORD key : {WORD{VK_RETURN}, WORD{VK_SPACE}, WORD{VK_ESCAPE}, WORD{'F'}}) {
+  for (const bool byEscape : {true, false}) {
     Set("AvisoControle", "");
     Run();
     EXPECT_EQ(Press(VK_RETURN).Title, "Informação");
     const Window help = FindVisible(*program, "Controle");
     const Window players = help.ChildAt(120, 120);
     const Window upKey = help.ChildAt(2040, 1560);
-    const Window close = help.ChildAt(6480, 4320);
     EXPECT_SOON(players.Focused());
     EXPECT_EQ(Entries(players), (Texts{"Jogador 1", "Jogador 2"}));
     PressKey(VK_DOWN);
     EXPECT_SOON_EQ(std::string("Home"), upKey.Text());
     PressKey(VK_UP);
     EXPECT_SOON_EQ(std::string("Seta cima"), upKey.Text());
-    if (key == VK_RETURN) ExpectTabOrder({close, players});
-    if (key == 'F') {
-      PressWith(VK_MENU, key);
-    } else if (key == VK_ESCAPE) {
-      PressKey(key);
-    } else {
-      Use(close, key);
-    }
+    ExpectTabOrder({help.ChildAt(6480, 4320), players});
+    byEscape ? PressKey(VK_ESCAPE) : PressWith(VK_MENU, 'F');
     EXPECT_SOON(MainWindow(*program).List.Focused());
   }
 }

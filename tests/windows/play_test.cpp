@@ -5,37 +5,47 @@
 
 namespace {
 
-class Play : public Installation {};
+class Play : public Installation {
+ protected:
+  Play() { Set("LRom", "Zebra"); }
+
+  void PlayZebra() const {
+    window->Play.Click();
+    ExpectPlayed("ZEBRA.SMC");
+  }
+};
 
 TEST_F(Play, ByEnterDoubleClickAndButton) {
   const std::string longName = Home + "Roms\\Corrida das Nuvens.smc";
   ASSERT_NE(ShortPath(longName), longName);
   Start();
-  Select("Corrida das Nuvens");
-  window->Play.Click();
+  ClickEntry(window->List, "Corrida das Nuvens", 2);
   ExpectPlayed("Corrida das Nuvens.smc");
-  ClickEntry(window->List, "Zebra", 2);
-  ExpectPlayed("ZEBRA.SMC");
   ClickEntry(window->List, "Água Viva");
   PressKey(VK_RETURN);
   ExpectPlayed("agua.smc");
+  Select("Zebra");
+  PlayZebra();
 }
 
-TEST_F(Play, RemembersTheGameAndTheWindow) {
+TEST_F(Play, TellsHowToLeaveAGameAndRemembersThatAndTheGameAndTheWindow) {
+  Set("AvisoALTF4", "");
   Set("pl", "1500");
   Set("pt", "2250");
-  auto expected = Settings();
+  std::map<std::string, std::string> expected = {
+      {"AvisoALTF4", "1"}, {"LRom", "Élan"}, {"Disquete", "0"}, {"pl", "450"}, {"pt", "600"}};
+  expected.merge(Settings());  // the others stay
   Start();
   EXPECT_EQ(window->Place().left, 100);
   EXPECT_EQ(window->Place().top, 150);
   SetWindowPos(window->Handle(), nullptr, 30, 40, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
   Select("Élan");
   window->Play.Click();
+  EXPECT_EQ(Answer(IDOK),
+            (Message{"Informação",
+                     "Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'",
+                     {IDOK}}));
   ExpectPlayed("elan.ZIP");
-  expected.insert_or_assign("LRom", "Élan");
-  expected.insert_or_assign("Disquete", "0");
-  expected.insert_or_assign("pl", "450");
-  expected.insert_or_assign("pt", "600");
   EXPECT_EQ(Settings(), expected);
 
   Start();
@@ -44,24 +54,16 @@ TEST_F(Play, RemembersTheGameAndTheWindow) {
   EXPECT_EQ(window->Place().top, 40);
 }
 
-TEST_F(Play, TellsOnceHowToLeaveAGame) {
-  Set("AvisoALTF4", "");
-  Set("LRom", "Zebra");
-  Start();
-  window->Play.Click();
-  EXPECT_EQ(Answer(IDOK),
-            (Message{"Informação",
-                     "Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'",
-                     {IDOK}}));
-  ExpectPlayed("ZEBRA.SMC");
-  EXPECT_EQ(Settings()["AvisoALTF4"], "1");
-  window->Play.Click();
-  ExpectPlayed("ZEBRA.SMC");
+// The emulator's configuration file: a comment that mentions the keys, and a last line without an end.
+std::string EmulatorConfiguration(const std::string& saves, const std::string& games) {
+  return "; SaveDirectory and GameDirectory: \t\x1A\xE9\r\n\r\nOption = 1\r\n" + saves + "\r\n\r\n" + games +
+         "\r\nVolume=100";
 }
 
-TEST_F(Play, WithTheSavesOnAFloppyDisk) {
-  const std::string games = "GameDirectory = C:\\Ensaio\\Roms\r\n";
-  Set("LRom", "Zebra");
+TEST_F(Play, WithTheSavesOnAFloppyDiskRewritesTheEmulatorsConfigurationWhenItDiffers) {
+  const std::string games = "GameDirectory = C:\\Ensaio\\Roms";
+  const std::filesystem::path file = Home + "Emulador\\zsnesw.cfg";
+  Put("Emulador\\zsnesw.cfg", EmulatorConfiguration("SaveDirectory = ", "gamedirectory = D:\\Antigos"));
   Start();
   window->Floppy.Click();
   ASSERT_SOON(window->FloppyChecked());
@@ -77,48 +79,20 @@ TEST_F(Play, WithTheSavesOnAFloppyDisk) {
   const FloppyDisk disk;
   EXPECT_EQ(Answer(IDRETRY), NoDisk);
   ExpectPlayed("ZEBRA.SMC");
-  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), "\r\nSaveDirectory = A:\r\n" + games);
-  window->Play.Click();
-  ExpectPlayed("ZEBRA.SMC");  // unasked: the disk is there
+  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), EmulatorConfiguration("SaveDirectory = A:", games));
+  last_write_time(file, last_write_time(file) - std::chrono::hours(1000));
+  const auto past = last_write_time(file);
+  PlayZebra();  // unasked: the disk is there
+  EXPECT_TRUE(last_write_time(file) == past);
   EXPECT_EQ(Settings()["Disquete"], "1");
 
   Start();
   EXPECT_TRUE(window->FloppyChecked());
   window->Floppy.Click();
   ASSERT_SOON(!window->FloppyChecked());
-  window->Play.Click();
-  ExpectPlayed("ZEBRA.SMC");
-  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), "\r\nSaveDirectory = C:\\Ensaio\\Saves\r\n" + games);
+  PlayZebra();
+  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), EmulatorConfiguration("SaveDirectory = C:\\Ensaio\\Saves", games));
   EXPECT_EQ(Settings()["Disquete"], "0");
-}
-
-// The emulator's configuration file, in the shape of one of its time: comments that mention the keys, and a last line
-// without an end.
-std::string EmulatorConfiguration(const std::string& saves, const std::string& games) {
-  return "; Settings of the emulator. Lines with a semicolon are comments.\r\n\r\n"
-         "; SaveDirectory: where the saved games are kept; empty for the directory of the game.\r\n"
-         "; GameDirectory: where the file window opens. (savedirectory=... is not an entry.)\r\n"
-         "; \t\x1A\xE9\r\nOption = 1\r\n" +
-         saves + "\r\n\r\n; What is played\r\n" + games + "\r\nVolume=100";
-}
-
-TEST_F(Play, RewritesTheTwoEntriesOfTheEmulatorsConfigurationOnlyWhenTheyDiffer) {
-  const std::filesystem::path file = Home + "Emulador\\zsnesw.cfg";
-  const std::string fitting =
-      EmulatorConfiguration("SaveDirectory = C:\\Ensaio\\Saves", "GameDirectory = C:\\Ensaio\\Roms");
-  Put("Emulador\\zsnesw.cfg", EmulatorConfiguration("SaveDirectory = ", "gamedirectory = D:\\Antigos"));
-  Set("LRom", "Zebra");
-  Start();
-  window->Play.Click();
-  ExpectPlayed("ZEBRA.SMC");
-  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), fitting);
-
-  last_write_time(file, last_write_time(file) - std::chrono::hours(1000));
-  const auto past = last_write_time(file);
-  window->Play.Click();
-  ExpectPlayed("ZEBRA.SMC");
-  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), fitting);
-  EXPECT_TRUE(last_write_time(file) == past);
 }
 
 }  // namespace

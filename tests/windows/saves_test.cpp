@@ -69,7 +69,7 @@ class Saves : public Installation {
   std::optional<SaveManager> manager;
 };
 
-TEST_F(Saves, AreListedAndCopiedBothWays) {
+TEST_F(Saves, AreListedCopiedBothWaysAndReplacedAndDeletedOnYesOnly) {
   OpenWith({{"agua.srm", Bytes(1, 8192)}, {"AGUA.ZST", Bytes(2, 5000)}, {"MEUJOGO.zs2", "x"}, {"leia.txt", "texto"}},
            {{"zebra.srm", Bytes(3, 2048)}, {"ZEBRA.zs9", Bytes(4, 300'000)}, {"elan.zst", ""}});
   for (const char* text : {" Disquete ", " Computador ", "&Fechar"}) EXPECT_TRUE(manager->Child(text)) << text;
@@ -80,38 +80,29 @@ TEST_F(Saves, AreListedAndCopiedBothWays) {
 
   Pick(computer, "Zebra");
   Pick(floppy, "Água Viva [State 0]");
-  EXPECT_EQ(SelectedEntry(manager->Computer.List), -1);
-  manager->Copy.Click();
-  ExpectCopied(computer, "AGUA.zst", Bytes(2, 5000));
-  EXPECT_EQ(EntriesOf(computer), (Texts{"Água Viva [State 0]", "Élan [State 0]", "Zebra", "Zebra [State 9]"}));
-  Pick(computer, "Zebra [State 9]");
-  manager->Copy.Click();
-  ExpectCopied(floppy, "ZEBRA.zs9", Bytes(4, 300'000));
-  EXPECT_EQ(EntriesOf(floppy), (Texts{"Água Viva", "Água Viva [State 0]", "MEUJOGO [State 2]", "Zebra [State 9]"}));
-
-  manager->Close.Click();
-  EXPECT_SOON(window->Enabled());
-  EXPECT_SOON(!*manager);
-}
-
-TEST_F(Saves, AreReplacedAndDeletedOnYesOnly) {
-  OpenWith({{"ZEBRA.zs3", Bytes(1, 8192)}, {"AGUA.srm", Bytes(2, 9000)}},
-           {{"ZEBRA.zs3", Bytes(3, 8192)}, {"AGUA.srm", Bytes(4, 3000)}});
+  EXPECT_EQ(SelectedEntry(manager->Computer.List), "");
   const struct {
     Side *From, *To;
-    std::string Entry, File;
-  } cases[] = {{&floppy, &computer, "Zebra [State 3]", "ZEBRA.zs3"}, {&computer, &floppy, "Água Viva", "AGUA.srm"}};
-  for (const auto& [from, to, entry, file] : cases) {
+    std::string Entry, Source, Copy;
+  } cases[] = {{&floppy, &computer, "Água Viva [State 0]", "AGUA.ZST", "AGUA.zst"},
+               {&computer, &floppy, "Zebra [State 9]", "ZEBRA.zs9", "ZEBRA.zs9"}};
+  for (const auto& [from, to, entry, source, copy] : cases) {
+    const Texts before = EntriesOf(*to);
+    Pick(*from, entry);
+    manager->Copy.Click();
+    ExpectCopied(*to, copy, from->Expected[source]);
+    EXPECT_EQ(EntriesOf(*to).size(), before.size() + 1);
+
+    to->Expected[copy] = "antigo";
+    PutFile(to->Directory + copy, "antigo");
     for (const int answer : {IDNO, IDCANCEL, IDYES}) {
       ExpectBothSides();
       Pick(*from, entry);
       manager->Copy.Click();
-      EXPECT_EQ(Answer(answer),
-                (Message{"Salvamento já existente",
-                         "O salvamento selecionado já se encontra no " + to->Name + ".\r\nVocê deseja substituí-lo ?",
-                         {IDYES, IDNO, IDCANCEL}}));
+      EXPECT_EQ(Answer(answer), Question("Salvamento já existente", "O salvamento selecionado já se encontra no " +
+                                                                        to->Name + ".\r\nVocê deseja substituí-lo ?"));
     }
-    ExpectCopied(*to, file, from->Expected[file]);
+    ExpectCopied(*to, copy, from->Expected[source]);
     EXPECT_EQ(PaneOf(*to).Delete.Text(), "Excluir");
     for (const int answer : {IDNO, IDCANCEL, IDYES}) {
       ExpectBothSides();
@@ -120,11 +111,14 @@ TEST_F(Saves, AreReplacedAndDeletedOnYesOnly) {
       EXPECT_EQ(Answer(answer), Question("Confirmar deleção", "Deletar o salvamento do jogo '" + entry +
                                                                   "' que está no " + to->Name + " ?"));
     }
-    EXPECT_SOON_EQ(size_t{1}, EntriesOf(*to).size());
+    EXPECT_SOON_EQ(before, EntriesOf(*to));
     EXPECT_SOON_EQ(NothingOffered, manager->Offered());
-    to->Expected.erase(file);
+    to->Expected.erase(copy);
     ExpectBothSides();
   }
+  manager->Close.Click();
+  EXPECT_SOON(window->Enabled());
+  EXPECT_SOON(!*manager);
 }
 
 TEST_F(Saves, ThatDoNotFitOnTheFloppyAreRefused) {
@@ -147,25 +141,6 @@ TEST_F(Saves, ThatDoNotFitOnTheFloppyAreRefused) {
   manager->Copy.Click();
   EXPECT_EQ(Answer(IDOK), DiskFull);
   ExpectBothSides();
-}
-
-class SavesWithoutDisk : public Installation {};
-
-TEST_F(SavesWithoutDisk, AreAskedForUntilADiskIsThere) {
-  Start();
-  Click(ManageSaves);
-  EXPECT_EQ(Answer(IDRETRY), NoDisk);
-  EXPECT_EQ(Answer(IDCANCEL), NoDisk);
-  EXPECT_SOON(window->Enabled());
-  EXPECT_FALSE(FindVisible(*program, "Salvamentos dos jogos"));
-
-  Click(ManageSaves);
-  ASSERT_SOON(FindMessage(*program));
-  const FloppyDisk disk;
-  EXPECT_EQ(Answer(IDRETRY), NoDisk);
-  const SaveManager manager(*program);
-  EXPECT_EQ(Entries(manager.Floppy.List), Texts{});
-  EXPECT_TRUE(manager.Floppy.List.Enabled());
 }
 
 }  // namespace

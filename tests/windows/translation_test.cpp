@@ -12,22 +12,10 @@ TEST_F(Translation, OfMessagesControlsAndToolTips) {
       "Usar disquete para salvar o jogo=Keep saves on a floppy\r\n"
       "Deletar jogo=Delete game\r\n"
       "Importar jogo de...=| Import... |\r\n"
-      "Controle=Controller\r\n"
-      "&Fechar=&Close\r\n"
-      "Seta cima=Up\r\n"
-      "Informação=Note\r\n"
       "Erro=Error\r\n"
       "O jogo não foi encontrado.=The game is gone.\r\n");
-  Set("AvisoControle", "");
   Set("LRom", "Zebra");
-  Run();
-  EXPECT_EQ(Answer(IDOK).Title, "Note");
-  const Window help = FindVisible(*program, "Controller");
-  EXPECT_EQ(help.ChildAt(2040, 1560).Text(), "Up");
-  EXPECT_EQ(help.ChildAt(3330, 2460).Text(), "Seta direita");
-  help.Child("&Close").Click();
-
-  window.emplace(*program);
+  Start();
   EXPECT_EQ(window->Play.Text(), "Play");
   EXPECT_EQ(window->Floppy.Text(), "Keep saves on a floppy");
   Texts toolTips;

@@ -39,6 +39,11 @@ void FileDialog::Type(const std::string& path) const {
   EXPECT_SOON_EQ(path, name_.Text());
 }
 
+void FileDialog::Enter(const std::string& path) const {
+  Type(path);
+  Press(VK_RETURN);
+}
+
 void FileDialog::Press(WORD key) const {
   PressKey(key);
   EXPECT_SOON(!dialog_.Visible()) << "\nthe dialog stays";

@@ -13,7 +13,8 @@ class FileDialog {
   std::vector<std::string> FileTypes() const { return Entries(types_); }
 
   void ChooseNextType() const;
-  void Type(const std::string& path) const;  // over what stands in the box
+  void Type(const std::string& path) const;   // over what stands in the box
+  void Enter(const std::string& path) const;  // types it, and presses Enter
 
   // Presses Enter or Escape, and waits until the dialog is gone.
   void Press(WORD key) const;

@@ -5,11 +5,11 @@
 
 #include <string>
 
-// A running program with all that it starts: at the end of its life, or of the test's process, they are ended. It works
-// in C:\, which is no directory of its own.
+// A running program with all that it starts: at the end of its life, or of the test's process, they are ended. Usually
+// it works in C:\, which is no directory of its own.
 class Program {
  public:
-  explicit Program(std::string commandLine);
+  explicit Program(std::string commandLine, const std::string& directory = "C:\\");
   ~Program();
   Program(const Program&) = delete;
   Program& operator=(const Program&) = delete;

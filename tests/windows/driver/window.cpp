@@ -39,28 +39,27 @@ std::string AskText(HWND window, UINT lengthMessage, UINT textMessage, WPARAM nu
   return FromWide(text);
 }
 
-// The windows below one; below none, those of all programs.
-std::vector<Window> WindowsBelow(HWND parent) {
-  std::vector<Window> windows;
-  const auto add = [](HWND window, LPARAM list) {
-    reinterpret_cast<std::vector<Window>*>(list)->emplace_back(window);
-    return TRUE;
-  };
-  if (parent == nullptr) {
-    EnumWindows(add, reinterpret_cast<LPARAM>(&windows));
-  } else {
-    EnumChildWindows(parent, add, reinterpret_cast<LPARAM>(&windows));
-  }
-  return windows;
+BOOL CALLBACK AddTo(HWND window, LPARAM windows) {
+  reinterpret_cast<std::vector<Window>*>(windows)->emplace_back(window);
+  return TRUE;
 }
 
-Window FirstTopWindow(const Program& program, const std::function<bool(const Window&)>& wanted) {
-  for (const Window& window : WindowsBelow(nullptr)) {
+using Condition = std::function<bool(const Window&)>;
+
+// None is a window that is false.
+Window First(const std::vector<Window>& windows, const Condition& wanted) {
+  const auto found = std::find_if(windows.begin(), windows.end(), wanted);
+  return found == windows.end() ? Window() : *found;
+}
+
+Window FirstTopWindow(const Program& program, const Condition& wanted) {
+  std::vector<Window> windows;
+  EnumWindows(AddTo, reinterpret_cast<LPARAM>(&windows));
+  return First(windows, [&](const Window& window) {
     DWORD owner = 0;
     GetWindowThreadProcessId(window.Handle(), &owner);
-    if (owner == program.Id() && window.Visible() && wanted(window)) return window;
-  }
-  return {};
+    return owner == program.Id() && window.Visible() && wanted(window);
+  });
 }
 
 GUITHREADINFO ThreadOf(HWND window) {
@@ -139,22 +138,22 @@ RECT Window::Place() const {
   return place;
 }
 
-std::vector<Window> Window::Children() const { return WindowsBelow(handle_); }
+std::vector<Window> Window::Children() const {
+  std::vector<Window> children;
+  EnumChildWindows(handle_, AddTo, reinterpret_cast<LPARAM>(&children));
+  return children;
+}
 
 Window Window::ChildAt(int left, int top) const {
   const POINT place = OnScreen(handle_, left, top);
-  for (const Window& child : Children()) {
+  return First(Children(), [&](const Window& child) {
     const RECT area = child.Place();
-    if (area.left == place.x && area.top == place.y) return child;
-  }
-  return {};
+    return area.left == place.x && area.top == place.y;
+  });
 }
 
 Window Window::Child(const std::string& text) const {
-  for (const Window& child : Children()) {
-    if (child.Text() == text) return child;
-  }
-  return {};
+  return First(Children(), [&](const Window& child) { return child.Text() == text; });
 }
 
 std::string Window::Picture() const {
@@ -220,7 +219,10 @@ std::vector<std::string> Entries(const Window& control) {
   return entries;
 }
 
-int SelectedEntry(const Window& list) { return static_cast<int>(Ask(list.Handle(), LB_GETCURSEL)); }
+std::string SelectedEntry(const Window& list) {
+  const LRESULT selected = Ask(list.Handle(), LB_GETCURSEL);
+  return selected < 0 ? "" : AskText(list.Handle(), LB_GETTEXTLEN, LB_GETTEXT, static_cast<WPARAM>(selected));
+}
 
 void ClickEntry(const Window& list, const std::string& text, int times) {
   const std::vector<std::string> entries = Entries(list);

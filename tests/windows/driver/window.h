@@ -49,9 +49,9 @@ Window FindVisible(const Program& program, const std::string& title);
 // The visible message of the program, or none.
 Window FindMessage(const Program& program);
 
-// Entries of a list box, or of a combo box. Positions start at 0.
+// Entries of a list box, or of a combo box.
 std::vector<std::string> Entries(const Window& control);
-int SelectedEntry(const Window& list);  // -1: none
+std::string SelectedEntry(const Window& list);  // the empty text when there is none
 void ClickEntry(const Window& list, const std::string& text, int times = 1);
 
 void PressKey(WORD key);

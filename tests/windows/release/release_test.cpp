@@ -1,5 +1,6 @@
 // From what is downloaded to a game that runs, and back: the installer and the zip on a machine that never saw either.
 #include <array>
+#include <cstdlib>
 
 #include "tests/windows/files.h"
 #include "tests/windows/program_windows.h"
@@ -26,13 +27,9 @@ std::vector<std::string> NamesIn(const std::string& directory) {
   return names;
 }
 
-std::string Folder(const char* variable) {
-  std::array<char, MAX_PATH> folder{};
-  GetEnvironmentVariableA(variable, folder.data(), MAX_PATH);
-  return folder.data();
+std::string Shortcut() {
+  return std::string(std::getenv("APPDATA")) + "\\Microsoft\\Windows\\Start Menu\\Programs\\Tolvaris.lnk";
 }
-
-std::string Shortcut() { return Folder("APPDATA") + "\\Microsoft\\Windows\\Start Menu\\Programs\\Tolvaris.lnk"; }
 
 void RunToItsEnd(const std::string& commandLine) {
   const Program program(commandLine);
@@ -115,7 +112,7 @@ class Release : public testing::Test {
 };
 
 TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
-  const std::string directory = Folder("LOCALAPPDATA") + "\\Programs\\Tolvaris\\";
+  const std::string directory = std::string(std::getenv("LOCALAPPDATA")) + "\\Programs\\Tolvaris\\";
   RunToItsEnd(std::string(Downloaded) + " /S");
   const std::vector<std::string> installed = {"CHANGELOG.txt", "LEIAME.txt", "desinstalar.exe", "tolvaris.exe",
                                               "tolvariscfg.exe"};
