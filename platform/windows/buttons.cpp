@@ -17,7 +17,7 @@ void Blend(HDC context, const RECT& place, const ButtonImage& image, BYTE streng
   ::DeleteDC(source);
 }
 
-int SideOf(const ControlState& control) { return ::MulDiv(IconSide, control.Owner->Dpi, UsualDpi); }
+int SideOf(const ControlState& control) { return Scaled(IconSide, control.Owner->Dpi); }
 
 bool ShowsFocus(const NMCUSTOMDRAW& face) {
   return (face.uItemState & CDIS_FOCUS) != 0 &&

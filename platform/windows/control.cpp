@@ -75,10 +75,11 @@ DWORD GroupStyle(const WindowState& window, const char* nativeClass) {
 }
 
 // The window keeps the keyboard itself when a control loses it by being switched off, and gives it back.
-void KeepFocus(const ControlState& control, bool usable) {
+void KeepFocus(const ControlState& control) {
   const HWND window = control.Owner->Handle;
   if (control.Owner->Focus != control.Handle || ::GetActiveWindow() != window) return;
   const HWND focus = ::GetFocus();
+  const bool usable = control.Enabled && control.Visible;
   if (usable && focus == window) ::SetFocus(control.Handle);
   if (!usable && (focus == nullptr || focus == control.Handle)) ::SetFocus(window);
 }
@@ -136,7 +137,7 @@ void ApplyState(const ControlState& control) {
   if (enabled == control.Enabled && visible == control.Visible) return;
   if (enabled != control.Enabled) ::EnableWindow(control.Handle, control.Enabled);
   if (visible != control.Visible) ::ShowWindow(control.Handle, control.Visible ? SW_SHOWNA : SW_HIDE);
-  KeepFocus(control, control.Enabled && control.Visible);
+  KeepFocus(control);
   UpdateToolTip(control);
 }
 

@@ -7,12 +7,6 @@
 namespace platform {
 namespace {
 
-SIZE WorkArea() {
-  RECT area = {};
-  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &area, 0);
-  return {area.right - area.left, area.bottom - area.top};
-}
-
 bool MainWindowIsOpen() { return !AllWindows().empty() && AllWindows().front()->Handle != nullptr; }
 
 }  // namespace
@@ -83,8 +77,14 @@ void Window::ShowModal() {
 
 void Sleep(std::uint32_t milliseconds) { ::Sleep(milliseconds); }
 
-int ScreenWidth() { return ToTwips(static_cast<int>(WorkArea().cx), DpiOfScreen()); }
+int ScreenWidth() {
+  const RECT area = WorkArea();
+  return ToTwips(area.right - area.left, DpiOfScreen());
+}
 
-int ScreenHeight() { return ToTwips(static_cast<int>(WorkArea().cy), DpiOfScreen()); }
+int ScreenHeight() {
+  const RECT area = WorkArea();
+  return ToTwips(area.bottom - area.top, DpiOfScreen());
+}
 
 }  // namespace platform

@@ -4,7 +4,6 @@
 #include <string>
 
 #include "platform/windows/resource.h"
-#include "platform/windows/screen.h"
 
 namespace platform {
 namespace {
@@ -24,10 +23,9 @@ const BITMAPINFOHEADER* IconBitmap(int id, int side) {
 
 }  // namespace
 
-IconHandle LoadIconFor(int id, int side, int dpi) {
-  const int pixels = ::MulDiv(side, dpi, UsualDpi);
+IconHandle LoadIconFor(int id, int side) {
   return IconHandle(static_cast<HICON>(
-      ::LoadImageA(::GetModuleHandleA(nullptr), MAKEINTRESOURCEA(id), IMAGE_ICON, pixels, pixels, LR_DEFAULTCOLOR)));
+      ::LoadImageA(::GetModuleHandleA(nullptr), MAKEINTRESOURCEA(id), IMAGE_ICON, side, side, LR_DEFAULTCOLOR)));
 }
 
 ButtonImage LoadButtonImage(int id, int side) {
@@ -37,7 +35,7 @@ ButtonImage LoadButtonImage(int id, int side) {
   format.bmiHeader = *icon;
   format.bmiHeader.biHeight = icon->biWidth;
   void* pixels = nullptr;
-  ButtonImage image{BitmapHandle(::CreateDIBSection(nullptr, &format, DIB_RGB_COLORS, &pixels, nullptr, 0)),
+  ButtonImage image{GdiHandle<HBITMAP>(::CreateDIBSection(nullptr, &format, DIB_RGB_COLORS, &pixels, nullptr, 0)),
                     icon->biWidth};
   if (image.Bitmap == nullptr) return {};
   const auto* const first = reinterpret_cast<const RGBQUAD*>(icon + 1);

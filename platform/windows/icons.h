@@ -6,6 +6,8 @@
 #include <memory>
 #include <type_traits>
 
+#include "platform/windows/gdi_handle.h"
+
 namespace platform {
 
 struct IconDeleter {
@@ -13,18 +15,13 @@ struct IconDeleter {
 };
 using IconHandle = std::unique_ptr<std::remove_pointer_t<HICON>, IconDeleter>;
 
-// An icon as large as `side` pixels are at UsualDpi. Null when there is none.
-IconHandle LoadIconFor(int id, int side, int dpi);
-
-struct BitmapDeleter {
-  void operator()(HBITMAP bitmap) const { ::DeleteObject(bitmap); }
-};
-using BitmapHandle = std::unique_ptr<std::remove_pointer_t<HBITMAP>, BitmapDeleter>;
+// An icon with sides of so many pixels. Null when there is none.
+IconHandle LoadIconFor(int id, int side);
 
 // A square picture with an alpha channel.
 struct ButtonImage {
-  BitmapHandle Bitmap;  // its colours multiplied by its alpha, as GdiAlphaBlend takes them; null: there is none
-  int Side = 0;         // pixels
+  GdiHandle<HBITMAP> Bitmap;  // its colours multiplied by its alpha, as GdiAlphaBlend takes them; null: there is none
+  int Side = 0;               // pixels
 };
 
 // The icon in the stored size that is next to the wanted one. A button keeps and draws it much faster than the icon.

@@ -1,23 +1,18 @@
 #include "platform/windows/screen.h"
 
-#include <memory>
-#include <type_traits>
 #include <utility>
 #include <vector>
 
+#include "platform/windows/gdi_handle.h"
 #include "platform/windows/system_library.h"
 
 namespace platform {
 namespace {
 
-struct FontDeleter {
-  void operator()(HFONT font) const { ::DeleteObject(font); }
-};
-
 struct KnownFont {
   Font Wanted;
   int Dpi;
-  std::unique_ptr<std::remove_pointer_t<HFONT>, FontDeleter> Handle;
+  GdiHandle<HFONT> Handle;
 };
 
 // "MS Sans Serif" is a bitmap font of a few sizes, drawn for the usual resolution. Elsewhere its scalable twin serves.
@@ -31,6 +26,12 @@ HFONT CreateFontFor(const Font& font, int dpi) {
 }
 
 }  // namespace
+
+RECT WorkArea() {
+  RECT area = {};
+  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &area, 0);
+  return area;
+}
 
 // It stays the same for as long as the program runs.
 int DpiOfScreen() {

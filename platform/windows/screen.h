@@ -10,11 +10,15 @@ namespace platform {
 inline constexpr int TwipsPerInch = 1440;
 inline constexpr int UsualDpi = 96;  // 15 twips a pixel
 
+RECT WorkArea();  // of the primary monitor, pixels
 int DpiOfScreen();
 int DpiOfWindow(HWND window);
 
 inline int ToPixels(int twips, int dpi) { return ::MulDiv(twips, dpi, TwipsPerInch); }
 inline int ToTwips(int pixels, int dpi) { return ::MulDiv(pixels, TwipsPerInch, dpi); }
+
+// What so many pixels at UsualDpi are at another resolution.
+inline int Scaled(int pixels, int dpi) { return ::MulDiv(pixels, dpi, UsualDpi); }
 
 DWORD NativeStyle(const WindowStyle& style);
 

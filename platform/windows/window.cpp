@@ -4,10 +4,9 @@
 namespace platform {
 namespace {
 
-// In the middle of the primary monitor's work area.
+// In the middle of the work area.
 POINT CornerFor(const SIZE& size) {
-  RECT area = {};
-  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &area, 0);
+  const RECT area = WorkArea();
   return {area.left + (area.right - area.left - size.cx) / 2, area.top + (area.bottom - area.top - size.cy) / 2};
 }
 

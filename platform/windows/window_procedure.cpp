@@ -23,8 +23,7 @@ void EraseBackground(const WindowState& window, HDC context) {
   const int before = ::SaveDC(context);
   if (window.Background) {
     const Pixels& picture = window.Background.Data()->Image;
-    const RECT place = {0, 0, ::MulDiv(picture.Width, window.Dpi, UsualDpi),
-                        ::MulDiv(picture.Height, window.Dpi, UsualDpi)};
+    const RECT place = {0, 0, Scaled(picture.Width, window.Dpi), Scaled(picture.Height, window.Dpi)};
     DrawPicture(context, place, window.Background);
     ::ExcludeClipRect(context, 0, 0, place.right, place.bottom);
   }
@@ -45,7 +44,7 @@ bool PassFocusOn(const WindowState& window) {
 // Whether the window has become the active one, and stands on the screen.
 bool Activated(WPARAM wParam) { return LOWORD(wParam) != WA_INACTIVE && HIWORD(wParam) == 0; }
 
-IconHandle ProgramIcon(int side, int dpi) { return LoadIconFor(ICONE_PROGRAMA, side, dpi); }
+IconHandle ProgramIcon(int side, int dpi) { return LoadIconFor(ICONE_PROGRAMA, Scaled(side, dpi)); }
 
 void ChangeIcon(IconHandle& icon, const WindowState& window, WPARAM size, int side) {
   IconHandle next = ProgramIcon(side, window.Dpi);
@@ -77,7 +76,7 @@ void Command(const WindowState& window, WPARAM wParam, HWND sender) {
 }
 
 // A button asks before it draws its ground, and again before it draws its text.
-std::pair<bool, LRESULT> DrawsFace(const WindowState& window, const NMHDR& notification) {
+std::pair<bool, LRESULT> AnswerNotification(const WindowState& window, const NMHDR& notification) {
   if (notification.code != NM_CUSTOMDRAW) return {false, 0};
   const ControlState* control = FindControl(window, notification.hwndFrom);
   const auto& face = reinterpret_cast<const NMCUSTOMDRAW&>(notification);
@@ -119,7 +118,7 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
       return {true, TRUE};
     }
     case WM_NOTIFY:
-      return DrawsFace(window, *reinterpret_cast<const NMHDR*>(lParam));
+      return AnswerNotification(window, *reinterpret_cast<const NMHDR*>(lParam));
     case WM_CTLCOLORSTATIC: {
       const HBRUSH ground = TextGround(window, reinterpret_cast<HDC>(wParam), reinterpret_cast<HWND>(lParam));
       return {ground != nullptr, reinterpret_cast<LRESULT>(ground)};
