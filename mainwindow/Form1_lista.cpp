@@ -1,5 +1,6 @@
 // The list of games and the window's busy state.
 #include <initializer_list>
+#include <utility>
 
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
@@ -68,15 +69,17 @@ void Form1::CarregarLista(bool IgnorarUltimo) {
   SetCaption(TituloPrograma());
 }
 
+// The table and the list change together: an event in between may fill both anew.
 void Form1::EncherLista(const std::vector<platform::DirectoryEntry>& Arquivos) {
   const std::string DirCurto = CaminhoCurto(DirRoms);
-  Jogos.assign(Arquivos.size(), Jogo{});
+  std::vector<Jogo> Novos(Arquivos.size());
   std::vector<std::string> Nomes;
   for (std::size_t i = 0; i < Arquivos.size(); ++i) {
-    Jogos[i] = LerJogo(Arquivos[i], DirCurto);
+    Novos[i] = LerJogo(Arquivos[i], DirCurto);
     if (i % 10 == 0) platform::RunPendingEventsAtIntervals();
-    if (!Jogos[i].Arquivo.empty()) Nomes.push_back(Jogos[i].Nome);
+    if (!Novos[i].Arquivo.empty()) Nomes.push_back(Novos[i].Nome);
   }
+  Jogos = std::move(Novos);
   List1.Fill(Nomes);
 }
 

@@ -15,6 +15,7 @@ void Form1::Command3_Click() {
     MostrarErro("O programa de download não foi encontrado."_ansi);
     return;
   }
+  const std::string Selecionado = NomeSelecionado();
   Desativar(false);
   Enable(false);
   SetCaption("...");
@@ -27,7 +28,8 @@ void Form1::Command3_Click() {
     return;
   }
   Enable(true);
-  CarregarLista(false);
+  CarregarLista(true);
+  SelecionarNome(Selecionado);
 }
 
 void Form1::Command2_Click() {

@@ -68,6 +68,23 @@ TEST_F(List, WhileItIsReadNothingCanBeStartedAndTheWindowLives) {
   EXPECT_EQ(States(), NothingSelected);
 }
 
+// An event in the middle of a fill fills the list anew, with fewer games: table and list still belong together.
+TEST_F(List, IsWholeWhenItIsFilledAgainWhileItIsRead) {
+  for (int i = 0; i < 22; ++i) PutFile(Roms + std::to_string(i) + ".smc", Rom);
+  ASSERT_TRUE(Start());
+  int looks = 0;
+  const std::function<void()> refill = [&] {
+    if (form->Caption() != "Carregando..." || ++looks == 1) return QueueEvent(refill);  // the directory is not read yet
+    for (int i = 0; i < 22; ++i) RemoveFile(Roms + std::to_string(i) + ".smc");
+    form->CarregarLista(true);
+    EXPECT_EQ(form->Jogos.size(), 3U);
+  };
+  QueueEvent(refill);
+  form->CarregarLista(true);
+  EXPECT_EQ(form->List1.Count(), static_cast<int>(form->Jogos.size()));
+  for (int i = 0; i < form->List1.Count(); ++i) EXPECT_NE(form->IndiceJogo(form->List1.Text(i)), -1) << i;
+}
+
 TEST_F(List, PreviewTakesTheFirstPicturePresent) {
   ASSERT_TRUE(Start());
   const std::tuple<const char*, std::string, std::string> steps[] = {
