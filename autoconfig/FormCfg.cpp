@@ -9,6 +9,7 @@
 #include "platform/files.h"
 #include "platform/messages.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
 #include "support/mod_Configuracao.h"
@@ -184,8 +185,8 @@ void FormCfg::Command2_Click() { Close(); }
 void FormCfg::Command3_Click() {
   std::string Filtro = FiltroDeEmuladores();
   const std::string Atual = Selecionado();
-  const std::string Caminho = AbrirArquivo(*this, Atual.substr(0, Atual.rfind('\\') + 1), Traduzir("Procurar emulador"),
-                                           "", Filtro, platform::HideReadOnly);
+  const std::string Caminho =
+      AbrirArquivo(*this, DiretorioDe(Atual), Traduzir("Procurar emulador"), "", Filtro, platform::HideReadOnly);
   if (Caminho.empty()) return;
   Selecionar(Acrescentar(Caminho));
 }

@@ -5,6 +5,7 @@
 #include "platform/files.h"
 #include "platform/registry.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
@@ -70,10 +71,9 @@ std::string AjusteDoEmulador(const std::string& Emulador) {
 bool TemBranco(const std::string& Caminho) { return Caminho.find(' ') != std::string::npos; }
 
 std::string ConfiguracaoDoEmulador(const std::string& Emulador) {
-  const std::size_t Nome = Emulador.rfind('\\') + 1;
-  const std::string Diretorio = Emulador.substr(0, Nome);
+  const std::string Diretorio = DiretorioDe(Emulador);
   std::string ParaWindows = Diretorio + "zsnesw.cfg", ParaDos = Diretorio + "zsnes.cfg";
-  const std::string Executavel = platform::CharUpperBuffA(Emulador.substr(Nome));
+  const std::string Executavel = platform::CharUpperBuffA(UltimaParte(Emulador));
   if (Executavel.starts_with("ZSNESW")) return ParaWindows;
   if (Executavel.starts_with("ZSNES")) return ParaDos;
   return ArquivoExiste(ParaDos) && !ArquivoExiste(ParaWindows) ? ParaDos : ParaWindows;

@@ -6,15 +6,23 @@
 #include "package/pacote.h"
 #include "platform/events.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
+#include "support/gravacao.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
 #include "support/mod_Traducao.h"
 
 namespace {
 
+using platform::Existing;
 using platform::RunPendingEvents;
 
 enum class Desfecho { Salvo, Desistencia, ErroDeLeitura, ErroDeGravacao, ErroInesperado };
+
+struct Alvo {
+  std::string Caminho;
+  Existing Existente;
+};
 
 struct Oferta {
   std::string Filtro, ExtensaoPadrao;  // as the save dialog takes them
@@ -51,16 +59,23 @@ std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemI
                        platform::HideReadOnly);
 }
 
-Desfecho SalvarCopia(const Jogo& Escolhido, const std::string& Destino) {
+// Over a file only when it was asked for: one that could not be seen then, or came since, stays.
+Desfecho Gravar(const Alvo& Destino, std::string_view Conteudo) {
+  ApagarRestos(DiretorioDe(Destino.Caminho));
+  return Substituicao(Destino.Caminho, Conteudo, Destino.Existente).Concluir() ? Desfecho::Salvo
+                                                                               : Desfecho::ErroDeGravacao;
+}
+
+Desfecho SalvarCopia(const Jogo& Escolhido, const Alvo& Destino) {
   const std::string Conteudo = LerArquivo(Escolhido.Arquivo);
   if (Conteudo.empty()) return Desfecho::ErroDeLeitura;
   RunPendingEvents();
-  return GravarInteiro(Destino, Conteudo) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
+  return Gravar(Destino, Conteudo);
 }
 
 // The ROM is read once, to where the package has it, and the header is then put before the blocks: texts of many
 // megabytes cost more than reading the file.
-Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const std::string& Destino) {
+Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const Alvo& Destino) {
   constexpr std::size_t Folga = 1024;  // a longer header costs a copy, no more
   const std::int32_t TamanhoImagem = TamanhoArquivo(ArquivoImagem), TamanhoRom = TamanhoArquivo(Escolhido.Arquivo);
   std::string Pacote;
@@ -76,15 +91,17 @@ Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, c
   if (!Soma) return Desfecho::ErroInesperado;
   Pacote.insert(0, MontarPacote(Escolhido.Nome, Escolhido.DOSName, TextoCRC(*Soma), TamanhoImagem, TamanhoRom, {}, {}));
   RunPendingEvents();
-  return GravarInteiro(Destino, Pacote) ? Desfecho::Salvo : Desfecho::ErroDeGravacao;
+  return Gravar(Destino, Pacote);
 }
 
 Desfecho Salvar(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
-  const std::string Destino = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
-  if (Destino.empty()) return Desfecho::Desistencia;
-  if (ArquivoExiste(Destino) && !ConfirmarSubstituicao("Arquivo já existente."_ansi)) return Desfecho::Desistencia;
+  const std::string Caminho = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
+  if (Caminho.empty()) return Desfecho::Desistencia;
+  const auto Tamanho = platform::FileSize(Caminho);
+  if (Tamanho > 0 && !ConfirmarSubstituicao("Arquivo já existente."_ansi)) return Desfecho::Desistencia;
   RunPendingEvents();
-  return TipoDoArquivo(Destino) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, Destino)
+  const Alvo Destino{Caminho, Tamanho ? Existing::Replace : Existing::Keep};
+  return TipoDoArquivo(Caminho) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, Destino)
                                          : SalvarCopia(Escolhido, Destino);
 }
 

@@ -7,6 +7,8 @@
 #include "package/pacote.h"
 #include "platform/events.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
+#include "support/gravacao.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
 #include "support/mod_Globais.h"
@@ -14,6 +16,7 @@
 
 namespace {
 
+using platform::Existing;
 using platform::RunPendingEvents;
 
 enum class Desfecho { Adicionado, Desistencia, ErroDeLeitura, ErroDeGravacao, Corrompido };
@@ -33,27 +36,56 @@ Importacao ImportarRom(const std::string& Caminho, const std::string& Base) {
   const std::string Conteudo = LerArquivo(Caminho);
   if (Conteudo.empty()) return {Desfecho::ErroDeLeitura};
   RunPendingEvents();
-  if (!GravarInteiro(DirRoms + NomeDoArquivo(Caminho), Conteudo)) return {Desfecho::ErroDeGravacao};
+  if (!GravarInteiro(DirRoms + UltimaParte(Caminho), Conteudo)) return {Desfecho::ErroDeGravacao};
   return {Desfecho::Adicionado, Base};
 }
 
-// The ROM as it was written must have the package's checksum. A damaged package is told before it can replace
-// anything; a ROM that the disk holds differently is removed again, with its picture.
-Desfecho GravarJogo(const Pacote& Novo) {
-  cls_CRC Medida;
-  if (const auto Soma = Medida.CRC(Novo.Rom); Soma && TextoCRC(*Soma) != Novo.CRC) return Desfecho::Corrompido;
-  const std::string ArquivoImagem = DirImgs + Novo.Nome + ".gif";
-  if (!GravarInteiro(ArquivoImagem, Novo.Imagem)) return Desfecho::ErroDeLeitura;
-  RunPendingEvents();
-  const std::string ArquivoRom = DirRoms + Novo.DOSName + ".zip";
-  if (!GravarInteiro(ArquivoRom, Novo.Rom)) return Desfecho::ErroDeLeitura;
-  RunPendingEvents();
-  const auto Soma = CRCDoArquivo(ArquivoRom);
+std::string ArquivoDaRom(const Pacote& Novo) { return DirRoms + Novo.DOSName + ".zip"; }
+
+// Makes the new contents the files' own. What has to be written in place can fail, and goes first; what lies complete
+// beside its file can only take the name.
+bool TomarNomes(Substituicao& Figura, Substituicao& Rom) {
+  return Figura.EstaAoLado() ? Rom.Concluir() && Figura.Concluir() : Figura.Concluir() && Rom.Concluir();
+}
+
+// Whether the ROM as it stands on the disk has the package's checksum.
+Desfecho ConferirRom(const std::string& Arquivo, const Pacote& Novo) {
+  const auto Soma = CRCDoArquivo(Arquivo);
   if (!Soma) return Desfecho::ErroDeLeitura;
-  if (*Soma == Novo.CRC) return Desfecho::Adicionado;
-  ApagarArquivo(ArquivoRom);
-  ApagarArquivo(ArquivoImagem);
-  return Desfecho::Corrompido;
+  return *Soma == Novo.CRC ? Desfecho::Adicionado : Desfecho::Corrompido;
+}
+
+// A package whose ROM has no checksum, since the file ends before it or within it, is refused, and one that is damaged
+// is told, before anything changes. The new game is complete on the disk before the old one goes.
+Desfecho GravarJogo(const Pacote& Novo, Existing RomExistente) {
+  cls_CRC Medida;
+  const auto Soma = Medida.CRC(Novo.Rom);
+  if (!Soma || Novo.Imagem.empty()) return Desfecho::ErroDeLeitura;
+  if (TextoCRC(*Soma) != Novo.CRC) return Desfecho::Corrompido;
+  const std::string ArquivoImagem = DirImgs + Novo.Nome + ".gif", ArquivoRom = ArquivoDaRom(Novo);
+  Substituicao Figura(ArquivoImagem, Novo.Imagem), Rom(ArquivoRom, Novo.Rom, RomExistente);
+  RunPendingEvents();
+  const bool ConferidaAntes = Rom.EstaAoLado();
+  Desfecho Fim = ConferidaAntes ? ConferirRom(Rom.Provisorio(), Novo) : Desfecho::Adicionado;
+  if (Fim != Desfecho::Adicionado) return Fim;
+  if (!TomarNomes(Figura, Rom)) return Desfecho::ErroDeLeitura;
+  if (!ConferidaAntes) Fim = ConferirRom(ArquivoRom, Novo);
+  if (Fim == Desfecho::Corrompido) {
+    ApagarArquivo(ArquivoRom);
+    ApagarArquivo(ArquivoImagem);
+  }
+  return Fim;
+}
+
+// What the package's ROM meets under its file name, which a game of another name can have. A file that cannot be seen
+// counts as none, and nothing takes its place.
+enum class Encontro { Nada, MesmaRom, OutraRom };
+
+Encontro OQueEncontra(const Pacote& Novo) {
+  const std::string Arquivo = ArquivoDaRom(Novo);
+  const auto Tamanho = platform::FileSize(Arquivo);
+  if (!Tamanho) return Encontro::Nada;
+  return *Tamanho == 0 || LerArquivo(Arquivo) == Novo.Rom ? Encontro::MesmaRom : Encontro::OutraRom;
 }
 
 Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
@@ -61,16 +93,19 @@ Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
   const auto Novo = LerPacote(Conteudo);
   if (!Novo) return {Desfecho::ErroDeLeitura};
   RunPendingEvents();
-  const bool Substituir = Lista.InList1(Novo->Nome);
-  if (Substituir && !ConfirmarSubstituicao("O jogo a ser adiciona já existe."_ansi)) return {Desfecho::Desistencia};
-  const Desfecho Fim = GravarJogo(*Novo);
-  if (Fim == Desfecho::Adicionado && !Substituir) Catalogo().RegistrarRom(Novo->Nome, Novo->DOSName);
+  const bool NaLista = Lista.InList1(Novo->Nome);
+  const Encontro Encontrado = NaLista ? Encontro::OutraRom : OQueEncontra(*Novo);
+  if (Encontrado == Encontro::OutraRom && !ConfirmarSubstituicao("O jogo a ser adiciona já existe."_ansi)) {
+    return {Desfecho::Desistencia};
+  }
+  const Desfecho Fim = GravarJogo(*Novo, Encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace);
+  if (Fim == Desfecho::Adicionado && !NaLista) Catalogo().RegistrarRom(Novo->Nome, Novo->DOSName);
   return {Fim, Novo->Nome};
 }
 
 Importacao Importar(const Form1& Lista, const std::string& Caminho) {
   if (Caminho.empty()) return {Desfecho::Desistencia};
-  const auto Base = NomeBase(NomeDoArquivo(Caminho));
+  const auto Base = NomeBase(UltimaParte(Caminho));
   if (!ArquivoExiste(Caminho) || !Base) return {Desfecho::ErroDeLeitura};
   const std::string Tipo = TipoDoArquivo(Caminho);
   if (Tipo == "ZIP" || Tipo == "SMC") return ImportarRom(Caminho, *Base);

@@ -7,6 +7,8 @@
 #include "platform/events.h"
 #include "platform/registry.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
+#include "support/gravacao.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
@@ -27,6 +29,13 @@ void AvisarSemConfiguracao() {
       Traduzir("Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado."_ansi) +
       "\r\n" + Traduzir("Reinstale o programa.");
   platform::MessageBoxA(Aviso, Traduzir("Erro"), platform::Buttons::Ok, platform::Icon::Critical);
+}
+
+// What an earlier run of the program has left half written.
+void ApagarRestosDeAntes() {
+  for (const std::string& Diretorio : {DirRoms, DirSaves, DirImgs, DiretorioDe(ArquivoCfgEmulador)}) {
+    ApagarRestos(Diretorio);
+  }
 }
 
 }  // namespace
@@ -52,6 +61,7 @@ bool Form1::Form_Load() {
   platform::RunPendingEvents();
   CarregarLista(false);
   platform::RunPendingEvents();
+  ApagarRestosDeAntes();
   MostrarControleNaPrimeiraVez();
   return true;
 }

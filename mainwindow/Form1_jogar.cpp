@@ -5,21 +5,26 @@
 #include "platform/events.h"
 #include "platform/registry.h"
 #include "platform/text.h"
+#include "support/gravacao.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 #include "support/mod_exe.h"
 
 namespace {
 
+using platform::Existing;
+
 // Points the emulator at the program's directories. When that fails the game starts all the same, with the emulator's
-// old settings.
+// old settings. What is there but cannot be read is left alone: only a file that is missing is made.
 void ConfigurarEmulador(const std::string& DirSavesDoJogo) {
-  if (!ArquivoExiste(ArquivoCfgEmulador)) {
-    GravarArquivo(ArquivoCfgEmulador, ConfiguracaoNova(DirSavesDoJogo, DirRoms), 1, true);
-    return;
-  }
-  const auto Nova = ConfiguracaoAtualizada(LerArquivo(ArquivoCfgEmulador, 1, -1), DirSavesDoJogo, DirRoms);
-  if (Nova) GravarArquivo(ArquivoCfgEmulador, *Nova, 1, true);
+  platform::File Arquivo(ArquivoCfgEmulador, platform::Access::Read);
+  const auto Texto = Arquivo.IsOpen() ? LerInteiro(Arquivo) : std::nullopt;
+  const bool Existe = Arquivo.IsOpen();
+  Arquivo.Close();
+  if (Existe && !Texto) return;
+  const auto Nova = !Texto || Texto->empty() ? ConfiguracaoNova(DirSavesDoJogo, DirRoms)
+                                             : ConfiguracaoAtualizada(*Texto, DirSavesDoJogo, DirRoms);
+  if (Nova) Substituicao(ArquivoCfgEmulador, *Nova, Existe ? Existing::Replace : Existing::Keep).Concluir();
 }
 
 }  // namespace

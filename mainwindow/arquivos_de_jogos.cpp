@@ -9,8 +9,6 @@ std::string TipoDoArquivo(const std::string& Caminho) {
   return platform::CharUpperBuffA(Caminho.size() > 3 ? Caminho.substr(Caminho.size() - 3) : Caminho);
 }
 
-std::string NomeDoArquivo(const std::string& Caminho) { return Caminho.substr(Caminho.rfind('\\') + 1); }
-
 std::optional<std::string> NomeBase(const std::string& NomeArquivo) {
   const auto Ponto = NomeArquivo.rfind('.');
   if (Ponto == std::string::npos) return std::nullopt;

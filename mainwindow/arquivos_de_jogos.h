@@ -8,9 +8,6 @@
 // The last three characters of a path, in upper case: the type that decides how a file is treated.
 std::string TipoDoArquivo(const std::string& Caminho);
 
-// The part of a path behind its last backslash.
-std::string NomeDoArquivo(const std::string& Caminho);
-
 // A file name without its last "." and what follows; nothing when it has no ".".
 std::optional<std::string> NomeBase(const std::string& NomeArquivo);
 

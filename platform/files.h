@@ -12,9 +12,9 @@
 namespace platform {
 
 enum class Access {
-  Read,           // the file must exist
-  ReadWrite,      // created empty when missing; an existing file keeps its contents
-  ReplaceContent  // created, or emptied when it exists; for writing
+  Read,       // the file must exist
+  ReadWrite,  // created empty when missing; an existing file keeps its contents
+  CreateNew   // for writing; fails when anything of that name exists
 };
 
 // An open file, closed at the end of its life. Other programs may read and write it meanwhile.
@@ -49,6 +49,9 @@ class File {
   // Returns when the contents are on the disk itself; false when they may not be.
   bool Flush();
 
+  // Gives this file, which is open for writing, the other one's time of change and its attributes but read-only.
+  bool CopyInformation(const File& from);
+
  private:
   std::intptr_t handle_ = -1;  // of the implementation; -1: not open
 };
@@ -68,11 +71,15 @@ std::optional<std::int64_t> FileSize(const std::string& path);
 
 bool DeleteFileA(const std::string& path);  // false for a missing, read-only or open file
 
-// Gives the file another name on the same disk, over a file of that name, and returns when the disk holds it so.
-bool MoveFileExA(const std::string& from, const std::string& to);
+// Deletes a file that no program has open, and that was changed last before the machine was started or more than so
+// many seconds ago. False when it stays; one that was changed in the future stays.
+bool DeleteAbandonedFile(const std::string& path, std::uint32_t seconds);
 
-// Copies contents, attributes and time of change, over a file of that name.
-bool CopyFileA(const std::string& from, const std::string& to);
+enum class Existing { Replace, Keep };
+
+// Gives the file another name on the same disk, and returns when the disk holds it so. A file that has that name is
+// replaced; with Keep it stays, and the answer is false.
+bool MoveFileExA(const std::string& from, const std::string& to, Existing existing);
 
 bool CreateDirectoryA(const std::string& path);  // one directory; false when it exists or its parent does not
 

@@ -9,9 +9,9 @@ constexpr std::uint64_t Maximo = std::numeric_limits<std::int32_t>::max();
 
 std::int32_t BytesLivres(const platform::DiskFreeSpace& disco) {
   const std::uint64_t setores = std::uint64_t{disco.FreeClusters} * disco.SectorsPerCluster;
-  if (setores > Maximo) return 0;
+  if (setores > Maximo) return UmGiB;
   const std::uint64_t bytes = setores * disco.BytesPerSector;
-  return bytes > Maximo ? 0 : static_cast<std::int32_t>(bytes);
+  return bytes > Maximo ? UmGiB : static_cast<std::int32_t>(bytes);
 }
 
 }  // namespace

@@ -7,8 +7,9 @@
 
 #include "platform/files.h"
 
-// The free bytes of the disk that the path lies on. What cannot be told, or does not fit 31 bits, is 0; but 0 counts as
-// 1 GiB on every disk other than the floppy ("A", not "a"), so that only a floppy can be found full or missing.
+// The free bytes of the disk that the path lies on. What does not fit 31 bits is 1 GiB. A disk that is full, or cannot
+// be asked, has 0 when it is the floppy ("A", not "a") and else 1 GiB, so that only a floppy can be found full or
+// missing.
 std::int32_t EspacoLivre(const std::string& caminho);
 
 // The same of a disk whose state is known.

@@ -64,6 +64,7 @@ class Form4 : public platform::Window {
   void Preencher(const Painel& painel);
   void Escolher(const Painel& painel);
   void Copiar(const Painel& origem, const Painel& destino);
+  void MostrarAndamento(const std::string& andamento);  // behind the title of a copy
   void RecolherEscolha();
   void Deletar(const Painel& painel);
 

@@ -4,6 +4,7 @@
 #include "platform/text.h"
 #include "savemanager/EspacoLivre.h"
 #include "savemanager/Form4.h"
+#include "support/gravacao.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Traducao.h"
 
@@ -23,8 +24,8 @@ void AvisarDiscoCheio() {
                         Traduzir("Disco cheio"), Buttons::Ok, Icon::Exclamation);
 }
 
-void AvisarErro() {
-  platform::MessageBoxA(Traduzir("Erro ao gravar arquivo."), Traduzir("Erro"), Buttons::Ok, Icon::Critical);
+void AvisarErro(const char* texto) {
+  platform::MessageBoxA(Traduzir(texto), Traduzir("Erro"), Buttons::Ok, Icon::Critical);
 }
 
 bool ConfirmarSubstituir(const std::string& jaExiste) {
@@ -47,22 +48,30 @@ std::string Form4::CaminhoAtual(const Painel& painel) const {
   return painel.Diretorio.empty() ? "" : painel.Diretorio + ArquivoAtual;
 }
 
-// The old file stays until the new one is complete, so there must be room for both. Events run while the title is
-// drawn: what is picked then does not outlive the copy.
+// The old file stays until the new one is complete, so there must be room for both. Events run meanwhile, so that the
+// window stays painted and alive; it takes no input.
 void Form4::Copiar(const Painel& origem, const Painel& destino) {
   const std::string de = CaminhoAtual(origem);
   const std::string para = CaminhoAtual(destino);
   if (de.empty() || para.empty()) return;
+  ApagarRestos(destino.Diretorio);
   if (!Cabe(de, para)) return AvisarDiscoCheio();
   if (ArquivoExiste(para) && !ConfirmarSubstituir(destino.JaExiste)) return;
   RecolherEscolha();
+  Enable(false);
+  MostrarAndamento("");
+  const Copia copia =
+      CopiarArquivo(de, para, [this](int porCento) { MostrarAndamento(" " + std::to_string(porCento) + "%"); });
+  Enable(true);
   origem.Lista.SetFocus();  // the copy button, which may have had the keyboard, is hidden now
-  SetCaption(Traduzir("Copiando..."));
-  platform::RunPendingEvents();
-  if (!CopiarArquivo(de, para)) AvisarErro();
+  if (copia != Copia::Feita) AvisarErro(copia == Copia::NaoLida ? "Erro ao ler arquivo." : "Erro ao gravar arquivo.");
   Listar(destino);
-  RecolherEscolha();
   SetCaption(Traduzir("Salvamentos dos jogos"));
+}
+
+void Form4::MostrarAndamento(const std::string& andamento) {
+  SetCaption(Traduzir("Copiando...") + andamento);
+  platform::RunPendingEvents();
 }
 
 void Form4::RecolherEscolha() {

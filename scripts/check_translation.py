@@ -32,7 +32,7 @@ NAMES = {
     "|IMGROMDAT|", "CRC=", "NOME=", "NOMEDOS=", "IIMG=", "IROM=", "TIMG=", "TROM=", "TOLVARIS", "TOLVARIS\r\n",
     "iIMG=1\r\n", "iROM=", "tIMG=", "tROM=", "CON", "PRN", "AUX", "NUL", "CONIN$", "CONOUT$", "COM1", "LPT1",
     # types of files; the pattern of all files comes with the label that file dialogs have without ours
-    "SMC", "TVK", "ZIP", "smc", "tvk;", "zip", ".novo~",
+    "SMC", "TVK", "ZIP", "smc", "tvk;", "zip", ".novo~", "0123456789abcdef",
     "Todos os arquivos (*.*)\0*.*\0",
     # processors
     "pclmul",

@@ -2,10 +2,34 @@
 
 #include <algorithm>
 #include <new>
-
-#include "platform/files.h"
+#include <random>
+#include <utility>
 
 namespace {
+
+using platform::Existing;
+
+constexpr std::string_view Terminacao = ".novo~";  // none of the program's lists shows such a file
+constexpr std::size_t TamanhoMarca = 8;
+constexpr std::string_view Digitos = "0123456789abcdef";
+
+// "Jogo.zip" becomes "Jogo.zip.0f3a99c2.novo~", so that no two programs write the same file, and none of the person's.
+std::string ComMarca(const std::string& caminho) {
+  std::uint32_t acaso = std::random_device{}();
+  std::string marca(TamanhoMarca, '0');
+  for (char& digito : marca) {
+    digito = Digitos[acaso & 0xF];
+    acaso >>= 4;
+  }
+  return caminho + "." + marca + std::string(Terminacao);
+}
+
+bool TemMarca(std::string_view nome) {
+  constexpr std::size_t fim = 1 + TamanhoMarca + Terminacao.size();
+  if (nome.size() <= fim || !nome.ends_with(Terminacao)) return false;
+  const std::string_view marca = nome.substr(nome.size() - fim + 1, TamanhoMarca);
+  return nome[nome.size() - fim] == '.' && marca.find_first_not_of(Digitos) == std::string_view::npos;
+}
 
 // Where a text goes in a file of a known length.
 struct Trecho {
@@ -60,32 +84,67 @@ bool EscreverOuDesfazer(platform::File& arquivo, const Gravacao& pedido, std::in
   return false;
 }
 
-Troca Preparar(const std::string& temporario, std::string_view conteudo) {
-  platform::File arquivo(temporario, platform::Access::ReplaceContent);
-  if (!arquivo.IsOpen() || !arquivo.Write(0, conteudo)) return Troca::SemLugar;
-  return arquivo.Flush() ? Troca::Feita : Troca::Recusada;
-}
-
 }  // namespace
 
-std::string NomeTemporario(const std::string& Caminho) { return Caminho + ".novo~"; }
+ArquivoAoLado::ArquivoAoLado(std::string Caminho)
+    : caminho_(std::move(Caminho)),
+      nome_(ComMarca(caminho_)),
+      arquivo_(nome_, platform::Access::CreateNew),
+      existe_(arquivo_.IsOpen()) {}
 
-Troca TrocarConteudo(const std::string& Caminho, std::string_view Conteudo) {
-  const std::string temporario = NomeTemporario(Caminho);
-  Troca troca = Preparar(temporario, Conteudo);
-  if (troca == Troca::Feita && !platform::MoveFileExA(temporario, Caminho)) troca = Troca::SemLugar;
-  if (troca != Troca::Feita) platform::DeleteFileA(temporario);
-  return troca;
+ArquivoAoLado::~ArquivoAoLado() { Desistir(); }
+
+void ArquivoAoLado::Desistir() {
+  arquivo_.Close();
+  if (std::exchange(existe_, false)) platform::DeleteFileA(nome_);
 }
 
-bool GravarNoLugar(const std::string& Caminho, const Gravacao& Pedido) {
+bool ArquivoAoLado::TomarNome(Existing Existente) {
+  arquivo_.Close();
+  if (!existe_ || !platform::MoveFileExA(nome_, caminho_, Existente)) return false;
+  existe_ = false;
+  return true;
+}
+
+Substituicao::Substituicao(const std::string& Caminho, std::string_view Conteudo, Existing Existente)
+    : caminho_(Caminho), conteudo_(Conteudo), existente_(Existente), aoLado_(Caminho), estado_(Preparar()) {}
+
+// Without room for all of it, what there is of it gives its room back at once.
+Substituicao::Estado Substituicao::Preparar() {
+  platform::File& arquivo = aoLado_.Arquivo();
+  if (!arquivo.Write(0, conteudo_)) {
+    aoLado_.Desistir();
+    return Estado::SemLugar;
+  }
+  const bool gravado = arquivo.Flush();
+  arquivo.Close();
+  return gravado ? Estado::AoLado : Estado::Recusada;
+}
+
+bool Substituicao::Concluir() {
+  if (estado_ == Estado::Recusada) return false;
+  if (estado_ == Estado::AoLado && aoLado_.TomarNome(existente_)) return true;
+  aoLado_.Desistir();
+  return GravarNoLugar(caminho_, {conteudo_, 0, true}, existente_);
+}
+
+bool GravarNoLugar(const std::string& Caminho, const Gravacao& Pedido, Existing Existente) {
   const bool existia = platform::GetFileAttributesA(Caminho).has_value();
-  platform::File arquivo(Caminho, platform::Access::ReadWrite);
+  const bool novo = Existente == Existing::Keep;
+  platform::File arquivo(Caminho, novo ? platform::Access::CreateNew : platform::Access::ReadWrite);
   if (!arquivo.IsOpen()) return false;
   const std::int64_t tamanho = arquivo.Size();
   if (tamanho >= 0 && EscreverOuDesfazer(arquivo, Pedido, tamanho)) return true;
   arquivo.Close();
   // Made by opening it; but whatever holds something is not deleted.
-  if (!existia && platform::FileSize(Caminho) == 0) platform::DeleteFileA(Caminho);
+  if ((novo || !existia) && platform::FileSize(Caminho) == 0) platform::DeleteFileA(Caminho);
   return false;
+}
+
+void ApagarRestos(const std::string& Diretorio) {
+  constexpr std::uint32_t umaHora = 3600;  // seconds; no writing takes so long
+  if (Diretorio.empty()) return;
+  for (const platform::DirectoryEntry& arquivo : platform::ListDirectory(Diretorio, "*" + std::string(Terminacao))) {
+    if (TemMarca(arquivo.Name)) platform::DeleteAbandonedFile(Diretorio + arquivo.Name, umaHora);
+  }
 }

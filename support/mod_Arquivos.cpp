@@ -40,16 +40,37 @@ bool Substituir(const std::string& caminho, std::string_view texto, std::int64_t
       return false;
     }
   }
-  const Troca troca = TrocarConteudo(caminho, texto);
-  return troca == Troca::Feita || (troca == Troca::SemLugar && GravarNoLugar(caminho, {texto, 0, true}));
+  return Substituicao(caminho, texto).Concluir();
 }
 
-// A copy that takes the name only when it is complete.
-bool CopiarAoLado(const std::string& origem, const std::string& destino) {
-  const std::string temporario = NomeTemporario(destino);
-  if (platform::CopyFileA(origem, temporario) && platform::MoveFileExA(temporario, destino)) return true;
-  platform::DeleteFileA(temporario);
-  return false;
+enum class Tentativa { Feita, NaoLida, SemLugar, Recusada };
+
+// The copy lies beside its place until it is complete. Each piece is on the disk before the next one: a slow disk takes
+// its time for a piece and not, at the end, for all of them.
+Tentativa CopiarAoLado(platform::File& origem, const std::string& caminho, const Andamento& andamento) {
+  constexpr std::size_t tamanhoPedaco = 65'536;
+  ArquivoAoLado destino(caminho);
+  const std::int64_t tamanho = origem.Size();
+  if (tamanho < 0) return Tentativa::NaoLida;
+  std::string pedaco(tamanhoPedaco, '\0');
+  for (std::int64_t posicao = 0; posicao < tamanho;) {
+    const std::int64_t lidos = origem.Read(posicao, pedaco.data(), pedaco.size());
+    if (lidos <= 0) return Tentativa::NaoLida;
+    if (!destino.Arquivo().Write(posicao, {pedaco.data(), static_cast<std::size_t>(lidos)})) return Tentativa::SemLugar;
+    if (!destino.Arquivo().Flush()) return Tentativa::Recusada;
+    posicao += lidos;
+    if (posicao < tamanho && andamento) andamento(static_cast<int>(100 * posicao / tamanho));
+  }
+  destino.Arquivo().CopyInformation(origem);
+  if (destino.Arquivo().IsOpen() && !destino.Arquivo().Flush()) return Tentativa::Recusada;
+  return destino.TomarNome(platform::Existing::Replace) ? Tentativa::Feita : Tentativa::SemLugar;
+}
+
+// Where there is no room for a copy beside it, the contents are written like any other text.
+Copia CopiarNoLugar(platform::File& origem, const std::string& destino) {
+  const auto conteudo = LerInteiro(origem);
+  if (!conteudo) return Copia::NaoLida;
+  return GravarNoLugar(destino, {*conteudo, 0, true}) ? Copia::Feita : Copia::NaoGravada;
 }
 
 }  // namespace
@@ -83,15 +104,19 @@ int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32
   return gravado ? 1 : -1;
 }
 
-// A read-only file is not copied beside the other one: the copy would be read-only too, and could not be taken away
-// again. Where there is no room for a copy beside it, its contents are written like any other text.
-bool CopiarArquivo(const std::string& Origem, const std::string& Destino) {
-  const auto atributos = platform::GetFileAttributesA(Origem);
-  if (!atributos) return false;
-  if ((*atributos & platform::AttributeReadOnly) == 0 && CopiarAoLado(Origem, Destino)) return true;
-  platform::File arquivo(Origem, platform::Access::Read);
-  const auto conteudo = LerInteiro(arquivo);
-  return conteudo && Substituir(Destino, *conteudo, 0);
+Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const Andamento& AoAndar) {
+  platform::File origem(Origem, platform::Access::Read);
+  if (!origem.IsOpen()) return Copia::NaoLida;
+  switch (CopiarAoLado(origem, Destino, AoAndar)) {
+    case Tentativa::Feita:
+      return Copia::Feita;
+    case Tentativa::NaoLida:
+      return Copia::NaoLida;
+    case Tentativa::SemLugar:
+      return CopiarNoLugar(origem, Destino);
+    default:
+      return Copia::NaoGravada;
+  }
 }
 
 void ApagarArquivo(const std::string& Caminho) { platform::DeleteFileA(Caminho); }

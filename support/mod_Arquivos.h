@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <functional>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -26,9 +27,13 @@ std::optional<std::string> LerInteiro(platform::File& Arquivo);
 // stays. Without, bytes behind the text stay as they are.
 int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32_t Posicao, bool ApagarAntes);
 
+enum class Copia { Feita, NaoLida, NaoGravada };  // NaoLida: it is the source that cannot be read
+using Andamento = std::function<void(int PorCento)>;
+
 // Copies contents and, where it can, attributes and time of change, over a file of that name, which stays whole when
-// the copy fails. A read-only file's copy can be written.
-bool CopiarArquivo(const std::string& Origem, const std::string& Destino);
+// the copy fails. A read-only file's copy can be written. A long copy is written in pieces: between two of them it
+// tells how much is done.
+Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const Andamento& AoAndar = nullptr);
 
 // A file that is missing or cannot be deleted is left alone.
 void ApagarArquivo(const std::string& Caminho);

@@ -6,6 +6,7 @@
 #include "platform/files.h"
 #include "platform/messages.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
 
 namespace {
 
@@ -41,7 +42,7 @@ std::string Perguntar(Dialogo dialogo, platform::OpenFileName pedido, std::strin
 // True for a file that the disk lists under this name, in whatever letter case.
 bool Listado(const std::string& caminho) {
   const auto entrada = platform::ListPath(caminho);
-  const std::string nome = caminho.substr(caminho.rfind('\\') + 1);
+  const std::string nome = UltimaParte(caminho);
   return entrada && platform::CharUpperBuffA(entrada->Name) == platform::CharUpperBuffA(nome);
 }
 

@@ -35,6 +35,6 @@ void LerCaminhos(const cls_REG& Registro) {
 }
 
 std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao) {
-  const std::string& Caminho = Texto.empty() ? Padrao : Texto;
-  return Caminho.starts_with('\\') ? DirPrograma + Caminho.substr(1) : Caminho;
+  if (Texto.empty()) return Padrao;
+  return Texto.starts_with('\\') ? DirPrograma + Texto.substr(1) : Texto;
 }

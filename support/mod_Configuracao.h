@@ -15,5 +15,6 @@ void EscolherIdioma();
 // directory that is not set is one of the program's own; a file that is not set is empty.
 void LerCaminhos(const cls_REG& Registro);
 
-// A path of the settings: the default when it is empty; a leading backslash stands for DirPrograma.
+// A path of the settings: the default, as it is, when the text is empty; a leading backslash of the text stands for
+// DirPrograma.
 std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao);

@@ -2,6 +2,7 @@
 
 #include "platform/events.h"
 #include "platform/processes.h"
+#include "support/caminhos.h"
 
 namespace {
 
@@ -27,7 +28,7 @@ bool ComecaCaminho(const std::string& texto, std::size_t posicao) {
 // The command line up to its last backslash. Where that lies in an argument that is an absolute path, the directory is
 // the argument's.
 std::string DiretorioDoComando(const std::string& comando) {
-  std::string ate = comando.substr(0, comando.rfind('\\') + 1);
+  std::string ate = DiretorioDe(comando);
   for (std::size_t i = ate.size(); i-- > 0;) {
     if (ComecaCaminho(ate, i)) return ate.substr(i);
   }

@@ -9,6 +9,7 @@
 
 #include "platform/simulated/simulated.h"
 #include "platform/text.h"
+#include "support/gravacao.h"
 #include "support/mod_Globais.h"
 
 using namespace platform::simulated;
@@ -56,22 +57,41 @@ inline std::string TextosDe(const platform::Window& janela) {
   return textos;
 }
 
-// On a fresh machine each time: prepares, runs the operation with the n-th platform call failing, and looks at what is
-// left; n = 1, 2, 3 ... until no call is left to fail, which is the last look. The returned number of faults tells that
-// there were some.
+// Once the hour is over in which another program may still be writing: deletes what was left half written in these
+// directories, and says what is left all the same.
+inline Textos Restos(const Textos& diretorios) {
+  PassTime(3601);
+  for (const std::string& diretorio : diretorios) ApagarRestos(diretorio);
+  Textos restos = AllFiles();
+  std::erase_if(restos, [](const std::string& arquivo) { return !arquivo.ends_with(".novo~"); });
+  return restos;
+}
+
+// On a fresh machine each time: prepares, runs the operation with the n-th platform call failing in this way, and looks
+// at what is left; n = 1, 2, 3 ... until no call is left to fail, which is the last look. The returned number of faults
+// tells that there were some.
 template <typename Preparar, typename Operar, typename Conferir>
-int ComCadaFalha(Preparar preparar, Operar operar, Conferir conferir) {
+int ComCadaFalha(Fault falha, Preparar preparar, Operar operar, Conferir conferir) {
   for (int n = 1; n < 1000; ++n) {
     Maquina::Reiniciar();
     preparar();
-    FailCall(n);
+    FailCall(n, falha);
     operar();
     const bool falhou = CallFailed();
     FailCall(0);
-    SCOPED_TRACE(testing::Message() << "platform call " << n << (falhou ? " failed" : " does not exist"));
+    constexpr const char* como[] = {" failed", " and all later ones failed", " met a power cut"};
+    SCOPED_TRACE(testing::Message() << "platform call " << n << (falhou ? como[static_cast<int>(falha)] : " is none"));
     conferir();
     if (!falhou || testing::Test::HasFatalFailure()) return n - 1;
   }
   ADD_FAILURE() << "the faults never end";
   return 0;
+}
+
+// The same with each kind of failure; the number of those that failed once.
+template <typename Preparar, typename Operar, typename Conferir>
+int ComCadaFalha(Preparar preparar, Operar operar, Conferir conferir) {
+  ComCadaFalha(Fault::FromThenOn, preparar, operar, conferir);
+  ComCadaFalha(Fault::PowerCut, preparar, operar, conferir);
+  return ComCadaFalha(Fault::Once, preparar, operar, conferir);
 }

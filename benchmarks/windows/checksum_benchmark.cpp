@@ -26,7 +26,7 @@ bool WriteRom() {
   std::string rom(Length, '\0');
   std::uint32_t state = 1;
   for (char& byte : rom) byte = static_cast<char>((state = state * 1'664'525 + 1'013'904'223) >> 24);
-  return platform::File(Path(), platform::Access::ReplaceContent).Write(0, rom);
+  return platform::File(Path(), platform::Access::ReadWrite).Write(0, rom);
 }
 
 bool OnlyRead() {

@@ -45,7 +45,7 @@ Answer MessageBoxA(const std::string&, const std::string& title, Buttons, Icon) 
 namespace {
 
 bool Write(const std::string& path, std::string_view content) {
-  return platform::File(path, platform::Access::ReplaceContent).Write(0, content);
+  return platform::File(path, platform::Access::ReadWrite).Write(0, content);
 }
 
 std::string Bytes(std::size_t length) {
@@ -69,7 +69,7 @@ bool Copy(const std::string& to, bool flush, std::vector<double>& times) {
   platform::File source(package, platform::Access::Read);
   std::string bytes(static_cast<std::size_t>(source.Size()), '\0');
   bool done = source.Read(0, bytes.data(), bytes.size()) == static_cast<std::int64_t>(bytes.size());
-  platform::File target(to, platform::Access::ReplaceContent);
+  platform::File target(to, platform::Access::ReadWrite);
   done = target.Write(0, bytes) && done && (!flush || target.Flush());
   source.Close();
   target.Close();

@@ -98,8 +98,11 @@ bool Descend(Place& place, const std::string& part) {
   return true;
 }
 
+// Before the content changes.
 void Remember(Entry& file) {
   if (!file.NeverFlushed && !file.Before) file.Before = file.Content;
+  file.Attributes |= AttributeArchive;
+  file.Changed = TheMachine().Clock;
 }
 
 }  // namespace
@@ -151,6 +154,7 @@ std::shared_ptr<Entry> CreateEntry(Place& place, std::uint32_t attributes) {
   auto entry = std::make_shared<Entry>();
   entry->Attributes = attributes;
   entry->NeverFlushed = true;
+  entry->Changed = TheMachine().Clock;
   Attach(place, entry);
   return entry;
 }
@@ -167,7 +171,6 @@ std::size_t Store(Disk& disk, Entry& file, std::uint64_t position, std::string_v
     file.Content.resize(static_cast<std::size_t>(position) + fitting);
   }
   file.Content.replace(static_cast<std::size_t>(position), fitting, bytes.substr(0, fitting));
-  file.Attributes |= AttributeArchive;
   return fitting;
 }
 
@@ -177,18 +180,12 @@ bool Resize(Disk& disk, Entry& file, std::uint64_t length) {
   Remember(file);
   disk.Used = disk.Used - file.Content.size() + length;
   file.Content.resize(static_cast<std::size_t>(length));
-  file.Attributes |= AttributeArchive;
   return true;
 }
 
 void MarkFlushed(Entry& file) {
   file.Before.reset();
   file.NeverFlushed = false;
-}
-
-void MarkUnflushed(Entry& file) {
-  file.Before.reset();
-  file.NeverFlushed = true;
 }
 
 void CountWrite(const std::string& path) {

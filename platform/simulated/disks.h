@@ -19,6 +19,8 @@ struct Entry {
   std::optional<std::string> Before;  // what stands on the disk itself, where it differs from the content
   bool NeverFlushed = false;          // nothing of the content is sure to stand on the disk itself
   bool Locked = false;
+  bool TakesNoFiles = false;  // a directory in which nothing can be created
+  std::uint64_t Changed = 0;  // when the content was, in seconds of the machine's clock
   int TimesOpen = 0;
   std::map<std::string, std::shared_ptr<Entry>> Entries;  // of a directory, by name in upper case
   std::map<std::string, std::string> ShortNames;          // of its entries, to the names in upper case
@@ -38,7 +40,7 @@ struct OpenFile {
   std::shared_ptr<Disk> Where;
   std::shared_ptr<Entry> Target;
   std::string Path;
-  bool Readable = false, Writable = false;
+  bool Writable = false;
 };
 
 // Where a path leads: into a directory that exists.
@@ -67,9 +69,8 @@ std::size_t Store(Disk& disk, Entry& file, std::uint64_t position, std::string_v
 // Cuts or extends with zero bytes; false, and nothing changed, without the room.
 bool Resize(Disk& disk, Entry& file, std::uint64_t length);
 
-// What is in the file now counts as written to the disk itself; as not written there at all.
+// What is in the file now counts as written to the disk itself.
 void MarkFlushed(Entry& file);
-void MarkUnflushed(Entry& file);
 
 // Counts a change of the content of the file at this full path.
 void CountWrite(const std::string& path);

@@ -90,6 +90,7 @@ void PutFile(const std::string& path, std::string_view content, std::uint32_t at
   auto entry = std::make_shared<Entry>();
   entry->Content = content;
   entry->Attributes = attributes & ~AttributeNormal;
+  entry->Changed = TheMachine().Clock;
   Attach(place, std::move(entry));
 }
 
@@ -139,8 +140,17 @@ std::uint64_t WritesEver() { return TheMachine().WritesEver; }
 
 std::size_t OpenFiles() { return TheMachine().OpenFiles.size(); }
 
+void TakeNoNewFiles(const std::string& directory) { Demand(directory).Found->TakesNoFiles = true; }
+
+void PassTime(std::uint64_t seconds) { TheMachine().Clock += seconds; }
+
+void SetAge(const std::string& path, std::uint64_t seconds) {
+  Demand(path).Found->Changed = TheMachine().Clock - seconds;
+}
+
 void CutPower() {
   TheMachine().OpenFiles.clear();
+  TheMachine().StartTime = ++TheMachine().Clock;
   for (const auto& [letter, disk] : TheMachine().Disks) disk->Used = Settle(*disk->Root);
 }
 

@@ -23,17 +23,10 @@ OpenFile* Opened(std::intptr_t handle) {
 
 bool MayOpen(const Place& place, Access access) {
   if (place.EndsWithBackslash) return false;
-  if (!place.Found) return access != Access::Read && place.Folder;
+  if (!place.Found) return access != Access::Read && place.Folder && !place.Folder->TakesNoFiles;
+  if (access == Access::CreateNew) return false;
   if (place.Found->IsDirectory() || place.Found->Locked) return false;
   return access == Access::Read || (place.Found->Attributes & AttributeReadOnly) == 0;
-}
-
-// The old content is gone from the disk at once, whatever becomes of the new one.
-void Empty(const Place& place) {
-  if (place.Found->Content.empty()) return;
-  simulated::CountWrite(place.Path);
-  simulated::Resize(*place.Where, *place.Found, 0);
-  simulated::MarkUnflushed(*place.Found);
 }
 
 }  // namespace
@@ -43,11 +36,9 @@ File::File(const std::string& path, Access access) {
   std::optional<Place> place = simulated::Locate(path);
   if (fault || !place || !MayOpen(*place, access)) return;
   if (!place->Found) simulated::CreateEntry(*place, AttributeArchive);
-  if (access == Access::ReplaceContent) Empty(*place);
   ++place->Found->TimesOpen;
   handle_ = ++TheMachine().LastHandle;
-  TheMachine().OpenFiles[handle_] = {place->Where, place->Found, place->Path, access != Access::ReplaceContent,
-                                     access != Access::Read};
+  TheMachine().OpenFiles[handle_] = {place->Where, place->Found, place->Path, access != Access::Read};
 }
 
 File::File(File&& other) noexcept : handle_(std::exchange(other.handle_, -1)) {}
@@ -79,7 +70,7 @@ std::int64_t File::Size() const {
 
 std::int64_t File::Read(std::int64_t position, void* buffer, std::size_t length) {
   const OpenFile* open = Opened(handle_);
-  if (!open || Fails() || !open->Readable || position < 0) return -1;
+  if (!open || Fails() || position < 0) return -1;
   const std::string& content = open->Target->Content;
   if (static_cast<std::uint64_t>(position) >= content.size()) return 0;
   return static_cast<std::int64_t>(
@@ -87,10 +78,9 @@ std::int64_t File::Read(std::int64_t position, void* buffer, std::size_t length)
 }
 
 bool File::Write(std::int64_t position, std::string_view bytes) {
+  const bool fault = Fails();  // may close all files
   OpenFile* open = Opened(handle_);
-  if (!open) return false;
-  const bool fault = Fails();
-  if (!open->Writable || position < 0) return false;
+  if (!open || !open->Writable || position < 0) return false;
   const std::string_view tried = bytes.substr(0, fault ? bytes.size() / 2 : bytes.size());
   const std::size_t stored = simulated::Store(*open->Where, *open->Target, static_cast<std::uint64_t>(position), tried);
   if (stored > 0) simulated::CountWrite(open->Path);
@@ -111,6 +101,14 @@ bool File::Flush() {
   OpenFile* open = Opened(handle_);
   if (!open || Fails() || !open->Writable) return false;
   simulated::MarkFlushed(*open->Target);
+  return true;
+}
+
+bool File::CopyInformation(const File& from) {
+  const OpenFile *open = Opened(handle_), *source = Opened(from.handle_);
+  if (!open || !source || Fails() || !open->Writable) return false;
+  open->Target->Attributes = source->Target->Attributes & ~AttributeReadOnly;
+  open->Target->Changed = source->Target->Changed;
   return true;
 }
 

@@ -15,13 +15,16 @@ Machine& TheMachine() {
 
 bool Fails() {
   Machine& machine = TheMachine();
+  if (machine.FaultReached && machine.NextFault != Fault::Once) return true;
   if (machine.CallsUntilFault == 0 || --machine.CallsUntilFault > 0) return false;
   machine.FaultReached = true;
+  if (machine.NextFault == Fault::PowerCut) CutPower();
   return true;
 }
 
-void FailCall(int n) {
+void FailCall(int n, Fault fault) {
   TheMachine().CallsUntilFault = n;
+  TheMachine().NextFault = fault;
   TheMachine().FaultReached = false;
 }
 

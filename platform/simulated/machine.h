@@ -62,12 +62,14 @@ struct Machine {
   std::map<std::intptr_t, OpenFile> OpenFiles;
   std::map<std::string, std::uint64_t> Writes;  // by full path in upper case
   std::uint64_t WritesEver = 0;
+  std::uint64_t Clock = 1'000'000, StartTime = 0;  // seconds: now, and when the machine was started
 
   std::map<std::string, RegistryRecord> Registry;  // by full path in upper case
   std::set<std::string> DeniedKeys;
   std::map<std::intptr_t, RegistryHandle> RegistryHandles;
 
   int CallsUntilFault = 0;
+  Fault NextFault = Fault::Once;
   bool FaultReached = false;
 
   std::vector<StartedProcess> Started;
@@ -97,7 +99,7 @@ struct Machine {
 
 Machine& TheMachine();
 
-// Counts a call that can fail; true when it is the one that is to fail.
+// Counts a call that can fail; true when it is to fail.
 bool Fails();
 
 }  // namespace platform::simulated

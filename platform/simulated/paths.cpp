@@ -22,10 +22,15 @@ bool IsFile(const std::optional<Place>& place) {
   return place && place->Found && !place->Found->IsDirectory() && !place->EndsWithBackslash;
 }
 
+bool MayDelete(const std::optional<Place>& place) {
+  return IsFile(place) && !InUse(*place->Found) && (place->Found->Attributes & AttributeReadOnly) == 0;
+}
+
 // Whether another file may take this place.
-bool MayReplace(const std::optional<Place>& place, std::uint32_t protecting) {
+bool MayTake(const std::optional<Place>& place, Existing existing) {
   if (!place || !place->Folder || place->EndsWithBackslash) return false;
-  return !place->Found || (IsFile(place) && !InUse(*place->Found) && (place->Found->Attributes & protecting) == 0);
+  if (!place->Found) return !place->Folder->TakesNoFiles;
+  return existing == Existing::Replace && MayDelete(place);
 }
 
 std::uint32_t Clusters(std::uint64_t bytes) {
@@ -51,43 +56,33 @@ std::optional<std::int64_t> FileSize(const std::string& path) {
 bool DeleteFileA(const std::string& path) {
   const bool fault = Fails();
   std::optional<Place> place = Locate(path);
-  if (fault || !IsFile(place) || InUse(*place->Found) || (place->Found->Attributes & AttributeReadOnly) != 0) {
-    return false;
-  }
+  if (fault || !MayDelete(place)) return false;
+  simulated::Detach(*place);
+  return true;
+}
+
+bool DeleteAbandonedFile(const std::string& path, std::uint32_t seconds) {
+  const bool fault = Fails();
+  std::optional<Place> place = Locate(path);
+  if (fault || !MayDelete(place)) return false;
+  const std::uint64_t changed = place->Found->Changed;
+  if (changed >= TheMachine().StartTime && changed + seconds >= TheMachine().Clock) return false;
   simulated::Detach(*place);
   return true;
 }
 
 // The new name is on the disk at once; contents that were not flushed are no safer under it.
-bool MoveFileExA(const std::string& from, const std::string& to) {
+bool MoveFileExA(const std::string& from, const std::string& to, Existing existing) {
   const bool fault = Fails();
   std::optional<Place> source = Locate(from), target = Locate(to);
   if (fault || !IsFile(source) || InUse(*source->Found) || !target || target->Where != source->Where) return false;
   const bool same = target->Found == source->Found;
-  if (!same && !MayReplace(target, AttributeReadOnly)) return false;
+  if (!same && !MayTake(target, existing)) return false;
   const std::shared_ptr<Entry> moved = source->Found;
   simulated::Detach(*source);
   if (target->Found && !same) simulated::Detach(*target);
   simulated::Attach(*target, moved);
   simulated::CountWrite(target->Path);
-  return true;
-}
-
-bool CopyFileA(const std::string& from, const std::string& to) {
-  const bool fault = Fails();
-  const std::optional<Place> source = Locate(from);
-  std::optional<Place> target = Locate(to);
-  if (!IsFile(source) || source->Found->Locked || !MayReplace(target, AttributeReadOnly | AttributeHidden))
-    return false;
-  if (target->Found == source->Found) return false;
-  if (target->Found) simulated::Detach(*target);
-  const std::string_view content = source->Found->Content;
-  Entry& copy = *simulated::CreateEntry(*target, source->Found->Attributes | AttributeArchive);
-  simulated::CountWrite(target->Path);
-  const std::size_t tried = fault ? content.size() / 2 : content.size();
-  const std::size_t stored = simulated::Store(*target->Where, copy, 0, content.substr(0, tried));
-  if (fault || stored < content.size()) return false;
-  simulated::MarkFlushed(copy);
   return true;
 }
 

@@ -42,7 +42,11 @@ std::uint64_t WritesEver();                         // all files together
 
 std::size_t OpenFiles();  // how many the program holds open
 
-// Contents that were not flushed to the disk (by File::Flush, or as CopyFileA's whole copy) are as they were before;
+void TakeNoNewFiles(const std::string& directory);  // nothing can be created there; what is there can be written
+void PassTime(std::uint64_t seconds);               // of the clock that tells when files were changed
+void SetAge(const std::string& path, std::uint64_t seconds);  // since the file's last change
+
+// The machine is started anew. Contents that were not flushed to the disk (by File::Flush) are as they were before;
 // open files are closed. A file that was created or emptied but never flushed since is half written. Names are always
 // on the disk: what was deleted is gone, and what was renamed has its new name, with whatever content was flushed.
 void CutPower();
@@ -63,9 +67,15 @@ std::size_t OpenRegistryHandles();                         // that the program h
 
 // --- Faults.
 
+enum class Fault {
+  Once,
+  FromThenOn,  // all later calls fail as well
+  PowerCut     // the power goes before the call does anything, and all later calls fail
+};
+
 // The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry, initialisation files,
-// pictures and processes. Writes and copies that fail have written half of their bytes. 0: none. Reset by Reset().
-void FailCall(int n);
+// pictures and processes. A write that fails has written half of its bytes. 0: none. Reset by Reset().
+void FailCall(int n, Fault fault = Fault::Once);
 bool CallFailed();  // whether the fault has been reached
 
 // --- Other programs.

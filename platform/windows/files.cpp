@@ -22,11 +22,21 @@ OVERLAPPED At(std::int64_t position) {
 }
 
 HANDLE OpenFile(const std::string& path, Access access) {
-  const DWORD rights = access == Access::Read             ? GENERIC_READ
-                       : access == Access::ReplaceContent ? GENERIC_WRITE
-                                                          : GENERIC_READ | GENERIC_WRITE;
-  return ::CreateFileA(WindowsPath(path), rights, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
-                       access == Access::Read ? OPEN_EXISTING : OPEN_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
+  const DWORD rights = access == Access::Read ? GENERIC_READ : GENERIC_READ | GENERIC_WRITE;
+  const DWORD how = access == Access::Read ? OPEN_EXISTING : access == Access::CreateNew ? CREATE_NEW : OPEN_ALWAYS;
+  return ::CreateFileA(WindowsPath(path), rights, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr, how,
+                       FILE_ATTRIBUTE_NORMAL, nullptr);
+}
+
+std::uint64_t Number(const FILETIME& time) { return std::uint64_t{time.dwHighDateTime} << 32 | time.dwLowDateTime; }
+
+// In units of 100 nanoseconds, as the system counts its time.
+bool IsOld(const FILETIME& changed, std::uint32_t seconds) {
+  constexpr std::uint64_t millisecond = 10'000, second = 1'000 * millisecond;
+  FILETIME now = {};
+  ::GetSystemTimeAsFileTime(&now);
+  const std::uint64_t started = Number(now) - ::GetTickCount64() * millisecond;
+  return Number(changed) < started || Number(changed) + seconds * second < Number(now);
 }
 
 }  // namespace
@@ -35,9 +45,7 @@ File::File(const std::string& path, Access access) : handle_(reinterpret_cast<st
   if (!IsOpen()) return;
   // Names like "nul" and "com1" open a device, in every directory and with any extension: what is written there is
   // lost.
-  const bool device = ::GetFileType(Handle(handle_)) != FILE_TYPE_DISK;
-  // CREATE_ALWAYS would empty it too, but refuses hidden files.
-  if (device || (access == Access::ReplaceContent && !SetSize(0))) Close();
+  if (::GetFileType(Handle(handle_)) != FILE_TYPE_DISK) Close();
 }
 
 File::File(File&& other) noexcept : handle_(std::exchange(other.handle_, -1)) {}
@@ -102,6 +110,16 @@ bool File::SetSize(std::int64_t length) {
 
 bool File::Flush() { return IsOpen() && ::FlushFileBuffers(Handle(handle_)) != 0; }
 
+// A zero leaves a time as it is.
+bool File::CopyInformation(const File& from) {
+  FILE_BASIC_INFO source{}, target{};
+  if (!::GetFileInformationByHandleEx(Handle(from.handle_), FileBasicInfo, &source, sizeof source)) return false;
+  target.LastWriteTime = source.LastWriteTime;
+  target.FileAttributes = source.FileAttributes & ~DWORD{FILE_ATTRIBUTE_READONLY};
+  if (target.FileAttributes == 0) target.FileAttributes = FILE_ATTRIBUTE_NORMAL;
+  return ::SetFileInformationByHandle(Handle(handle_), FileBasicInfo, &target, sizeof target) != 0;
+}
+
 std::optional<std::uint32_t> GetFileAttributesA(const std::string& path) {
   const DWORD attributes = ::GetFileAttributesA(WindowsPath(path));
   if (attributes == INVALID_FILE_ATTRIBUTES) return std::nullopt;
@@ -117,16 +135,22 @@ std::optional<std::int64_t> FileSize(const std::string& path) {
 
 bool DeleteFileA(const std::string& path) { return ::DeleteFileA(WindowsPath(path)) != 0; }
 
-bool MoveFileExA(const std::string& from, const std::string& to) {
-  return ::MoveFileExA(WindowsPath(from), WindowsPath(to), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH) != 0;
+// Opened without sharing, it is nobody else's; deleted by its handle, it is no other file of that name.
+bool DeleteAbandonedFile(const std::string& path, std::uint32_t seconds) {
+  const HANDLE file = ::CreateFileA(WindowsPath(path), GENERIC_READ | DELETE, 0, nullptr, OPEN_EXISTING,
+                                    FILE_ATTRIBUTE_NORMAL, nullptr);
+  if (file == INVALID_HANDLE_VALUE) return false;
+  FILETIME changed = {};
+  FILE_DISPOSITION_INFO gone{TRUE};
+  const bool deleted = ::GetFileTime(file, nullptr, nullptr, &changed) && IsOld(changed, seconds) &&
+                       ::SetFileInformationByHandle(file, FileDispositionInfo, &gone, sizeof gone);
+  ::CloseHandle(file);
+  return deleted;
 }
 
-bool CopyFileA(const std::string& from, const std::string& to) {
-  if (!::CopyFileA(WindowsPath(from), WindowsPath(to), FALSE)) return false;
-  // Until here the copy may stand in the system's cache only, and a floppy is soon taken out of its drive. The copy of
-  // a read-only file cannot be opened for writing, as flushing demands; the system writes it in its own time.
-  File copy(to, Access::ReadWrite);
-  return !copy.IsOpen() || copy.Flush();
+bool MoveFileExA(const std::string& from, const std::string& to, Existing existing) {
+  const DWORD replace = existing == Existing::Replace ? MOVEFILE_REPLACE_EXISTING : 0;
+  return ::MoveFileExA(WindowsPath(from), WindowsPath(to), replace | MOVEFILE_WRITE_THROUGH) != 0;
 }
 
 bool CreateDirectoryA(const std::string& path) { return ::CreateDirectoryA(WindowsPath(path), nullptr) != 0; }

@@ -64,7 +64,7 @@ TEST_F(CatalogoDeJogos, RegistrarRomAppendsOneEntryInOneWriteWholeOrNotAtAll) {
   };
   const auto registrar = [&] { Catalogo.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
   const auto conferir = [&] { EXPECT_TRUE(Content(Arquivo) == velho || Content(Arquivo) == velho + entrada); };
-  EXPECT_GE(ComCadaFalha(preparar, registrar, conferir), 2);
+  EXPECT_GE(ComCadaFalha(Fault::Once, preparar, registrar, conferir), 2);
   const auto escritas = WriteCount(Arquivo);
   registrar();
   EXPECT_EQ(WriteCount(Arquivo), escritas + 1);

@@ -22,7 +22,9 @@ TEST_F(Files, OpenAsTheAccessSays) {
                                                             {here_ + "nowhere\\x", Access::ReadWrite, false, "(none)"},
                                                             {here_, Access::Read, false, "(none)"},
                                                             {a_ + Zero, Access::ReadWrite, false, "(none)"},
-                                                            {a_, Access::ReplaceContent, true, ""}};
+                                                            {a_, Access::CreateNew, false, "0123456789"},
+                                                            {here_ + "new2", Access::CreateNew, true, ""},
+                                                            {here_, Access::CreateNew, false, "(none)"}};
   for (const auto& [path, access, opens, after] : cases) {
     File file(path, access), moved = std::move(file);
     EXPECT_EQ(moved.IsOpen() && moved.Size() >= 0, opens) << path;
@@ -33,7 +35,7 @@ TEST_F(Files, OpenAsTheAccessSays) {
     EXPECT_EQ(Content(path), after) << path;
   }
   SetAttributes(a_, AttributeReadOnly);
-  for (const Access how : {Access::ReadWrite, Access::ReplaceContent}) EXPECT_EQ(File(a_, how).IsOpen(), IsWine());
+  EXPECT_EQ(File(a_, Access::ReadWrite).IsOpen(), IsWine());
   Put(b_, "hidden");
   SetAttributes(b_, AttributeHidden);
   Put(b_, "new");
@@ -57,7 +59,8 @@ TEST_F(Files, BytePositionsAndSizesAreExact) {
   EXPECT_TRUE(file.SetSize(2) && file.SetSize(4) && file.Flush());
   EXPECT_EQ(Content(a_), string("\0\r\0\0", 4));
   Put(b_, "b");
-  EXPECT_FALSE(DeleteFileA(a_) || MoveFileExA(a_, missing_) || MoveFileExA(b_, a_));  // as it is open
+  EXPECT_FALSE(DeleteFileA(a_) || DeleteAbandonedFile(a_, 0) || MoveFileExA(a_, missing_, Existing::Keep) ||
+               MoveFileExA(b_, a_, Existing::Replace));  // as it is open
 }
 
 TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
@@ -85,31 +88,55 @@ TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
   EXPECT_EQ(Content(a_) + Content(b_), "12345(none)");
 }
 
-// What becomes of the file b ("old") when the read-only file a ("new") gets its place, by moving and by copying.
-TEST_F(Files, MoveAndCopyReplace) {
-  const std::tuple<std::uint32_t, string, string, bool> cases[] = {{0, a_, b_, true},  // there is no b
-                                                                   {AttributeArchive, a_, b_, true},
-                                                                   {AttributeReadOnly, a_, b_, false},
-                                                                   {AttributeArchive, missing_, b_, false},
-                                                                   {AttributeArchive, a_, here_ + "nowhere\\x", false},
-                                                                   {AttributeArchive, a_, b_ + Zero, false}};
-  for (const bool copy : {false, true}) {
-    for (const auto& [attributes, from, to, succeeds] : cases) {
-      if (attributes == AttributeReadOnly && IsWine()) continue;
-      SCOPED_TRACE((copy ? "copy " : "move ") + from + " to " + to);
-      for (const string& left : {a_, b_}) SetAttributes(left, AttributeNormal), DeleteFileA(left);
-      Put(a_, "new");
-      if (attributes != 0) Put(b_, "old");
-      SetAttributes(a_, AttributeReadOnly);
-      SetAttributes(b_, attributes);
-      EXPECT_EQ((copy ? CopyFileA : MoveFileExA)(from, to), succeeds);
-      EXPECT_EQ(Content(b_), succeeds ? "new" : "old");
-      EXPECT_EQ(Content(a_), succeeds && !copy ? "(none)" : "new");
-      EXPECT_TRUE(attributes != 0 || GetFileAttributesA(b_).value_or(0) & AttributeReadOnly);  // the source's
-      EXPECT_EQ(ListDirectory(here_, "*").size(), succeeds && !copy ? 1u : 2u);
-    }
+// What becomes of the file b ("old") when the read-only file a ("new") gets its name.
+TEST_F(Files, MoveReplacesOrKeeps) {
+  const struct {
+    const char* Name;
+    std::uint32_t Attributes;  // of b; 0: there is none
+    string From, To;
+    Existing Wish;
+    bool Succeeds;
+  } cases[] = {{"no b", 0, a_, b_, Existing::Replace, true},
+               {"no b to keep", 0, a_, b_, Existing::Keep, true},
+               {"replaced", AttributeArchive, a_, b_, Existing::Replace, true},
+               {"kept", AttributeArchive, a_, b_, Existing::Keep, false},
+               {"read-only", AttributeReadOnly, a_, b_, Existing::Replace, false},
+               {"no source", AttributeArchive, missing_, b_, Existing::Replace, false},
+               {"no directory", AttributeArchive, a_, here_ + "nowhere\\x", Existing::Replace, false},
+               {"a path that names nothing", AttributeArchive, a_, b_ + Zero, Existing::Replace, false}};
+  for (const auto& each : cases) {
+    if (each.Attributes == AttributeReadOnly && IsWine()) continue;
+    SCOPED_TRACE(each.Name);
+    for (const string& left : {a_, b_}) SetAttributes(left, AttributeNormal), DeleteFileA(left);
+    Put(a_, "new");
+    if (each.Attributes != 0) Put(b_, "old");
+    SetAttributes(a_, AttributeReadOnly);
+    SetAttributes(b_, each.Attributes);
+    EXPECT_EQ(MoveFileExA(each.From, each.To, each.Wish), each.Succeeds);
+    EXPECT_EQ(Content(b_), each.Succeeds ? "new" : "old");
+    EXPECT_EQ(Content(a_), each.Succeeds ? "(none)" : "new");
+    EXPECT_EQ(ListDirectory(here_, "*").size(), each.Succeeds ? 1u : 2u);
   }
-  EXPECT_TRUE(MoveFileExA(b_, here_ + "B.smc"));  // onto itself
+  Put(b_, "last");
+  EXPECT_TRUE(MoveFileExA(b_, here_ + "B.smc", Existing::Replace));  // onto itself
+}
+
+TEST_F(Files, AreAbandonedOnceTheyAreOldAndNobodyHasThemOpen) {
+  Put(a_, "source");
+  Put(b_, "copy");
+  SetAge(a_, 30);
+  EXPECT_FALSE(DeleteAbandonedFile(a_, 60)) << "younger than that";
+  SetAge(a_, 90);
+  SetAttributes(a_, AttributeReadOnly | AttributeArchive);
+  {
+    File source(a_, Access::Read), copy(b_, Access::ReadWrite);
+    EXPECT_TRUE(copy.CopyInformation(source));
+    EXPECT_FALSE(DeleteAbandonedFile(b_, 60)) << "open, and as old as its source";
+  }
+  EXPECT_EQ(GetFileAttributesA(b_).value_or(0) & AttributeReadOnly, 0u);
+  EXPECT_TRUE(DeleteAbandonedFile(b_, 60));
+  for (const string& none : {b_, missing_, here_, a_ + Zero}) EXPECT_FALSE(DeleteAbandonedFile(none, 0)) << none;
+  EXPECT_EQ(Content(a_) + Content(b_), "source(none)");
 }
 
 TEST_F(Files, DisksTellTheirSpaceAndTakeADirectoryWhenTheyAreThere) {

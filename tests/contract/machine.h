@@ -26,7 +26,8 @@ class Machine : public testing::Test {
 };
 
 inline void Put(const string& path, std::string_view content = "") {
-  ASSERT_TRUE(File(path, Access::ReplaceContent).Write(0, content)) << path;
+  File file(path, Access::ReadWrite);
+  ASSERT_TRUE(file.SetSize(0) && file.Write(0, content)) << path;
 }
 
 // What the file holds, or "(none)".
@@ -39,6 +40,7 @@ inline string Content(const string& path) {
 }
 
 void SetAttributes(const string& path, std::uint32_t attributes);
+void SetAge(const string& path, unsigned seconds);             // since the file was changed last
 void SetEnvironment(const string& name, const string& value);  // of this program, until its end
 
 // Wine lets read-only files be replaced, and root also write to them.

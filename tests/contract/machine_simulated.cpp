@@ -11,6 +11,7 @@ Machine::Machine() : here_("C:\\Pasta de teste\\") {
 Machine::~Machine() { simulated::Reset(); }
 
 void SetAttributes(const string& path, std::uint32_t attributes) { simulated::SetAttributes(path, attributes); }
+void SetAge(const string& path, unsigned seconds) { simulated::SetAge(path, seconds); }
 void SetEnvironment(const string& name, const string& value) { simulated::SetEnvironment(name, value); }
 bool IsWine() { return false; }
 

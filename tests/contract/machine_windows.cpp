@@ -17,6 +17,18 @@ Machine::Machine() : here_(ProgramDirectory() + "\\Pasta de teste\\") {
 Machine::~Machine() { ::RegDeleteTreeA(HKEY_CURRENT_USER, Key); }
 
 void SetAttributes(const string& path, std::uint32_t attributes) { ::SetFileAttributesA(path.c_str(), attributes); }
+
+void SetAge(const string& path, unsigned seconds) {
+  FILETIME now = {};
+  ::GetSystemTimeAsFileTime(&now);
+  const ULONGLONG then = (ULONGLONG{now.dwHighDateTime} << 32 | now.dwLowDateTime) - seconds * 10'000'000ULL;
+  const FILETIME changed = {static_cast<DWORD>(then), static_cast<DWORD>(then >> 32)};
+  const HANDLE file =
+      ::CreateFileA(path.c_str(), FILE_WRITE_ATTRIBUTES, FILE_SHARE_READ, nullptr, OPEN_EXISTING, 0, nullptr);
+  EXPECT_TRUE(::SetFileTime(file, nullptr, nullptr, &changed)) << path;
+  ::CloseHandle(file);
+}
+
 void SetEnvironment(const string& name, const string& value) { ::SetEnvironmentVariableA(name.c_str(), value.c_str()); }
 bool IsWine() { return ::GetProcAddress(::GetModuleHandleA("ntdll.dll"), "wine_get_version") != nullptr; }
 

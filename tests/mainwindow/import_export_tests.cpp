@@ -17,30 +17,40 @@ const std::string WithoutChecksum(1048576, 'x');  // a length that has none
 // What happens before the command is given.
 using Before = std::function<void()>;
 const Before Nothing = [] {}, Yes = [] { QueueAnswer(Answer::Yes); }, No = [] { QueueAnswer(Answer::No); };
-const Before FullDisk = [] {  // and the user says yes
-  Yes();
-  SetFreeSpace('C', 3);
-};
 
 Before Locked(const std::string& path) {
   return [path] { LockFile(path); };
 }
 
-// As if the disk held something else than what was written.
+// As if the disk held something else than what was written beside a file.
 void AlterOnceWritten(const std::string& path) {
-  if (Content(path)) return PutFile(path, "other");
+  for (const std::string& each : AllFiles()) {
+    if (each.starts_with(path + ".")) return PutFile(each, "other");
+  }
   QueueEvent([path] { AlterOnceWritten(path); });
+}
+
+Before Room(std::uint64_t bytes) {  // and the user says yes
+  return [bytes] {
+    Yes();
+    SetFreeSpace('C', bytes);
+  };
 }
 
 struct Import : Menu {};
 
 TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   const Before altered = [] { AlterOnceWritten(Roms + "NOVO.zip"); };
+  const Before alteredOld = [] { Yes(), AlterOnceWritten(Roms + "SUPERJOG.zip"); };
+  const Before inPlace = [] { Yes(), TakeNoNewFiles(Roms), TakeNoNewFiles(Imgs); };
+  const std::string whole = Package("Super Jogo", "SUPERJOG", "new");  // its picture begins at byte 104
   const Files package = {{Roms + "ação.zip"_ansi, Rom},
                          {Imgs + "Ação=Jogo.gif"_ansi, "figura"},
                          {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||AÇÃO=Ação=Jogo|"_ansi}};
   const Files replaced = {{Roms + "SUPERJOG.zip", Rom}, {Imgs + "Super Jogo.gif", "new"}};
-  const Files unchecked = {{Roms + "LONGO.zip", WithoutChecksum}, {Imgs + "Longo.gif", "figura"}};
+  const Files renamed = {{Roms + "SUPERJOG.zip", Rom},
+                         {Imgs + "Outro.gif", "new"},
+                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||SUPERJOG=Outro|"}};
   const struct {
     std::string Path, Content;
     Textos Shown;
@@ -59,13 +69,23 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
       {"D:\\x.txt", "x", {}},
       {"D:\\nada.tvk", "no package", {ReadError}},
       {"D:\\soma.tvk", Package("Novo", "NOVO", "figura", "123456788"), {Corrupt}},
-      {"D:\\curto.tvk", Package("Novo", "NOVO").substr(0, 108), {Corrupt}},
+      {"D:\\curto.tvk", Package("Novo", "NOVO").substr(0, 105), {Corrupt}},
       {"D:\\disco.tvk", Package("Novo", "NOVO"), {Corrupt}, "", {}, altered},
+      {"D:\\disco.tvk", whole, {ReplaceGame, Corrupt}, "", {}, alteredOld},
+      {"D:\\rom cortada.tvk", whole.substr(0, 115), {ReplaceGame, Corrupt}, "", {}, Yes},
+      {"D:\\fim da figura.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, "", {}, Yes},
+      {"D:\\figura cortada.tvk", whole.substr(0, 105), {ReplaceGame, ReadError}, "", {}, Yes},
+      {"D:\\so o cabecalho.tvk", whole.substr(0, 104), {ReplaceGame, ReadError}, "", {}, Yes},
       {"D:\\figura.tvk", Package("No|vo", "NOVO"), {ReadError}},  // the picture cannot have this name: nor the ROM
-      {"D:\\rom.tvk", Package("Novo", "NO|VO"), {ReadError}, "", {{Imgs + "Novo.gif", "figura"}}},
-      {"D:\\longo.tvk", Package("Longo", "LONGO", "figura", WithoutChecksum), {ReadError}, "", unchecked},
-      {"D:\\SUPERJOG.zip", "longer than it was", {WriteError}, "", {}, FullDisk},
-      {"D:\\novo.smc", "rom of a new game", {WriteError}, "", {}, FullDisk},
+      {"D:\\rom.tvk", Package("Novo", "NO|VO"), {ReadError}},
+      {"D:\\longo.tvk", Package("Longo", "LONGO", "figura", WithoutChecksum), {ReadError}},
+      {"D:\\SUPERJOG.zip", "longer than it was", {WriteError}, "", {}, Room(3)},
+      {"D:\\novo.smc", "rom of a new game", {WriteError}, "", {}, Room(3)},
+      {"D:\\so a figura cabe.tvk", whole, {ReplaceGame, ReadError}, "", {}, Room(5)},
+      {"D:\\no lugar.tvk", whole, {ReplaceGame, Added}, "Super Jogo", replaced, inPlace},
+      {"D:\\sem rom, no lugar.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, "", {}, inPlace},
+      {"D:\\outro.tvk", Package("Outro", "SUPERJOG", "new"), {ReplaceGame}, "", {}, No},
+      {"D:\\outro.tvk", Package("Outro", "SUPERJOG", "new"), {ReplaceGame, Added}, "", renamed, Yes},
       {"D:\\v.tvk", Package("SUPER jogo", "SUPERJOG", "new"), {ReplaceGame}, "", {}, No},
       {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new", "987654321"), {ReplaceGame, Corrupt}, "", {}, Yes},
       {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new"), {ReplaceGame, Added}, "Super Jogo", replaced, Yes},
@@ -89,6 +109,16 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
     const auto& asked = ShownFileDialogs().back();
     EXPECT_EQ(asked.Title + asked.Filter, "Adicionar...Arquivos suportados\0*.zip;*.smc;*.tvk\0"s);
   }
+}
+
+// Only another ROM is asked about.
+TEST_F(Import, OfAPackageWithTheRomThatIsThereAlreadyAsksNothing) {
+  PutFile(Roms + "UM.zip", Rom);
+  PutFile("C:\\novo.tvk", Package("Novo", "UM"));
+  ASSERT_TRUE(Start());
+  ChooseFile(form->Command4, "C:\\novo.tvk");
+  EXPECT_EQ(Mensagens(), Textos{Added});
+  EXPECT_EQ(Selected(), "Novo");
 }
 
 struct Export : Menu {};
@@ -115,8 +145,8 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
       {"Super Jogo", both, "C:\\old.zip", {ReplaceFile}, "old", No},
       {"Super Jogo", both, "C:\\old.zip", {ReplaceFile, Saved}, Rom, Yes},
       {"Super Jogo", both, "Q:\\x.zip", {WriteError}, {}},
-      {"Super Jogo", both, "C:\\x.zip", {WriteError}, {}, FullDisk},
-      {"Super Jogo", both, "C:\\old.tvk", {ReplaceFile, WriteError}, "old", FullDisk},
+      {"Super Jogo", both, "C:\\x.zip", {WriteError}, {}, Room(3)},
+      {"Super Jogo", both, "C:\\old.tvk", {ReplaceFile, WriteError}, "old", Room(3)},
       {"Super Jogo", both, "C:\\x.zip", {ReadError}, {}, Locked(rom)},
       {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(rom)},
       {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(picture)},
@@ -139,6 +169,17 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     EXPECT_EQ(asked.DefaultExtension + asked.Filter, each.Offered);
     EXPECT_EQ(asked.Title + asked.File.substr(0, each.Name.size() + 1), "Salvar como..." + each.Name + " ");
   }
+}
+
+TEST_F(Export, TakesAwayWhatAnEarlierOneToThatDirectoryHasLeftHalfWritten) {
+  PutFile("C:\\x.zip.0f3a99c2.novo~", "half");
+  PutFile("C:\\Outros\\x.zip.0f3a99c2.novo~", "half");
+  PassTime(3601);
+  StartAndPick("Super Jogo");
+  ChooseFile(form->Command5, "C:\\novo.zip");
+  EXPECT_EQ(Content("C:\\novo.zip"), Rom);
+  EXPECT_FALSE(Content("C:\\x.zip.0f3a99c2.novo~"));
+  EXPECT_TRUE(Content("C:\\Outros\\x.zip.0f3a99c2.novo~"));
 }
 
 }  // namespace

@@ -38,12 +38,27 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   EXPECT_EQ(WriteCount(EmulatorConfig), writes);  // nothing to change, nothing written
 
   const std::string fresh = "\r\nSaveDirectory = C:\\Tolvaris\\Saves\r\nGameDirectory = C:\\Tolvaris\\Roms\r\n";
-  for (const auto& [before, attributes, after] : {std::tuple("", 0x20U, fresh), {"read-only", 0x21U, "read-only"}}) {
-    PutFile(EmulatorConfig, before, attributes);
+  const struct {
+    const char* Name;
+    std::function<void()> Spoil;
+    std::string After;
+  } configurations[] = {
+      {"empty", [] { PutFile(EmulatorConfig, ""); }, fresh},
+      {"missing", [] { RemoveFile(EmulatorConfig); }, fresh},
+      {"read-only", [] { PutFile(EmulatorConfig, "x", 0x21); }, "x"},
+      {"there, but nobody can read it",
+       [] {
+         PutFile(EmulatorConfig, "x");
+         LockFile(EmulatorConfig);
+       },
+       "x"},
+  };
+  for (const auto& [name, spoil, after] : configurations) {
+    spoil();
     Click(form->Command1);
-    EXPECT_EQ(Content(EmulatorConfig), after);
+    EXPECT_EQ(Content(EmulatorConfig), after) << name;
   }
-  EXPECT_EQ(StartedProcesses().size(), 5U);
+  EXPECT_EQ(StartedProcesses().size(), 7U);
   EXPECT_EQ(Mensagens(), Textos{});
   EXPECT_FALSE(form->Form_Load()) << "loaded again once a game was started, the window closes";
   EXPECT_TRUE(form->IsClosed());
@@ -117,10 +132,11 @@ TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBac
 
   PutFile(Downloader, "no program");
   RefuseToStart(Downloader);
+  Pick("Sem figura");
   Click(form->Command3);
   EXPECT_TRUE(form->Enabled() && !form->Timer1.Enabled());
   EXPECT_EQ(form->Caption(), "Tolvaris");
-  EXPECT_EQ(Selected(), "Super Jogo");
+  EXPECT_EQ(Selected(), "Sem figura") << "what was selected before";
   EXPECT_EQ(States(), GameSelected);
 }
 

@@ -1,4 +1,5 @@
 #include "mainwindow/ajustes.h"
+#include "support/mod_Configuracao.h"
 #include "tests/mainwindow/menu.h"
 
 namespace {
@@ -36,6 +37,26 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   EXPECT_EQ((Textos{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
             (Textos{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
   EXPECT_TRUE(DirectoryStands(DirRoms) && DirectoryStands(DirImgs));
+}
+
+TEST_F(Startup, DefaultsInANetworkDirectoryAreWhereTheProgramIs) {
+  DirPrograma = "\\\\casa\\jogos\\";
+  LerCaminhos({});
+  EXPECT_EQ(DirRoms, "\\\\casa\\jogos\\Roms\\");
+  EXPECT_EQ(CaminhoConfigurado("\\Roms\\", "unused"), "\\\\casa\\jogos\\Roms\\");
+}
+
+TEST_F(Startup, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
+  PutText(Key, "SaveDir", "D:\\Saves\\");
+  AddDisk('D', 1 << 20);
+  const std::string mark = ".0f3a99c2.novo~";
+  for (const std::string& path : {Roms + "X.zip", Imgs + "X.gif", "D:\\Saves\\X.srm"s, EmulatorConfig}) {
+    PutFile(path + mark, "half");
+  }
+  PassTime(3601);
+  ASSERT_TRUE(Start());
+  EXPECT_EQ(Entradas(form->List1), "Nome comprido|Sem figura|Super Jogo|");
+  for (const std::string& path : AllFiles()) EXPECT_FALSE(path.ends_with(mark)) << path;
 }
 
 TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {

@@ -11,6 +11,8 @@ const Message Corrupted = Failure(
     "Houve uma diferença na medição dos códigos CRC.\r\n"
     "Essa mudança indica que o arquivo está corrompido.");
 
+const Message Replace = Question("Confirmar", "O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?");
+
 class ImportGame : public Installation {};
 
 TEST_F(ImportGame, CopiesRomFilesAsTheyAre) {
@@ -70,7 +72,7 @@ TEST_F(ImportGame, OfAPackageAsksBeforeItReplaces) {
   for (const int answer : {IDNO, IDCANCEL, IDYES}) {
     ExpectFiles(expected, FilesIn(Home));
     Choose(Import, path);
-    EXPECT_EQ(Answer(answer), Question("Confirmar", "O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?"));
+    EXPECT_EQ(Answer(answer), Replace);
     if (answer != IDYES) ExpectQuietEnd();
   }
   EXPECT_EQ(Answer(IDOK), Added);
@@ -82,10 +84,19 @@ TEST_F(ImportGame, OfAPackageAsksBeforeItReplaces) {
 
 TEST_F(ImportGame, LeavesNothingOfWhatItCannotTake) {
   const std::string checksum = "-873187034";
+  const std::string zebra = Package("Zebra", "ZEBRA", checksum, "GIF89a", "123456789");
+  const size_t romStart = zebra.size() - 9;
+  const std::string megabyte = Package("Zebra", "ZEBRA", checksum, "GIF89a", std::string(1 << 20, 'z'));
   const struct {
     std::string File, Content;
     const Message* Shown;
+    int ToTheQuestion = 0;  // the answer, where it is asked whether to replace a game
   } cases[] = {
+      {"cortado na figura.tvk", zebra.substr(0, romStart - 3), &CannotRead, IDYES},
+      {"cortado antes da rom.tvk", zebra.substr(0, romStart), &CannotRead, IDYES},
+      {"cortado na rom.tvk", zebra.substr(0, romStart + 4), &Corrupted, IDYES},
+      {"sem soma.tvk", megabyte, &CannotRead, IDYES},
+      {"rom de outro jogo.tvk", Package("Outro", "ELAN", checksum, "GIF89a", "123456789"), nullptr, IDNO},
       {"alterado.tvk", Package("Novo", "NOVO", checksum, "GIF89a", "123456788"), &Corrupted},
       {"cortado.tvk", Package("Novo", "NOVO", checksum, "GIF89a", "123456789").substr(0, 60), &CannotRead},
       {"fora.tvk", Package("..\\Novo", "NOVO", checksum, "GIF89a", "123456789"), &CannotRead},
@@ -94,10 +105,13 @@ TEST_F(ImportGame, LeavesNothingOfWhatItCannotTake) {
   };
   Start();
   const Files before = FilesIn(Home);
-  for (const auto& [file, content, shown] : cases) {
+  for (const auto& [file, content, shown, toTheQuestion] : cases) {
     SCOPED_TRACE(file);
     PutFile(Outside + file, content);
     Choose(Import, Outside + file);
+    if (toTheQuestion != 0) {
+      EXPECT_EQ(Answer(toTheQuestion), Replace);
+    }
     if (shown != nullptr) {
       EXPECT_EQ(Answer(IDOK), *shown);
     }

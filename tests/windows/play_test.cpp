@@ -84,6 +84,13 @@ TEST_F(Play, WithTheSavesOnAFloppyDiskRewritesTheEmulatorsConfigurationWhenItDif
   const auto past = last_write_time(file);
   PlayZebra();  // unasked: the disk is there
   EXPECT_TRUE(last_write_time(file) == past);
+  {
+    Put("Emulador\\zsnesw.cfg", "SaveDirectory = B:");
+    const HeldFile held(file.string());
+    PlayZebra();  // with a configuration that cannot be read
+  }
+  EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), "SaveDirectory = B:");
+  Put("Emulador\\zsnesw.cfg", EmulatorConfiguration("SaveDirectory = A:", games));
   EXPECT_EQ(Settings()["Disquete"], "1");
 
   Start();

@@ -133,6 +133,15 @@ TEST_F(Saves, ThatDoNotFitOnTheFloppyAreRefused) {
   EXPECT_EQ(manager->Offered(), ComputerOffered);
   ExpectBothSides();
 
+  Pick(computer, "Água Viva [State 2]");
+  {
+    const HeldFile held(computer.Directory + "AGUA.zs2");
+    manager->Copy.Click();
+    EXPECT_EQ(Answer(IDOK), Failure("Erro ao ler arquivo."));
+  }
+  EXPECT_SOON_EQ(NothingOffered, manager->Offered());
+  ExpectBothSides();
+
   Pick(computer, "Água Viva");  // fits to the last byte
   manager->Copy.Click();
   ExpectCopied(floppy, "AGUA.srm", Bytes(3, 3 * Block));

@@ -1,4 +1,6 @@
 // The first start: the question whether to configure, and the controller help that comes once.
+#include <filesystem>
+
 #include "tests/windows/installation.h"
 
 namespace {
@@ -40,6 +42,25 @@ TEST_F(FirstStart, AsksAgainUntilConfiguredAndGoesOnWithWhatWasWritten) {
     EXPECT_EQ(NextCall(Autoconfiguration), (Call{Autoconfiguration, "C:\\Ensaio"}));
   }
   EXPECT_EQ(Entries(MainWindow(*program).List), Texts{"Outro"});
+}
+
+class Leftovers : public Installation {};
+
+TEST_F(Leftovers, OfAnEarlierRunGoOnceTheyAreOldAndNobodyWritesThem) {
+  const std::string mark = ".0f3a99c2.novo~";
+  const Texts old = {"Roms\\X.zip", "Imgs\\X.gif", "Saves\\X.srm", "Emulador\\zsnesw.cfg"};
+  for (const std::string& name : old) {
+    Put(name + mark, "half");
+    const std::filesystem::path file = Home + name + mark;
+    last_write_time(file, last_write_time(file) - std::chrono::hours(2));
+  }
+  Put("Roms\\novo.zip" + mark, "half");
+  Put("Roms\\minha.zip.novo~", "the person's own");
+  Start();
+  for (const std::string& name : old) EXPECT_SOON(Content(name + mark).empty()) << name;
+  EXPECT_EQ(Content("Roms\\novo.zip" + mark), "half");
+  EXPECT_EQ(Content("Roms\\minha.zip.novo~"), "the person's own");
+  EXPECT_EQ(Entries(window->List), Games);
 }
 
 class ControllerHelp : public Installation {};
