@@ -19,7 +19,8 @@ using simulated::Place;
 using Found = std::vector<std::pair<std::string, const Entry*>>;  // with their sort keys
 
 void Sort(Found& found) {
-  std::stable_sort(found.begin(), found.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+  const auto before = [](const auto& a, const auto& b) { return a.first < b.first; };
+  if (!std::is_sorted(found.begin(), found.end(), before)) std::stable_sort(found.begin(), found.end(), before);
 }
 
 bool IsListed(const Entry& entry) {
