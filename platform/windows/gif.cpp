@@ -4,6 +4,8 @@
 #include <cstddef>
 #include <string>
 
+#include "platform/picture_file.h"
+
 namespace platform {
 namespace {
 

@@ -3,22 +3,26 @@
 #include <windows.h>
 
 #include <optional>
+#include <string>
 #include <utility>
 
+#include "platform/picture_file.h"
 #include "platform/windows/drawing.h"
 #include "platform/windows/gif.h"
 #include "platform/windows/resource.h"
-#include "platform/windows/whole_file.h"
 #include "platform/windows/wic.h"
 
 namespace platform {
 namespace {
 
 std::optional<Pixels> Decode(std::string_view content) {
-  if (content.starts_with("GIF8")) return DecodeGif(content);
-  if (content.starts_with("BM") && BmpIsWhole(content)) return DecodeWithWic(content);
-  if (content.starts_with("\xFF\xD8\xFF") && JpegIsWhole(content)) return DecodeWithWic(content);
-  return std::nullopt;
+  const std::optional<PictureFile> file = ReadPictureFile(content);
+  if (!file) return std::nullopt;
+  if (file->Format == PictureFormat::Gif) return DecodeGif(content);
+  if (file->Length <= content.size()) return DecodeWithWic(content);
+  std::string filled(content);  // a bitmap without the last bytes that fill up its row
+  filled.resize(file->Length);
+  return DecodeWithWic(filled);
 }
 
 }  // namespace

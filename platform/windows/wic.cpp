@@ -9,6 +9,7 @@
 
 #include <memory>
 
+#include "platform/picture_file.h"
 #include "platform/windows/system_library.h"
 
 namespace platform {

@@ -44,4 +44,20 @@ inline std::string SmallJpeg(PictureSize size = {8, 8}) {
          Bytes({0xFF, 0xDA, 0, 8, 1, 1, 0, 0, 63, 0, 0x3F, 0xFF, 0xD9});
 }
 
+// Indices 0, 1, 1, 0 of the colours red (transparent) and blue. The checksums are those of the usual size.
+inline std::string SmallPng(PictureSize size = {2, 2}) {
+  const auto high = [](std::uint32_t value) {
+    const std::string low = Low(value, 4);
+    return std::string(low.rbegin(), low.rend());
+  };
+  const auto chunk = [&](const char* kind, const std::string& data, std::uint32_t checksum) {
+    return high(static_cast<std::uint32_t>(data.size())) + kind + data + high(checksum);
+  };
+  return "\x89PNG\r\n\x1A\n" +
+         chunk("IHDR", high(size.Width) + high(size.Height) + Bytes({8, 3, 0, 0, 0}), 0x4568FD16) +
+         chunk("PLTE", Bytes({255, 0, 0, 0, 0, 255}), 0x6CA1FD8E) + chunk("tRNS", std::string(1, '\0'), 0x40E6D866) +
+         chunk("IDAT", Bytes({120, 218, 99, 96, 96, 4, 66, 0, 0, 12, 0, 3}), 0x159E18FC) +
+         chunk("IEND", "", 0xAE426082);
+}
+
 }  // namespace contract
