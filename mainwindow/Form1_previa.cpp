@@ -6,7 +6,7 @@
 
 namespace {
 
-constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg"};  // the first one present is shown
+constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg", ".png"};  // the first one present is shown
 
 std::string ImagemDe(const std::string& Nome) {
   for (const char* Extensao : ExtensoesDeImagem) {

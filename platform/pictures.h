@@ -1,4 +1,4 @@
-// Still pictures: BMP, GIF and JPEG, told apart by their content.
+// Still pictures: GIF, BMP, JPEG and PNG, told apart by their content.
 #pragma once
 
 #include <memory>

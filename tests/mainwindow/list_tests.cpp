@@ -3,7 +3,7 @@
 
 namespace {
 
-using contract::SmallBmp, contract::SmallGif, contract::SmallJpeg;
+using contract::SmallBmp, contract::SmallGif, contract::SmallJpeg, contract::SmallPng;
 
 struct List : Menu {};
 
@@ -90,6 +90,7 @@ TEST_F(List, PreviewTakesTheFirstPicturePresent) {
   const std::tuple<const char*, std::string, std::string> steps[] = {
       // a picture file that is put there, its content, and the picture that is shown then
       {".jpg", "", ""},  // an empty file counts as none: the default picture
+      {".png", SmallPng(), SmallPng()},
       {".jpg", SmallJpeg(), SmallJpeg()},
       {".bmp", SmallBmp(), SmallBmp()},
       {".gif", SmallGif(), SmallGif()},
