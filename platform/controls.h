@@ -202,8 +202,10 @@ class ImageBox : public Control {
  public:
   ImageBox(const Container& container, const Bounds& bounds);
 
+  // Keys and clicks that wait come first: a picture that they replace is never decoded. One that its decoder refuses
+  // leaves the picture before it.
   void SetPicture(const Picture& picture);
-  Picture ShownPicture() const;
+  Picture ShownPicture() const;  // the one set last, unless it was refused
 };
 
 // A small picture that acts as a button: it can be clicked, focused, and pressed with Space or Enter.

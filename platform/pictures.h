@@ -2,13 +2,13 @@
 #pragma once
 
 #include <memory>
-#include <string_view>
+#include <string>
 
 namespace platform {
 
 struct PictureData;  // of the implementation
 
-// A picture that can be shown, or none. Copies share the pixels, which never change.
+// A picture that can be shown, or none. Copies share what it is made of, which never changes.
 class Picture {
  public:
   Picture() = default;
@@ -16,7 +16,7 @@ class Picture {
 
   // False: no picture.
   explicit operator bool() const { return data_ != nullptr; }
-  bool operator==(const Picture&) const = default;  // the same pixels, not merely alike
+  bool operator==(const Picture&) const = default;  // the same one, not merely alike
 
   const PictureData* Data() const { return data_.get(); }
 
@@ -24,9 +24,9 @@ class Picture {
   std::shared_ptr<const PictureData> data_;
 };
 
-// The first frame of a picture file's content; none when it is damaged, of another format, or has more than
-// 64 million pixels.
-Picture LoadPicture(std::string_view content);
+// The first frame of a picture file's content; none when the file is cut, of another format, or says sizes that cannot
+// be or are too large (picture_file.h). It is not decoded before it is drawn, and only then a decoder can refuse it.
+Picture LoadPicture(std::string content);
 
 // A picture of the program's own resources (a number of resources/ids.h).
 Picture LoadPictureResource(int id);

@@ -11,7 +11,7 @@
 #define ICONE_SETA_ESQUERDA 107
 #define ICONE_SETA_DIREITA 108
 
-/* GIF files, of resource type GIF. */
+/* Picture files. */
 #define FIGURA_PREVIA 201
 #define FIGURA_CONTROLE 202
 #define FIGURA_EXCLUIR 203

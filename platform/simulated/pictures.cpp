@@ -1,10 +1,11 @@
-// Pictures are looked at far enough to tell whole ones from damaged ones; no pixel is made of them.
+// No pixel is made of a picture: none is refused once it is loaded.
 #include "platform/pictures.h"
 
 #include <algorithm>
 #include <iterator>
 #include <memory>
 #include <string>
+#include <utility>
 
 #include "platform/picture_file.h"
 #include "platform/simulated/machine.h"
@@ -13,9 +14,9 @@
 
 namespace platform {
 
-Picture LoadPicture(std::string_view content) {
+Picture LoadPicture(std::string content) {
   if (simulated::Fails() || !ReadPictureFile(content)) return {};
-  return Picture(std::make_shared<const PictureData>(PictureData{0, std::string(content)}));
+  return Picture(std::make_shared<const PictureData>(PictureData{0, std::move(content)}));
 }
 
 Picture LoadPictureResource(int id) {

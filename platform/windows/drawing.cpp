@@ -14,10 +14,11 @@ int Drawn(int image, int area) { return image == area + 1 ? area : image; }
 
 }  // namespace
 
-void DrawPicture(HDC context, const RECT& area, const Picture& picture) {
-  if (!picture) return;
-  const Pixels& image = picture.Data()->Image;
+bool DrawPicture(HDC context, const RECT& area, const Picture& picture) {
   const int width = area.right - area.left, height = area.bottom - area.top;
+  const Pixels* const decoded = picture ? PixelsFor(picture, {width, height}) : nullptr;
+  if (decoded == nullptr) return false;
+  const Pixels& image = *decoded;
   const int columns = Drawn(image.Width, width), rows = Drawn(image.Height, height);
   BITMAPINFO format{};
   format.bmiHeader.biSize = sizeof format.bmiHeader;
@@ -29,6 +30,7 @@ void DrawPicture(HDC context, const RECT& area, const Picture& picture) {
   ::SetBrushOrgEx(context, 0, 0, nullptr);
   ::StretchDIBits(context, area.left, area.top, width, height, 0, 0, columns, rows, image.Colours.data(), &format,
                   DIB_RGB_COLORS, SRCCOPY);
+  return true;
 }
 
 }  // namespace platform

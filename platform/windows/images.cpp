@@ -21,26 +21,46 @@ void DrawImageButton(const DRAWITEMSTRUCT& item, const Picture& picture) {
   if ((item.itemState & ODS_FOCUS) != 0) DrawFocus(item.hDC, item.rcItem);
 }
 
+// Keys or clicks, which may soon ask for another picture.
+bool InputWaits() { return HIWORD(::GetQueueStatus(QS_KEY | QS_MOUSEBUTTON | QS_POSTMESSAGE)) != 0; }
+
+// Timers come once no input waits. The box is not just left invalid: who repaints windows until none is would not end.
+void DrawLater(HWND box) {
+  constexpr UINT_PTR Timer = 1;
+  ::SetTimer(box, Timer, USER_TIMER_MINIMUM, [](HWND handle, UINT, UINT_PTR timer, DWORD) {
+    ::KillTimer(handle, timer);
+    ::InvalidateRect(handle, nullptr, FALSE);
+  });
+}
+
+void DrawBox(ControlState& box, const DRAWITEMSTRUCT& item) {
+  const SIZE place = {item.rcItem.right - item.rcItem.left, item.rcItem.bottom - item.rcItem.top};
+  if (box.Next && box.Shown && InputWaits()) {
+    DrawLater(box.Handle);
+  } else if (box.Next) {
+    if (PixelsFor(box.Next, place) != nullptr) box.Shown = box.Next;
+    box.Next = {};
+  }
+  if (!DrawPicture(item.hDC, item.rcItem, box.Shown)) {
+    ::FillRect(item.hDC, &item.rcItem, ::GetSysColorBrush(COLOR_BTNFACE));
+  }
+}
+
 }  // namespace
 
 ImageBox::ImageBox(const Container& container, const Bounds& bounds) {
   CreateControl(*state_, container, bounds, {"STATIC", SS_OWNERDRAW});
-  state_->Draw = [this](const DRAWITEMSTRUCT& item) {
-    if (state_->Shown) {
-      DrawPicture(item.hDC, item.rcItem, state_->Shown);
-    } else {
-      ::FillRect(item.hDC, &item.rcItem, ::GetSysColorBrush(COLOR_BTNFACE));
-    }
-  };
+  state_->Draw = [this](const DRAWITEMSTRUCT& item) { DrawBox(*state_, item); };
 }
 
 void ImageBox::SetPicture(const Picture& picture) {
   if (state_->Handle == nullptr) return;
-  state_->Shown = picture;
+  state_->Next = picture;
+  if (!picture) state_->Shown = {};
   ::InvalidateRect(state_->Handle, nullptr, FALSE);
 }
 
-Picture ImageBox::ShownPicture() const { return state_->Shown; }
+Picture ImageBox::ShownPicture() const { return state_->Next ? state_->Next : state_->Shown; }
 
 ImageButton::ImageButton(const Container& container, const Bounds& bounds, int picture, const std::string& toolTip) {
   CreateControl(*state_, container, bounds, {"BUTTON", WS_TABSTOP | BS_OWNERDRAW});

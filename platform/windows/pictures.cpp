@@ -2,40 +2,56 @@
 
 #include <windows.h>
 
+#include <algorithm>
 #include <optional>
 #include <string>
 #include <utility>
 
 #include "platform/picture_file.h"
 #include "platform/windows/drawing.h"
-#include "platform/windows/gif.h"
 #include "platform/windows/resource.h"
 #include "platform/windows/wic.h"
 
 namespace platform {
 namespace {
 
-std::optional<Pixels> Decode(std::string_view content) {
-  const std::optional<PictureFile> file = ReadPictureFile(content);
-  if (!file) return std::nullopt;
-  if (file->Format == PictureFormat::Gif) return DecodeGif(content);
-  if (file->Length <= content.size()) return DecodeWithWic(content);
-  std::string filled(content);  // a bitmap without the last bytes that fill up its row
-  filled.resize(file->Length);
-  return DecodeWithWic(filled);
+// A GIF file's decoder would decode all its images; a bitmap's last row is filled up.
+void Complete(std::string& content, const PictureFile& file) {
+  if (file.Format == PictureFormat::Gif) {
+    content.resize(file.Length);
+    content += ';';  // the end
+  }
+  if (file.Format == PictureFormat::Bmp) content.resize(std::max(content.size(), file.Length));
 }
 
 }  // namespace
 
-Picture LoadPicture(std::string_view content) {
+Picture LoadPicture(std::string content) {
   try {
-    std::optional<Pixels> pixels = Decode(content);
-    if (pixels) return Picture(std::make_shared<const PictureData>(std::move(*pixels)));
+    const std::optional<PictureFile> file = ReadPictureFile(content);
+    if (!file) return {};
+    Complete(content, *file);
+    return Picture(std::make_shared<const PictureData>(PictureData{std::move(content), *file, {}}));
   } catch (const std::exception&) {  // not enough memory
+    return {};
   }
-  return {};
 }
 
-Picture LoadPictureResource(int id) { return LoadPicture(Resource(id, "GIF")); }
+Picture LoadPictureResource(int id) { return LoadPicture(std::string(Resource(id, RT_RCDATA))); }
+
+const Pixels* PixelsFor(const Picture& picture, SIZE place) {
+  const PictureData& data = *picture.Data();
+  DecodedPicture& decoded = data.Decoded;
+  if (decoded.Place.cx != place.cx || decoded.Place.cy != place.cy) {
+    decoded.Place = place;
+    decoded.Image.reset();
+    try {
+      // One row and column too many are left out in drawing, and not mixed with the others.
+      decoded.Image = Decode(data.Content, data.File.Format, {place.cx + 1, place.cy + 1});
+    } catch (const std::exception&) {  // not enough memory
+    }
+  }
+  return decoded.Image ? &*decoded.Image : nullptr;
+}
 
 }  // namespace platform

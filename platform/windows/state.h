@@ -45,7 +45,7 @@ struct ControlState {
   bool WhiteGround = false;
   bool Framed = false;  // something lies around its client area
   ButtonImage Image;
-  Picture Shown;
+  Picture Shown, Next;      // Next: set, and not drawn yet
   bool EnterIsKey = false;  // Enter goes to OnKey and not to the window
 
   // Once the window is closed.

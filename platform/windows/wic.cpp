@@ -7,9 +7,11 @@
 #include <wincodec.h>
 // clang-format on
 
+#include <algorithm>
+#include <cstdint>
 #include <memory>
+#include <utility>
 
-#include "platform/picture_file.h"
 #include "platform/windows/system_library.h"
 
 namespace platform {
@@ -57,18 +59,35 @@ Owned<IWICBitmapDecoder> OpenDecoder(IWICImagingFactory* factory, IWICStream* st
 // A colour multiplied by its opacity, in front of white.
 std::uint32_t OverWhite(std::uint32_t pixel) { return (pixel & 0xFFFFFF) + (0xFF - (pixel >> 24)) * 0x010101; }
 
-std::optional<Pixels> ReadPixels(IWICBitmapSource* frame, IWICFormatConverter* converter) {
+using Source = Owned<IWICBitmapSource>;
+
+Source Converted(IWICImagingFactory* factory, const Source& source) {
+  auto converter =
+      Obtain<IWICFormatConverter>([&](IWICFormatConverter** made) { return factory->CreateFormatConverter(made); });
+  const bool done = source && converter &&
+                    SUCCEEDED(converter->Initialize(source.get(), GUID_WICPixelFormat32bppPBGRA,
+                                                    WICBitmapDitherTypeNone, nullptr, 0, WICBitmapPaletteTypeCustom));
+  return done ? std::move(converter) : nullptr;
+}
+
+// Wine leaves out pixels in place of mixing them.
+Source Reduced(IWICImagingFactory* factory, const Source& source, SIZE most) {
   UINT width = 0, height = 0;
-  if (FAILED(frame->GetSize(&width, &height)) || width == 0 || height == 0) return std::nullopt;
-  if (width > MostPixels || height > MostPixels || std::int64_t{width} * height > MostPixels) return std::nullopt;
-  if (FAILED(converter->Initialize(frame, GUID_WICPixelFormat32bppPBGRA, WICBitmapDitherTypeNone, nullptr, 0,
-                                   WICBitmapPaletteTypeCustom))) {
-    return std::nullopt;
-  }
+  if (!source || FAILED(source->GetSize(&width, &height))) return nullptr;
+  auto scaler = Obtain<IWICBitmapScaler>([&](IWICBitmapScaler** made) { return factory->CreateBitmapScaler(made); });
+  const bool done = scaler && SUCCEEDED(scaler->Initialize(source.get(), std::min(width, static_cast<UINT>(most.cx)),
+                                                           std::min(height, static_cast<UINT>(most.cy)),
+                                                           WICBitmapInterpolationModeFant));
+  return done ? std::move(scaler) : nullptr;
+}
+
+std::optional<Pixels> ReadPixels(IWICBitmapSource* source) {
+  UINT width = 0, height = 0;
+  if (FAILED(source->GetSize(&width, &height)) || width == 0 || height == 0) return std::nullopt;
   Pixels pixels{static_cast<int>(width), static_cast<int>(height),
                 std::vector<std::uint32_t>(std::size_t{width} * height)};
-  if (FAILED(converter->CopyPixels(nullptr, 4 * width, static_cast<UINT>(4 * pixels.Colours.size()),
-                                   reinterpret_cast<BYTE*>(pixels.Colours.data())))) {
+  if (FAILED(source->CopyPixels(nullptr, 4 * width, static_cast<UINT>(4 * pixels.Colours.size()),
+                                reinterpret_cast<BYTE*>(pixels.Colours.data())))) {
     return std::nullopt;
   }
   for (std::uint32_t& pixel : pixels.Colours) pixel = OverWhite(pixel);
@@ -77,18 +96,20 @@ std::optional<Pixels> ReadPixels(IWICBitmapSource* frame, IWICFormatConverter* c
 
 }  // namespace
 
-std::optional<Pixels> DecodeWithWic(std::string_view content) {
+std::optional<Pixels> Decode(std::string_view content, PictureFormat format, SIZE most) {
   IWICImagingFactory* factory = Factory();
   if (factory == nullptr || content.size() > MAXDWORD) return std::nullopt;
   const auto stream = Obtain<IWICStream>([&](IWICStream** made) { return factory->CreateStream(made); });
   if (!stream) return std::nullopt;
   const auto decoder = OpenDecoder(factory, stream.get(), content);
   if (!decoder) return std::nullopt;
-  const auto frame =
+  const Source frame =
       Obtain<IWICBitmapFrameDecode>([&](IWICBitmapFrameDecode** first) { return decoder->GetFrame(0, first); });
-  const auto converter =
-      Obtain<IWICFormatConverter>([&](IWICFormatConverter** made) { return factory->CreateFormatConverter(made); });
-  return frame && converter ? ReadPixels(frame.get(), converter.get()) : std::nullopt;
+  // Asked first, JPEG's decoder makes a smaller picture at once. Numbers of colours in a table cannot be mixed.
+  const bool reducedFirst = format == PictureFormat::Jpeg;
+  const Source source = reducedFirst ? Converted(factory, Reduced(factory, frame, most))
+                                     : Reduced(factory, Converted(factory, frame), most);
+  return source ? ReadPixels(source.get()) : std::nullopt;
 }
 
 }  // namespace platform

@@ -22,10 +22,9 @@ void EraseBackground(const WindowState& window, HDC context) {
   ::GetClientRect(window.Handle, &area);
   const int before = ::SaveDC(context);
   if (window.Background) {
-    const Pixels& picture = window.Background.Data()->Image;
+    const PictureFile& picture = window.Background.Data()->File;
     const RECT place = {0, 0, Scaled(picture.Width, window.Dpi), Scaled(picture.Height, window.Dpi)};
-    DrawPicture(context, place, window.Background);
-    ::ExcludeClipRect(context, 0, 0, place.right, place.bottom);
+    if (DrawPicture(context, place, window.Background)) ::ExcludeClipRect(context, 0, 0, place.right, place.bottom);
   }
   ::FillRect(context, &area, ::GetSysColorBrush(COLOR_BTNFACE));
   ::RestoreDC(context, before);

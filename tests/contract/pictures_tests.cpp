@@ -30,6 +30,9 @@ TEST(Pictures, BitmapMayEndWithItsLastPixel) {
     EXPECT_TRUE(LoadPicture(content.substr(0, content.size() - (4 - width)))) << width;
     EXPECT_FALSE(LoadPicture(content.substr(0, content.size() - (5 - width)))) << width;
   }
+  const string runs = SmallBmp({4, 1}).replace(30, 1, "\1").replace(34, 1, "\4");  // run-length coded: 4 bytes
+  EXPECT_TRUE(LoadPicture(runs));
+  EXPECT_FALSE(LoadPicture(runs.substr(0, runs.size() - 1)));
 }
 
 // A segment of a JPEG file.

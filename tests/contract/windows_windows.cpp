@@ -4,6 +4,7 @@
 #include "platform/messages.h"
 #include "platform/windows/state.h"
 #include "tests/contract/hand.h"
+#include "tests/contract/small_pictures.h"
 
 namespace {
 
@@ -53,6 +54,39 @@ TEST_F(NativeWindow, HasToolTipsOnceTheMouseComesToAControlWithOne) {
   };
   EXPECT_EQ(tips(list), nullptr);
   EXPECT_NE(tips(image), nullptr);
+}
+
+TEST_F(NativeWindow, PictureIsDecodedOnceNoInputWaits) {
+  ImageBox shown(window, {1800, 2400, 1500, 900});
+  const HWND box = shown.State().Handle;
+  const auto colour = [&] {
+    const HDC context = ::GetDC(box);
+    const COLORREF pixel = ::GetPixel(context, 1, 1);
+    ::ReleaseDC(box, context);
+    return pixel;
+  };
+  const auto becomes = [&](COLORREF expected) {
+    for (int i = 0; i < 200 && colour() != expected; ++i, ::Sleep(10)) RunPendingEvents();
+    return colour();
+  };
+  constexpr COLORREF grey = RGB(0x80, 0x80, 0x80), darker = RGB(0x40, 0x40, 0x40);
+  shown.SetPicture(LoadPicture(SmallJpeg()));
+  EXPECT_EQ(becomes(grey), grey);
+
+  const Picture next = LoadPicture(SmallBmp());
+  bool handled = false;
+  QueueEvent([&] { handled = true; });
+  shown.SetPicture(next);
+  EXPECT_EQ(shown.ShownPicture(), next);
+  ::RedrawWindow(window.State().Handle, nullptr, nullptr, RDW_INVALIDATE | RDW_UPDATENOW | RDW_ALLCHILDREN);
+  EXPECT_EQ(colour(), grey) << "while something waits";
+  EXPECT_FALSE(handled);
+  EXPECT_EQ(becomes(darker), darker);
+
+  shown.SetPicture(LoadPicture(SmallPng().replace(SmallPng().find("IDAT"), 4, "nada")));  // no decoder takes it
+  for (int i = 0; i < 200 && shown.ShownPicture() != next; ++i, ::Sleep(10)) RunPendingEvents();
+  EXPECT_EQ(shown.ShownPicture(), next);
+  EXPECT_EQ(colour(), darker);
 }
 
 TEST_F(NativeWindow, FileDialogsReturnThePathAndKeepTheCurrentDirectory) {
