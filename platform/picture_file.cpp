@@ -214,11 +214,12 @@ struct Row {
   std::optional<Frame> (*Read)(Reader& reader);
 };
 
-constexpr std::int64_t DeflatesTo = 1032;  // bytes, of one
+constexpr std::int64_t LongestGifCode = 4096;  // pixels, at the most, that a code of two bits or more says
+constexpr std::int64_t DeflatesTo = 1032;      // bytes, at the most, that one byte becomes
 
 constexpr Row Formats[] = {
-    {PictureFormat::Gif, "GIF8", 4 * 4096, ReadGif},  // a code takes two bits or more, and says at most 4096 pixels
-    {PictureFormat::Bmp, "BM", MostPixels, ReadBmp},  // its rows are there, or it may leave out what it likes
+    {PictureFormat::Gif, "GIF8", 4 * LongestGifCode, ReadGif},
+    {PictureFormat::Bmp, "BM", MostPixels, ReadBmp},       // its rows are there, or it may leave out what it likes
     {PictureFormat::Jpeg, "\xFF\xD8\xFF", 512, ReadJpeg},  // a block of 64 pixels takes a bit or more
     {PictureFormat::Png, "\x89PNG\r\n\x1A\n", 8 * DeflatesTo, ReadPng},
 };

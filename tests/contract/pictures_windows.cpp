@@ -44,7 +44,7 @@ TEST(PicturePixels, RowsOfAnInterlacedGifComeInTheirOrder) {
   EXPECT_EQ(ColoursOf(content), (Colours{0xFFFFFF, 0x0000FF, 0x0000FF, 0xFFFFFF, 0xFFFFFF}));
 }
 
-// A photograph takes no more memory than the place where it is shown. Wine's JPEG decoder reduces nothing itself.
+// What is kept of a photograph takes no more memory than the place where it is shown.
 TEST(PicturePixels, LargePictureIsReducedToItsPlace) {
   const string large = SmallBmp({1000, 1}) + string(1000, '\2');
   const Picture picture = LoadPicture(large);
