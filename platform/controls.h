@@ -144,7 +144,8 @@ class ListBox : public Control {
 
   std::function<void()> OnClick;  // the user selected an entry, by mouse or keyboard
   std::function<void()> OnDoubleClick;
-  std::function<void(int keyCode)> OnKeyDown;  // before the list acts on the key; 13 is Enter
+  // Before the list acts on the key; 13 is Enter. Once for a key that is held down, on which the list goes on acting.
+  std::function<void(int keyCode)> OnKeyDown;
 };
 
 // A push button that shows its caption, or an icon of the program's resources, whose size follows the screen's DPI; its

@@ -133,9 +133,10 @@ void Click(CheckBox& box);              // changes its value
 void Choose(ListBox& list, int index);  // selects and clicks
 void Choose(ComboBox& box, int index);
 void DoubleClick(ListBox& list);
-void PressKey(ListBox& list, int keyCode);  // up 38, down 40, home 36 and end 35 also move the selection
-void CloseWindow(Window& window);           // its close box
-void Tick(Timer& timer);                    // one tick, when the timer is enabled
+void PressKey(ListBox& list, int keyCode);              // up 38, down 40, home 36 and end 35 also move the selection
+void HoldKey(ListBox& list, int keyCode, int repeats);  // pressed, and repeated so many times before it is released
+void CloseWindow(Window& window);                       // its close box
+void Tick(Timer& timer);                                // one tick, when the timer is enabled
 
 // --- What stands on the screen.
 

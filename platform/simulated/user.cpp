@@ -68,11 +68,14 @@ void DoubleClick(ListBox& list) {
   if (Touch(list)) RunHandler(list.OnDoubleClick);
 }
 
-void PressKey(ListBox& list, int keyCode) {
-  if (!Touch(list)) return;
-  RunHandler(list.OnKeyDown, keyCode);
-  const std::optional<int> destination = Destination(keyCode, list.Selected(), list.Count());
-  if (destination && *destination != list.Selected()) ChooseEntry(list, *destination);
+void PressKey(ListBox& list, int keyCode) { HoldKey(list, keyCode, 0); }
+
+void HoldKey(ListBox& list, int keyCode, int repeats) {
+  for (int i = 0; i <= repeats && Touch(list); ++i) {
+    if (i == 0) RunHandler(list.OnKeyDown, keyCode);
+    const std::optional<int> destination = Destination(keyCode, list.Selected(), list.Count());
+    if (destination && *destination != list.Selected()) ChooseEntry(list, *destination);
+  }
 }
 
 void CloseWindow(Window& window) {

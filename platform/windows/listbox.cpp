@@ -50,8 +50,8 @@ ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) 
     if (code == LBN_SELCHANGE) Raise(OnClick);
     if (code == LBN_DBLCLK) Raise(OnDoubleClick);
   };
-  state_->OnKey = [this](int key, bool) {
-    Raise(OnKeyDown, key);
+  state_->OnKey = [this](int key, bool repeated) {
+    if (!repeated) Raise(OnKeyDown, key);
     return false;
   };
   state_->Remember = [this] {

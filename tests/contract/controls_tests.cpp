@@ -74,6 +74,18 @@ TEST_F(Controls, HandActsOnWhatTakesInputOnly) {
   EXPECT_EQ(act(), "list button image /1/0/0");
 }
 
+TEST_F(Controls, AHeldKeyIsToldOnceAndGoesOnMovingTheSelection) {
+  constexpr int down = 40, enter = 13;
+  list.OnKeyDown = [this](int key) { clicks += std::to_string(key) + " "; };
+  list.Select(0);
+  HoldKey(list, down, 1);
+  EXPECT_EQ(Seen(), "40 list list /2/0/0");
+  for (int press = 0; press < 2; ++press) {
+    HoldKey(list, enter, 20);
+    EXPECT_EQ(Seen(), "13 /2/0/0");
+  }
+}
+
 TEST_F(Controls, ClosingRunsUnloadOnceAndLeavesTheLastAnswers) {
   window.OnUnload = [&] {
     clicks += "unload ";

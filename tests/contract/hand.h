@@ -16,6 +16,7 @@ void Click(Button& button);
 void Click(ImageButton& button);
 void Click(CheckBox& box);
 void Choose(ListBox& list, int index);
+void HoldKey(ListBox& list, int keyCode, int repeats);  // pressed, repeated so many times, and released
 void UseCloseBox(Window& window);
 
 // Happens when the program handles its pending events, or in an event loop.

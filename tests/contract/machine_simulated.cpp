@@ -28,6 +28,7 @@ void Click(Button& button) { simulated::Click(button); }
 void Click(ImageButton& button) { simulated::Click(button); }
 void Click(CheckBox& box) { simulated::Click(box); }
 void Choose(ListBox& list, int index) { simulated::Choose(list, index); }
+void HoldKey(ListBox& list, int keyCode, int repeats) { simulated::HoldKey(list, keyCode, repeats); }
 void UseCloseBox(Window& window) { simulated::CloseWindow(window); }
 void QueueEvent(std::function<void()> event) { simulated::QueueEvent(std::move(event)); }
 void QueueModal(std::function<void()> script) {

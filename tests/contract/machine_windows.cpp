@@ -62,6 +62,13 @@ void Click(Button& button) { Press(button); }
 void Click(ImageButton& button) { Press(button); }
 void Click(CheckBox& box) { Press(box); }
 void Choose(ListBox& list, int index) { Press(list, index); }
+void HoldKey(ListBox& list, int keyCode, int repeats) {
+  const HWND handle = list.State().Handle;
+  const auto key = static_cast<WPARAM>(keyCode);
+  for (int i = 0; i <= repeats; ++i) ::PostMessageA(handle, WM_KEYDOWN, key, MAKELPARAM(1, i > 0 ? KF_REPEAT : 0));
+  ::PostMessageA(handle, WM_KEYUP, key, MAKELPARAM(1, KF_UP | KF_REPEAT));
+  RunPendingEvents();
+}
 void UseCloseBox(Window& window) { ::SendMessageA(window.State().Handle, WM_CLOSE, 0, 0); }
 
 // Sent to a window of their own through the thread's message queue.

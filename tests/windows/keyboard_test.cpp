@@ -86,6 +86,17 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   EXPECT_SOON(program->HasEnded());
 }
 
+TEST_F(Keyboard, EnterThatIsHeldPlaysOnce) {
+  Start();
+  EXPECT_SOON(window->List.Focused() && window->Play.Enabled());
+  HoldKey(VK_RETURN, 15);
+  PressKey(VK_HOME);
+  EXPECT_SOON_EQ(std::string("abelha"), Selected());
+  ExpectPlayed("ZEBRA.SMC");
+  PressKey(VK_RETURN);
+  ExpectPlayed("abelha.zip");
+}
+
 TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   Put("Saves\\ELAN.srm", "bateria E");
   Start();

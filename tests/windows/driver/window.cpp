@@ -234,8 +234,11 @@ void ClickEntry(const Window& list, const std::string& text, int times) {
   ClickMiddle(list.Handle(), area, times);
 }
 
-void PressKey(WORD key) {
-  for (const DWORD event : {DWORD{0}, DWORD{KEYEVENTF_KEYUP}}) keybd_event(static_cast<BYTE>(key), 0, event, 0);
+void PressKey(WORD key) { HoldKey(key, 0); }
+
+void HoldKey(WORD key, int repeats) {
+  for (int i = 0; i <= repeats; ++i) keybd_event(static_cast<BYTE>(key), 0, 0, 0);
+  keybd_event(static_cast<BYTE>(key), 0, KEYEVENTF_KEYUP, 0);
 }
 
 void PressWith(WORD modifier, WORD key) {

@@ -55,6 +55,7 @@ std::string SelectedEntry(const Window& list);  // the empty text when there is 
 void ClickEntry(const Window& list, const std::string& text, int times = 1);
 
 void PressKey(WORD key);
+void HoldKey(WORD key, int repeats);  // pressed, and repeated so many times at once before it is released
 void PressWith(WORD modifier, WORD key);
 void TypeText(const std::string& text);
 
