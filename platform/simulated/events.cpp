@@ -17,8 +17,11 @@ void RunNextEvent() {
 
 }  // namespace
 
+// What waits waits on in a handler that events have brought.
 void RunPendingEvents() {
   ++TheMachine().PendingRuns;
+  if (TheMachine().PendingEventsRun) return;
+  const simulated::EventLevel level(true);
   const std::uint64_t last = TheMachine().EventsQueued;
   while (!TheMachine().Events.empty() && TheMachine().Events.front().Number <= last) RunNextEvent();
 }
@@ -27,6 +30,7 @@ void RunPendingEvents() {
 void RunPendingEventsAtIntervals() { RunPendingEvents(); }
 
 void RunEventLoop() {
+  const simulated::EventLevel level(false);
   const std::shared_ptr<simulated::WindowFacts> window = TheMachine().MainWindow;
   while (!(window && window->Closed) && !TheMachine().Events.empty()) RunNextEvent();
 }
@@ -39,6 +43,11 @@ int ScreenHeight() { return TheMachine().ScreenHeight; }
 }  // namespace platform
 
 namespace platform::simulated {
+
+EventLevel::EventLevel(bool pendingEventsRun)
+    : outer_(std::exchange(TheMachine().PendingEventsRun, pendingEventsRun)) {}
+
+EventLevel::~EventLevel() { TheMachine().PendingEventsRun = outer_; }
 
 void QueueEvent(std::function<void()> event) {
   TheMachine().Events.push_back({++TheMachine().EventsQueued, std::move(event)});

@@ -86,6 +86,7 @@ struct Machine {
   std::deque<QueuedEvent> Events;
   std::uint64_t EventsQueued = 0;
   int PendingRuns = 0;
+  bool PendingEventsRun = false;  // in a call that is under way, and in no modal turn or event loop begun since
 
   std::vector<std::shared_ptr<WindowFacts>> Windows;  // those that exist, in order of creation
   std::shared_ptr<WindowFacts> MainWindow;

@@ -32,6 +32,18 @@ bool TakesInput(const ControlState& control);
 
 void CountDroppedException();
 
+// While it lives, events run by RunPendingEvents, which then does not run any more, or by a loop of their own.
+class EventLevel {
+ public:
+  explicit EventLevel(bool pendingEventsRun);
+  ~EventLevel();
+  EventLevel(const EventLevel&) = delete;
+  EventLevel& operator=(const EventLevel&) = delete;
+
+ private:
+  const bool outer_;
+};
+
 // While it lives, only this window takes input; null: none of the program's.
 class ModalTurn {
  public:
@@ -39,6 +51,9 @@ class ModalTurn {
   ~ModalTurn();
   ModalTurn(const ModalTurn&) = delete;
   ModalTurn& operator=(const ModalTurn&) = delete;
+
+ private:
+  const EventLevel level_{false};
 };
 
 // Calls a handler as the window thread does: an exception ends here. The handler may replace itself meanwhile.

@@ -120,7 +120,7 @@ const std::vector<OpenFileName>& ShownFileDialogs();  // as they were asked
 void QueueModal(std::function<void(Window&)> script);
 
 // Events that wait: each runs the next time that the program lets pending events run (all that wait at that moment,
-// in order). Pending() tells how many are left.
+// in order), and not in a handler that such events have brought. Pending() tells how many are left.
 void QueueEvent(std::function<void()> event);
 int Pending();
 int PendingEventRuns();  // how often the program has let pending events run since Reset

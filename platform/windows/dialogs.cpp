@@ -54,6 +54,7 @@ bool Ask(const char* function, OpenFileName& request) {
   native.Flags = request.Flags;
   native.lpstrDefExt = OrNull(request.DefaultExtension);
   const KeptDirectory directory;
+  const OwnEventLoop loop;
   if (!dialog(&native)) return false;
   request.File = file.substr(0, std::min(file.find('\0'), file.size()));
   return true;

@@ -1,11 +1,24 @@
 #include "platform/events.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/windows/state.h"
 
 namespace platform {
 namespace {
+
+bool pendingEventsRun = false;  // in a call that is under way, and in no event loop that was begun since
+
+// Also a look at the queue, by which Windows sees that the program lives, and lets other programs' questions in.
+void DrawWindows() {
+  for (const WindowState* window : AllWindows()) {
+    if (window->Handle == nullptr) continue;
+    ::RedrawWindow(window->Handle, nullptr, nullptr, RDW_UPDATENOW | RDW_ALLCHILDREN);
+  }
+  MSG event;
+  ::PeekMessageA(&event, nullptr, 0, 0, PM_NOREMOVE);
+}
 
 bool MainWindowIsOpen() { return !AllWindows().empty() && AllWindows().front()->Handle != nullptr; }
 
@@ -39,11 +52,18 @@ void HandleEvent(MSG& event) {
   ::DispatchMessageA(&event);
 }
 
+OwnEventLoop::OwnEventLoop() : outer_(std::exchange(pendingEventsRun, false)) {}
+
+OwnEventLoop::~OwnEventLoop() { pendingEventsRun = outer_; }
+
 // A window that is closed while events are handled, however deep, shows in its state alone: the message that asks a
 // thread to quit would reach only the innermost pump.
 void RunPendingEvents() {
+  if (pendingEventsRun) return DrawWindows();
+  pendingEventsRun = true;
   MSG event;
   while (::PeekMessageA(&event, nullptr, 0, 0, PM_REMOVE)) HandleEvent(event);
+  pendingEventsRun = false;
 }
 
 void RunPendingEventsAtIntervals() {
@@ -55,6 +75,7 @@ void RunPendingEventsAtIntervals() {
 }
 
 void RunEventLoop() {
+  const OwnEventLoop loop;
   MSG event;
   while (MainWindowIsOpen() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);
 }
@@ -68,6 +89,7 @@ void Window::ShowModal() {
     ::EnableWindow(other->Handle, FALSE);
     state_->Disabled.push_back(other->Handle);
   }
+  const OwnEventLoop loop;
   Show();
   MSG event;
   while (!IsClosed() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);

@@ -33,6 +33,7 @@ UINT StyleOf(Icon icon) {
 
 Answer MessageBoxA(const std::string& text, const std::string& title, Buttons buttons, Icon icon) {
   const HWND owner = OwnerForModal();
+  const OwnEventLoop loop;
   const UINT modality = owner == nullptr ? MB_TASKMODAL : MB_APPLMODAL;
   switch (::MessageBoxA(owner, text.c_str(), title.c_str(), StyleOf(buttons) | StyleOf(icon) | modality)) {
     case IDYES:

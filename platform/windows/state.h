@@ -84,6 +84,18 @@ void PlaceWindow(WindowState& window, int left, int top);
 // Everything that depends on the window's resolution, its own size excepted.
 void LayOutWindow(WindowState& window);
 
+// While it lives events are handled by a loop of their own, whose handlers may let pending ones run.
+class OwnEventLoop {
+ public:
+  OwnEventLoop();
+  ~OwnEventLoop();
+  OwnEventLoop(const OwnEventLoop&) = delete;
+  OwnEventLoop& operator=(const OwnEventLoop&) = delete;
+
+ private:
+  const bool outer_;
+};
+
 // Handles one event, the keyboard's rules for a window with controls included.
 void HandleEvent(MSG& event);
 

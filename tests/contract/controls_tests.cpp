@@ -146,4 +146,24 @@ TEST_F(Controls, PendingEventsRunInOrderAndTheLoopEndsWithTheMainWindow) {
   EXPECT_EQ(clicks, "abc closed");
 }
 
+TEST_F(Controls, PendingEventsBringNoOthersBelowThemButInAModalWindow) {
+  Window modal({.Caption = "Modal", .ClientWidth = 3000, .ClientHeight = 3000});
+  QueueEvent([&] {
+    QueueEvent([&] { clicks += "b"; });
+    RunPendingEvents();
+    clicks += "a";
+    QueueModal([&] {
+      QueueEvent([&] { clicks += "c"; });
+      RunPendingEvents();
+      clicks += "d";
+      modal.Close();
+    });
+    modal.ShowModal();
+    RunPendingEvents();
+    clicks += "e";
+  });
+  for (int again = 0; again < 2; ++again) RunPendingEvents();
+  EXPECT_EQ(clicks, "abcde");
+}
+
 }  // namespace

@@ -89,6 +89,17 @@ TEST_F(NativeWindow, PictureIsDecodedOnceNoInputWaits) {
   EXPECT_EQ(colour(), darker);
 }
 
+TEST_F(NativeWindow, IsDrawnAlsoWhereEventsBringNoOthers) {
+  bool drawn = false;
+  QueueEvent([&] {
+    ::InvalidateRect(list.State().Handle, nullptr, TRUE);
+    RunPendingEvents();
+    drawn = ::GetUpdateRect(list.State().Handle, nullptr, FALSE) == FALSE;
+  });
+  RunPendingEvents();
+  EXPECT_TRUE(drawn);
+}
+
 TEST_F(NativeWindow, FileDialogsReturnThePathAndKeepTheCurrentDirectory) {
   const std::function<void()> press = [&] {
     const HWND dialog = ::GetLastActivePopup(window.State().Handle);

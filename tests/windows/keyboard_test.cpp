@@ -97,6 +97,25 @@ TEST_F(Keyboard, EnterThatIsHeldPlaysOnce) {
   ExpectPlayed("abelha.zip");
 }
 
+// Each key selects another game, and selecting lets pending events run.
+TEST_F(Keyboard, KeysThatWaitForEachOtherAreAllHandled) {
+  constexpr int many = 100;
+  for (int i = 0; i <= many; ++i) Put("Roms\\jogo " + std::to_string(1000 + i) + ".smc", "jogo");
+  Set("LRom", "jogo 1000");
+  Start();
+  EXPECT_SOON(window->List.Focused() && window->Play.Enabled());
+  const auto waiting = [&](WORD key) {
+    for (int i = 0; i < many; ++i) PostMessageW(window->List.Handle(), WM_KEYDOWN, key, 1);
+  };
+  const auto held = [&](WORD key) { HoldKey(key, many - 1); };
+  waiting(VK_DOWN);
+  EXPECT_SOON_EQ(std::string("jogo 1100"), Selected());
+  held(VK_UP);
+  EXPECT_SOON_EQ(std::string("jogo 1000"), Selected());
+  PressKey(VK_RETURN);
+  ExpectPlayed("jogo 1000.smc");
+}
+
 TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   Put("Saves\\ELAN.srm", "bateria E");
   Start();
