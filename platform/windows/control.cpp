@@ -25,7 +25,7 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
   switch (message) {
     case WM_GETDLGCODE:
       if (!control.EnterIsKey || !IsEnter(lParam)) break;
-      return ::CallWindowProcA(native, handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
+      return ::CallWindowProcW(native, handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
     case WM_KEYDOWN:
       if (control.OnKey && control.OnKey(static_cast<int>(wParam), (HIWORD(lParam) & KF_REPEAT) != 0)) return 0;
       if (control.Handle == nullptr) return 0;  // the key has closed the window
@@ -50,21 +50,22 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
       break;
     case WM_NCDESTROY:
       control.Handle = nullptr;
-      ::SetWindowLongPtrA(handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(native));
+      ::SetWindowLongPtrW(handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(native));
       break;
     default:
       break;
   }
-  return ::CallWindowProcA(native, handle, message, wParam, lParam);
+  return ::CallWindowProcW(native, handle, message, wParam, lParam);
 }
 
+// With the wide form the control takes and gives texts as it keeps them; who sends it ANSI has them converted.
 // Not with SetWindowSubclass, which looks up a property of the window at each message: under Wine that takes twenty
 // times as long as to add an entry to a list.
 void TakeMessages(ControlState& control) {
   if (control.Handle == nullptr) return;
   ::SetWindowLongPtrA(control.Handle, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(&control));
   control.Native = reinterpret_cast<WNDPROC>(
-      ::SetWindowLongPtrA(control.Handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(ControlProcedure)));
+      ::SetWindowLongPtrW(control.Handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(ControlProcedure)));
 }
 
 // Arrow keys move between neighbours of the same kind, Tab between all.

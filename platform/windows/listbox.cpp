@@ -4,18 +4,21 @@
 #include "platform/controls.h"
 #include "platform/windows/order.h"
 #include "platform/windows/state.h"
+#include "platform/windows/wide.h"
 
 namespace platform {
 namespace {
 
+// A list is a window of wide texts: Wine's conversion of an entry's text, between such a list and one who asks for
+// ANSI, has room for 512 characters, and does not look.
 std::string TextOf(HWND list, int index) {
-  const LRESULT length = ::SendMessageA(list, LB_GETTEXTLEN, static_cast<WPARAM>(index), 0);
+  const LRESULT length = ::SendMessageW(list, LB_GETTEXTLEN, static_cast<WPARAM>(index), 0);
   if (index < 0 || length <= 0) return {};
-  std::string text(static_cast<std::size_t>(length) + 1, '\0');  // with the closing zero
+  std::wstring text(static_cast<std::size_t>(length) + 1, L'\0');  // with the closing zero
   const LRESULT copied =
-      ::SendMessageA(list, LB_GETTEXT, static_cast<WPARAM>(index), reinterpret_cast<LPARAM>(text.data()));
+      ::SendMessageW(list, LB_GETTEXT, static_cast<WPARAM>(index), reinterpret_cast<LPARAM>(text.data()));
   text.resize(copied > 0 ? static_cast<std::size_t>(copied) : 0);
-  return text;
+  return ToAnsi(text);
 }
 
 // What LB_FINDSTRINGEXACT finds, for the list of a closed window.
@@ -61,7 +64,7 @@ ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) 
 }
 
 void ListBox::Add(const std::string& text) {
-  ::SendMessageA(state_->Handle, LB_ADDSTRING, 0, reinterpret_cast<LPARAM>(text.c_str()));
+  ::SendMessageW(state_->Handle, LB_ADDSTRING, 0, reinterpret_cast<LPARAM>(ToWide(text).c_str()));
 }
 
 // Texts that are in the list's own order already need no place looked up for them, which would be most of the work. A
@@ -73,8 +76,8 @@ void ListBox::Fill(const std::vector<std::string>& texts) {
   ::SendMessageA(state_->Handle, WM_SETREDRAW, FALSE, 0);
   Clear();
   for (const std::string* text : AsListed(texts, sorted)) {
-    ::CallWindowProcA(state_->Native, state_->Handle, LB_INSERTSTRING, static_cast<WPARAM>(-1),
-                      reinterpret_cast<LPARAM>(text->c_str()));
+    ::CallWindowProcW(state_->Native, state_->Handle, LB_INSERTSTRING, static_cast<WPARAM>(-1),
+                      reinterpret_cast<LPARAM>(ToWide(*text).c_str()));
   }
   ::SendMessageA(state_->Handle, WM_SETREDRAW, TRUE, 0);
   ::InvalidateRect(state_->Handle, nullptr, TRUE);
@@ -101,8 +104,8 @@ void ListBox::Select(int index) { ::SendMessageA(state_->Handle, LB_SETCURSEL, s
 
 int ListBox::FindExact(const std::string& text) const {
   if (state_->Handle == nullptr) return FindExactIn(state_->LastTexts, text);
-  return static_cast<int>(::SendMessageA(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
-                                         reinterpret_cast<LPARAM>(text.c_str())));
+  return static_cast<int>(::SendMessageW(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
+                                         reinterpret_cast<LPARAM>(ToWide(text).c_str())));
 }
 
 }  // namespace platform

@@ -24,6 +24,27 @@ TEST_F(List, ShowsTheCataloguesNamesSortedAndSelectsTheLastGameInAnyLetterCase) 
   EXPECT_TRUE(window->Play.Enabled());
 }
 
+TEST_F(List, HoldsNamesOfAnyLength) {
+  const std::string names[] = {std::string(700, 'x'), std::string(5000, 'y')};
+  Put("tolvaris.dat", "|AGUA=" + names[0] + "||ZEBRA=" + names[1] + "|");
+  Start();
+  EXPECT_EQ(Entries(window->List), (Texts{"abelha", "Corrida das Nuvens", "elan", names[0], names[1]}));
+  EXPECT_SOON(window->List.Focused());
+  PressKey('X');
+  EXPECT_SOON_EQ(names[0], Selected());
+  PressKey(VK_RETURN);
+  ExpectPlayed("agua.smc");
+  PressKey(VK_DOWN);
+  EXPECT_SOON_EQ(names[1], Selected());
+  PressKey(VK_RETURN);
+  ExpectPlayed("ZEBRA.SMC");
+  window->Pictures[Delete].Click();
+  EXPECT_EQ(Answer(IDNO).Text, "Deletar o jogo ' " + names[1] + " ' ?");
+  window->CloseByUser();
+  EXPECT_SOON(program->HasEnded());
+  EXPECT_EQ(program->ExitCode(), 0U);
+}
+
 TEST_F(List, PreviewFollowsTheSelection) {
   const COLORREF red = RGB(220, 20, 40);
   const COLORREF green = RGB(10, 200, 60);

@@ -16,6 +16,12 @@ Program::Program(std::string commandLine, const std::string& directory) : job_(C
   ResumeThread(process_.hThread);
 }
 
+DWORD Program::ExitCode() const {
+  DWORD code = STILL_ACTIVE;
+  GetExitCodeProcess(process_.hProcess, &code);
+  return code;
+}
+
 Program::~Program() {
   TerminateJobObject(job_, 1);
   WaitForSingleObject(process_.hProcess, Limit);

@@ -15,6 +15,7 @@ class Program {
   Program& operator=(const Program&) = delete;
 
   DWORD Id() const { return process_.dwProcessId; }
+  DWORD ExitCode() const;  // once it has ended: 0 when nothing went wrong
   bool HasEnded() const { return WaitForSingleObject(process_.hProcess, 0) == WAIT_OBJECT_0; }
 
  private:
