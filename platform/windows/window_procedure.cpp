@@ -52,6 +52,7 @@ void ChangeIcon(IconHandle& icon, const WindowState& window, WPARAM size, int si
 }
 
 void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
+  if (dpi == 0) return;
   window.Dpi = dpi;
   PlaceWindow(window, suggested.left, suggested.top);
   LayOutWindow(window);
@@ -103,6 +104,13 @@ bool MouseAsksForToolTip(const WindowState& window) {
   });
 }
 
+// Any program can send any message: these, which come with a pointer, without one.
+bool LacksItsPointer(UINT message, LPARAM lParam) {
+  const bool hasOne =
+      message == WM_DRAWITEM || message == WM_NOTIFY || message == WM_DPICHANGED || message == WM_NCCREATE;
+  return hasOne && lParam == 0;
+}
+
 // Whether the message is answered here, and the answer.
 std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
@@ -151,12 +159,13 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
 }
 
 LRESULT CALLBACK WindowProcedure(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
-  if (message == WM_NCCREATE) {
-    auto* window = static_cast<WindowState*>(reinterpret_cast<const CREATESTRUCTA*>(lParam)->lpCreateParams);
+  if (LacksItsPointer(message, lParam)) return 0;
+  auto* window = reinterpret_cast<WindowState*>(::GetWindowLongPtrA(handle, GWLP_USERDATA));
+  if (window == nullptr && message == WM_NCCREATE) {  // once: what is told about a window that stands is not believed
+    window = static_cast<WindowState*>(reinterpret_cast<const CREATESTRUCTA*>(lParam)->lpCreateParams);
     window->Handle = handle;
     ::SetWindowLongPtrA(handle, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(window));
   }
-  auto* window = reinterpret_cast<WindowState*>(::GetWindowLongPtrA(handle, GWLP_USERDATA));
   if (window != nullptr) {
     if (message == WM_NCDESTROY) {
       window->Handle = nullptr;

@@ -89,6 +89,19 @@ TEST_F(NativeWindow, PictureIsDecodedOnceNoInputWaits) {
   EXPECT_EQ(colour(), darker);
 }
 
+// Another program's message; in this process also those arrive that Wine does not carry between two.
+TEST_F(NativeWindow, TakesAMessageWithoutWhatItShouldPointTo) {
+  const Bounds before = {window.Left(), window.Top(), window.Width(), window.Height()};
+  for (const UINT message : {WM_NCCREATE, WM_DRAWITEM, WM_NOTIFY, WM_DPICHANGED}) {
+    ::SendMessageA(window.State().Handle, message, 0, 0);
+  }
+  CREATESTRUCTA another{};
+  ::SendMessageA(window.State().Handle, WM_NCCREATE, 0, reinterpret_cast<LPARAM>(&another));
+  EXPECT_EQ((Bounds{window.Left(), window.Top(), window.Width(), window.Height()}), before);
+  Click(button);
+  EXPECT_EQ(Seen(), "button /-1/0/0");
+}
+
 TEST_F(NativeWindow, IsDrawnAlsoWhereEventsBringNoOthers) {
   bool drawn = false;
   QueueEvent([&] {
