@@ -6,6 +6,7 @@
 #include "mainwindow/mensagens.h"
 #include "platform/events.h"
 #include "platform/registry.h"
+#include "platform/screen.h"
 #include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
@@ -68,8 +69,11 @@ bool Form1::Form_Load() {
 
 void Form1::RestaurarJanela() {
   Check1.SetValue(EstadoDisquete(LerTexto("Disquete")));
-  if (const auto Esquerda = EsquerdaInicial(LerTexto("pl"), Width(), platform::ScreenWidth())) SetLeft(*Esquerda);
-  if (const auto Topo = TopoInicial(LerTexto("pt"), Height(), platform::ScreenHeight())) SetTop(*Topo);
+  const platform::Bounds Janela = {.Width = Width(), .Height = Height()};
+  const platform::Bounds Tela = {.Width = platform::ScreenWidth(), .Height = platform::ScreenHeight()};
+  const auto [Esquerda, Topo] = CantoInicial(LerTexto("pl"), LerTexto("pt"), Janela, Tela, platform::Monitors());
+  if (Esquerda) SetLeft(*Esquerda);
+  if (Topo) SetTop(*Topo);
 }
 
 Form1::Configuracao Form1::VerificarConfiguracao() {

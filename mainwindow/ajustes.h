@@ -3,6 +3,9 @@
 
 #include <optional>
 #include <string>
+#include <vector>
+
+#include "platform/controls.h"
 
 // State of the floppy check box: only the number 1 is checked.
 int EstadoDisquete(const std::string& Texto);
@@ -13,3 +16,12 @@ std::optional<int> EsquerdaInicial(const std::string& Texto, int LarguraJanela, 
 
 // The same for the top edge, which lies below the screen's top and more than 255 twips above its bottom.
 std::optional<int> TopoInicial(const std::string& Texto, int AlturaJanela, int AlturaTela);
+
+// Where the window's corner goes: as the two above say of the primary monitor, whose size is that of Tela. A saved
+// corner that does not lie there, and does lie in the same way on another monitor that is there, is restored whole.
+struct Canto {
+  std::optional<int> Esquerda, Topo;
+  bool operator==(const Canto&) const = default;
+};
+Canto CantoInicial(const std::string& Esquerda, const std::string& Topo, const platform::Bounds& Janela,
+                   const platform::Bounds& Tela, const std::vector<platform::Bounds>& Monitores);

@@ -19,7 +19,7 @@ struct ControlState;  // of the implementation
 struct TimerState;    // of the implementation
 
 struct Bounds {
-  int Left, Top, Width, Height;
+  int Left = 0, Top = 0, Width = 0, Height = 0;
   bool operator==(const Bounds&) const = default;
 };
 
@@ -36,7 +36,7 @@ struct WindowStyle {
   int Background = 0;  // picture resource drawn from the client area's top left corner at 15 twips a pixel; 0: none
 };
 
-// A top-level window that cannot be resized. It is hidden until it is shown, and centred on the screen.
+// A top-level window that cannot be resized. It is hidden until it is shown, and centred on the primary monitor.
 class Window {
  public:
   explicit Window(const WindowStyle& style);
@@ -56,7 +56,7 @@ class Window {
   std::string Caption() const;
   void SetCaption(const std::string& caption);
 
-  // The whole window, its frame included.
+  // The whole window, its frame included, in twips of the screen (platform/screen.h) on whichever monitor it is.
   int Left() const;
   int Top() const;
   int Width() const;

@@ -21,8 +21,4 @@ void RunEventLoop();
 // Does nothing for so many milliseconds.
 void Sleep(std::uint32_t milliseconds);
 
-// Size of the screen's work area in twips.
-int ScreenWidth();
-int ScreenHeight();
-
 }  // namespace platform

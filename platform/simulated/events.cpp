@@ -37,9 +37,6 @@ void RunEventLoop() {
 
 void Sleep(std::uint32_t milliseconds) { TheMachine().Slept += milliseconds; }
 
-int ScreenWidth() { return TheMachine().ScreenWidth; }
-int ScreenHeight() { return TheMachine().ScreenHeight; }
-
 }  // namespace platform
 
 namespace platform::simulated {
@@ -58,10 +55,5 @@ int Pending() { return static_cast<int>(TheMachine().Events.size()); }
 int PendingEventRuns() { return TheMachine().PendingRuns; }
 
 std::uint64_t SleptMilliseconds() { return TheMachine().Slept; }
-
-void SetScreen(int widthTwips, int heightTwips) {
-  TheMachine().ScreenWidth = widthTwips;
-  TheMachine().ScreenHeight = heightTwips;
-}
 
 }  // namespace platform::simulated

@@ -93,7 +93,8 @@ struct Machine {
   std::vector<const WindowFacts*> Modal;  // the last one alone takes input; null: a message box or a file dialog
   int DroppedExceptions = 0;
   std::uint64_t Slept = 0;  // milliseconds
-  int ScreenWidth = 15360, ScreenHeight = 11520;
+  Bounds PrimaryMonitor = {0, 0, 15360, 11520};
+  std::vector<Bounds> OtherMonitors;
 
   std::intptr_t LastHandle = 0;  // of all kinds; goes on over Reset, so that no old handle means something new
 };

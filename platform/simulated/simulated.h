@@ -144,13 +144,13 @@ bool IsShown(const Window& window);
 Window* WindowFromHandle(std::int32_t handle);           // null when there is none
 std::vector<Control*> ControlsOf(const Window& window);  // in order of creation
 Bounds BoundsOf(const Control& control);                 // in the window's client area; a label's size is 0
-const Control* Focused();                         // the active window's control that has the keyboard focus, or null
-int IconOf(const Button& button);                 // its icon's number, 0: none
-int ResourceOf(const Picture& picture);           // the resource it came from, 0: none
-std::string ContentOf(const Picture& picture);    // the file content it came from
-std::uint32_t IntervalOf(const Timer& timer);     // milliseconds
-int DroppedExceptions();                          // how many have left a handler since Reset
-std::uint64_t SleptMilliseconds();                // since Reset; time passes only by sleeping and waiting
-void SetScreen(int widthTwips, int heightTwips);  // 15360 x 11520 after Reset
+const Control* Focused();                       // the active window's control that has the keyboard focus, or null
+int IconOf(const Button& button);               // its icon's number, 0: none
+int ResourceOf(const Picture& picture);         // the resource it came from, 0: none
+std::string ContentOf(const Picture& picture);  // the file content it came from
+std::uint32_t IntervalOf(const Timer& timer);   // milliseconds
+int DroppedExceptions();                        // how many have left a handler since Reset
+std::uint64_t SleptMilliseconds();              // since Reset; time passes only by sleeping and waiting
+void AddMonitor(const Bounds& place);           // beside the primary one, which has 15360 x 11520 twips
 
 }  // namespace platform::simulated

@@ -1,7 +1,7 @@
 #include <algorithm>
 #include <utility>
 
-#include "platform/controls.h"
+#include "platform/screen.h"
 #include "platform/simulated/machine.h"
 
 namespace platform {
@@ -20,8 +20,8 @@ Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(
   facts->Caption = style.Caption;
   facts->Width = style.ClientWidth + FrameWidth;
   facts->Height = style.ClientHeight + FrameHeight;
-  facts->Left = (TheMachine().ScreenWidth - facts->Width) / 2;
-  facts->Top = (TheMachine().ScreenHeight - facts->Height) / 2;
+  facts->Left = (ScreenWidth() - facts->Width) / 2;
+  facts->Top = (ScreenHeight() - facts->Height) / 2;
   facts->Handle = static_cast<std::int32_t>(++TheMachine().LastHandle);
   if (!TheMachine().MainWindow) TheMachine().MainWindow = facts;
   TheMachine().Windows.push_back(facts);
@@ -99,9 +99,20 @@ void Timer::Enable(bool enabled) {
   if (!state_->Window->Closed) state_->Enabled = enabled;
 }
 
+int ScreenWidth() { return TheMachine().PrimaryMonitor.Width; }
+int ScreenHeight() { return TheMachine().PrimaryMonitor.Height; }
+
+std::vector<Bounds> Monitors() {
+  std::vector<Bounds> monitors = TheMachine().OtherMonitors;
+  monitors.push_back(TheMachine().PrimaryMonitor);
+  return monitors;
+}
+
 }  // namespace platform
 
 namespace platform::simulated {
+
+void AddMonitor(const Bounds& place) { TheMachine().OtherMonitors.push_back(place); }
 
 bool TakesInput(const WindowFacts& window) {
   const std::vector<const WindowFacts*>& modal = TheMachine().Modal;

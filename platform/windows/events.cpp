@@ -99,14 +99,4 @@ void Window::ShowModal() {
 
 void Sleep(std::uint32_t milliseconds) { ::Sleep(milliseconds); }
 
-int ScreenWidth() {
-  const RECT area = WorkArea();
-  return ToTwips(area.right - area.left, DpiOfScreen());
-}
-
-int ScreenHeight() {
-  const RECT area = WorkArea();
-  return ToTwips(area.bottom - area.top, DpiOfScreen());
-}
-
 }  // namespace platform

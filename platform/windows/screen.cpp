@@ -3,6 +3,7 @@
 #include <utility>
 #include <vector>
 
+#include "platform/screen.h"
 #include "platform/windows/gdi_handle.h"
 #include "platform/windows/system_library.h"
 
@@ -25,12 +26,24 @@ HFONT CreateFontFor(const Font& font, int dpi) {
                        Face(dpi));
 }
 
+BOOL CALLBACK AddMonitor(HMONITOR, HDC, LPRECT place, LPARAM monitors) {
+  const int dpi = DpiOfScreen();
+  reinterpret_cast<std::vector<Bounds>*>(monitors)->push_back({ToTwips(place->left, dpi), ToTwips(place->top, dpi),
+                                                               ToTwips(place->right - place->left, dpi),
+                                                               ToTwips(place->bottom - place->top, dpi)});
+  return TRUE;
+}
+
 }  // namespace
 
-RECT WorkArea() {
-  RECT area = {};
-  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &area, 0);
-  return area;
+int ScreenWidth() { return ToTwips(::GetSystemMetrics(SM_CXSCREEN), DpiOfScreen()); }
+
+int ScreenHeight() { return ToTwips(::GetSystemMetrics(SM_CYSCREEN), DpiOfScreen()); }
+
+std::vector<Bounds> Monitors() {
+  std::vector<Bounds> monitors;
+  ::EnumDisplayMonitors(nullptr, nullptr, AddMonitor, reinterpret_cast<LPARAM>(&monitors));
+  return monitors;
 }
 
 // It stays the same for as long as the program runs.

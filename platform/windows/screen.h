@@ -10,7 +10,7 @@ namespace platform {
 inline constexpr int TwipsPerInch = 1440;
 inline constexpr int UsualDpi = 96;  // 15 twips a pixel
 
-RECT WorkArea();  // of the primary monitor, pixels
+// The whole screen's, in which all places on it are converted, whatever monitor they are on.
 int DpiOfScreen();
 int DpiOfWindow(HWND window);
 

@@ -4,10 +4,9 @@
 namespace platform {
 namespace {
 
-// In the middle of the work area.
+// In the middle of the primary monitor.
 POINT CornerFor(const SIZE& size) {
-  const RECT area = WorkArea();
-  return {area.left + (area.right - area.left - size.cx) / 2, area.top + (area.bottom - area.top - size.cy) / 2};
+  return {(::GetSystemMetrics(SM_CXSCREEN) - size.cx) / 2, (::GetSystemMetrics(SM_CYSCREEN) - size.cy) / 2};
 }
 
 void Create(WindowState& window) {
@@ -104,23 +103,23 @@ void Window::SetCaption(const std::string& caption) {
   if (::IsWindowVisible(state_->Handle)) SetNativeCaption(*state_);
 }
 
-int Window::Left() const { return ToTwips(PlaceOf(*state_).left, state_->Dpi); }
+int Window::Left() const { return ToTwips(PlaceOf(*state_).left, DpiOfScreen()); }
 
-int Window::Top() const { return ToTwips(PlaceOf(*state_).top, state_->Dpi); }
+int Window::Top() const { return ToTwips(PlaceOf(*state_).top, DpiOfScreen()); }
 
 int Window::Width() const {
   const RECT place = PlaceOf(*state_);
-  return ToTwips(place.right - place.left, state_->Dpi);
+  return ToTwips(place.right - place.left, DpiOfScreen());
 }
 
 int Window::Height() const {
   const RECT place = PlaceOf(*state_);
-  return ToTwips(place.bottom - place.top, state_->Dpi);
+  return ToTwips(place.bottom - place.top, DpiOfScreen());
 }
 
-void Window::SetLeft(int left) { MoveTo(*state_, ToPixels(left, state_->Dpi), PlaceOf(*state_).top); }
+void Window::SetLeft(int left) { MoveTo(*state_, ToPixels(left, DpiOfScreen()), PlaceOf(*state_).top); }
 
-void Window::SetTop(int top) { MoveTo(*state_, PlaceOf(*state_).left, ToPixels(top, state_->Dpi)); }
+void Window::SetTop(int top) { MoveTo(*state_, PlaceOf(*state_).left, ToPixels(top, DpiOfScreen())); }
 
 bool Window::Enabled() const {
   return state_->Handle != nullptr ? ::IsWindowEnabled(state_->Handle) != FALSE : state_->LastEnabled;

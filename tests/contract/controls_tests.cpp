@@ -1,3 +1,6 @@
+#include <algorithm>
+
+#include "platform/screen.h"
 #include "platform/text.h"
 #include "tests/contract/hand.h"
 
@@ -32,6 +35,14 @@ TEST_F(Controls, SortedListKeepsTheOrderOfTheLanguageAndFindsWholeTextsWithoutCa
     EXPECT_EQ(box.Text(box.FindExact("áGUA"_ansi)), "Água"_ansi);
     for (const char* text : {"Agua", "mac", "maca ", ""}) EXPECT_EQ(box.FindExact(text), -1) << text;
   }
+}
+
+TEST_F(Controls, WindowsAreCentredOnThePrimaryMonitor) {
+  const Bounds primary = {0, 0, ScreenWidth(), ScreenHeight()};
+  const std::vector<Bounds> monitors = Monitors();
+  EXPECT_NE(std::find(monitors.begin(), monitors.end(), primary), monitors.end());
+  EXPECT_NEAR(window.Left() + window.Width() / 2, primary.Width / 2, 30);
+  EXPECT_NEAR(window.Top() + window.Height() / 2, primary.Height / 2, 30);
 }
 
 TEST_F(Controls, SelectionInCodeIsSilentAndNeverGuesses) {

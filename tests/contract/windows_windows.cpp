@@ -2,6 +2,7 @@
 #include <windows.h>
 
 #include "platform/messages.h"
+#include "platform/screen.h"
 #include "platform/windows/state.h"
 #include "tests/contract/hand.h"
 #include "tests/contract/small_pictures.h"
@@ -22,8 +23,19 @@ TEST_F(NativeWindow, KeepsTheKeyboardForAControlThatIsSwitchedOff) {
   }
 }
 
-TEST_F(NativeWindow, IsCentredAndLaidOutAgainAtAnotherResolution) {
-  EXPECT_NEAR(window.Left() + window.Width() / 2, ScreenWidth() / 2, 30);
+// As beside a taskbar at the left and at the top.
+TEST_F(NativeWindow, StandsWhereItWouldWithoutATaskbar) {
+  RECT before = {};
+  ::SystemParametersInfoA(SPI_GETWORKAREA, 0, &before, 0);
+  RECT area = {before.left + 300, before.top + 200, before.right, before.bottom};
+  ::SystemParametersInfoA(SPI_SETWORKAREA, 0, &area, 0);
+  const Window other(window.State().Style);
+  EXPECT_EQ(std::pair(other.Left(), other.Top()), std::pair(window.Left(), window.Top()));
+  EXPECT_EQ(ScreenWidth() / 15 * GetDpiForSystem() / 96, static_cast<unsigned>(::GetSystemMetrics(SM_CXSCREEN)));
+  ::SystemParametersInfoA(SPI_SETWORKAREA, 0, &before, 0);
+}
+
+TEST_F(NativeWindow, IsLaidOutAgainAtAnotherResolutionAndStaysWhereItWasPut) {
   const HWND native = window.State().Handle;
   for (const auto& [dpi, fontHeight] : {std::pair(144, 36), std::pair(192, 48), std::pair(96, 24)}) {
     const RECT suggested = {40, 30, 50, 60};
@@ -35,6 +47,7 @@ TEST_F(NativeWindow, IsCentredAndLaidOutAgainAtAnotherResolution) {
     ::GetWindowRect(image.State().Handle, &place);
     ::MapWindowPoints(nullptr, native, reinterpret_cast<POINT*>(&place), 2);
     EXPECT_TRUE(client.right == 500 * dpi / 96 && client.bottom == 300 * dpi / 96) << dpi;
+    EXPECT_EQ(window.Left(), 600) << dpi;
     EXPECT_TRUE(whole.left == 40 && place.left == 310 * dpi / 96) << dpi;
     EXPECT_NEAR(place.bottom, (30 + 13) * dpi / 96, 1);
     LOGFONTA font = {};

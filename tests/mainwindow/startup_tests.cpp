@@ -23,6 +23,36 @@ TEST_F(Startup, SavedPositionKeepsPartOfTheWindowOnTheScreen) {
   for (const char* unchecked : {"", "0", "2", "-1", "abc"}) EXPECT_EQ(EstadoDisquete(unchecked), 0) << unchecked;
 }
 
+TEST_F(Startup, SavedPositionIsRestoredOnAnyMonitorThatIsThere) {
+  constexpr std::optional<int> none;
+  constexpr int centreLeft = (15360 - 7000) / 2;
+  const std::vector<platform::Bounds> monitors = {
+      {0, 0, 15360, 11520}, {15360, -2000, 9000, 8000}, {-9000, 0, 9000, 6000}};
+  const std::tuple<const char*, const char*, Canto> cases[] = {
+      {"16000", "-1999", {16000, -1999}},  // the right one, higher than the primary one
+      {"16000", "-2000", {none, none}},    // at its very top
+      {"24104", "100", {24104, 100}},      // 256 twips before its right edge
+      {"24105", "100", {none, 100}},
+      {"-15744", "5744", {-15744, 5744}},  // the left one's corner
+      {"-15745", "5744", {none, 5744}},
+      {"-8000", "5745", {none, 5745}},  // below the left one
+      {"1000", "-500", {1000, none}},   // above the primary one
+      {"16000", "", {none, (11520 - 4000) / 2}},
+      {"", "-500", {centreLeft, none}},
+      {"16000", "x", {none, none}},
+      {"2147483647", "-2147483648", {none, none}},
+  };
+  for (const auto& [left, top, corner] : cases) {
+    EXPECT_EQ(CantoInicial(left, top, {.Width = 7000, .Height = 4000}, monitors[0], monitors), corner) << left << top;
+  }
+  PutText(Key, "pl", "16000");
+  PutText(Key, "pt", "-1000");
+  AddMonitor(monitors[1]);
+  ASSERT_TRUE(Start());
+  EXPECT_EQ(form->Left(), 16000);
+  EXPECT_EQ(form->Top(), -1000);
+}
+
 TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   PutText(Key, "pl", "1500");
   PutText(Key, "pt", "3000");
