@@ -23,6 +23,15 @@ platform::WindowStyle Janela() {
 
 Form3* aberta = nullptr;  // the window, while it is shown
 
+// For as long as the window itself lives, closed or never made by the platform.
+class Lembrada {
+ public:
+  explicit Lembrada(Form3& janela) { aberta = &janela; }
+  ~Lembrada() { aberta = nullptr; }
+  Lembrada(const Lembrada&) = delete;
+  Lembrada& operator=(const Lembrada&) = delete;
+};
+
 }  // namespace
 
 Form3::Form3()
@@ -40,8 +49,7 @@ void Form3::ABRIR() {
   if (aberta) return;
   Form3 janela;
   janela.Preparar();
-  janela.OnUnload = [] { aberta = nullptr; };
-  aberta = &janela;
+  const Lembrada lembrada(janela);
   janela.ShowModal();
 }
 

@@ -37,6 +37,7 @@ struct WindowStyle {
 };
 
 // A top-level window that cannot be resized. It is hidden until it is shown, and centred on the primary monitor.
+// One that the platform cannot make is closed from the beginning.
 class Window {
  public:
   explicit Window(const WindowStyle& style);

@@ -91,6 +91,7 @@ struct Machine {
   std::vector<std::shared_ptr<WindowFacts>> Windows;  // those that exist, in order of creation
   std::shared_ptr<WindowFacts> MainWindow;
   std::vector<const WindowFacts*> Modal;  // the last one alone takes input; null: a message box or a file dialog
+  bool RefusesWindows = false;
   int DroppedExceptions = 0;
   std::uint64_t Slept = 0;  // milliseconds
   Bounds PrimaryMonitor = {0, 0, 15360, 11520};

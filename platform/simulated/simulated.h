@@ -151,6 +151,7 @@ std::string ContentOf(const Picture& picture);  // the file content it came from
 std::uint32_t IntervalOf(const Timer& timer);   // milliseconds
 int DroppedExceptions();                        // how many have left a handler since Reset
 std::uint64_t SleptMilliseconds();              // since Reset; time passes only by sleeping and waiting
-void AddMonitor(const Bounds& place);           // beside the primary one, which has 15360 x 11520 twips
+void RefuseWindows(bool refused = true);  // the next ones are not made: such a window is closed from the beginning
+void AddMonitor(const Bounds& place);     // beside the primary one, which has 15360 x 11520 twips
 
 }  // namespace platform::simulated

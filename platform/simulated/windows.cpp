@@ -17,6 +17,7 @@ constexpr int FrameWidth = 90, FrameHeight = 375;  // twips that the frame adds 
 Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>()) {
   auto facts = std::make_shared<WindowFacts>();
   facts->Self = this;
+  facts->Closed = TheMachine().RefusesWindows;
   facts->Caption = style.Caption;
   facts->Width = style.ClientWidth + FrameWidth;
   facts->Height = style.ClientHeight + FrameHeight;
@@ -111,6 +112,8 @@ std::vector<Bounds> Monitors() {
 }  // namespace platform
 
 namespace platform::simulated {
+
+void RefuseWindows(bool refused) { TheMachine().RefusesWindows = refused; }
 
 void AddMonitor(const Bounds& place) { TheMachine().OtherMonitors.push_back(place); }
 

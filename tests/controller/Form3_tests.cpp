@@ -35,4 +35,16 @@ TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
   EXPECT_EQ(Mensagens(), lembretes) << "also: both windows were opened";
 }
 
+TEST(Form3, OpensAgainAfterAWindowThatCouldNotBeMade) {
+  Maquina::Reiniciar();
+  RefuseWindows();
+  Form3::ABRIR();
+  Form3::Descarregar();
+  RefuseWindows(false);
+  bool aberta = false;
+  QueueModal([&](platform::Window&) { aberta = true; });
+  Form3::ABRIR();
+  EXPECT_TRUE(aberta);
+}
+
 }  // namespace
