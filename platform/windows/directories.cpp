@@ -10,6 +10,7 @@
 #include "platform/wildcards.h"
 #include "platform/windows/order.h"
 #include "platform/windows/paths.h"
+#include "platform/windows/wide.h"
 
 namespace platform {
 namespace {
@@ -22,21 +23,34 @@ struct FindCloser {
 };
 using FindHandle = std::unique_ptr<void, FindCloser>;  // null: nothing found
 
-FindHandle FindFirst(const std::string& pattern, WIN32_FIND_DATAA& data) {
-  const HANDLE find = ::FindFirstFileExA(WindowsPath(pattern), FindExInfoStandard, &data, FindExSearchNameMatch,
-                                         nullptr, FIND_FIRST_EX_LARGE_FETCH);
+FindHandle FindFirst(const std::string& pattern, WIN32_FIND_DATAW& data) {
+  const HANDLE find = ::FindFirstFileExW(ToWide(WindowsPath(pattern)).c_str(), FindExInfoStandard, &data,
+                                         FindExSearchNameMatch, nullptr, FIND_FIRST_EX_LARGE_FETCH);
   return FindHandle(find == INVALID_HANDLE_VALUE ? nullptr : find);
 }
 
-DirectoryEntry EntryOf(const WIN32_FIND_DATAA& data) { return {data.cFileName, data.cAlternateFileName}; }
+// An entry that cannot be read leaves those behind it; a disk that goes on failing ends the listing.
+bool FindNext(const FindHandle& find, WIN32_FIND_DATAW& data) {
+  constexpr int mostFailures = 8;
+  for (int failures = 0; failures < mostFailures; ++failures) {
+    if (::FindNextFileW(find.get(), &data)) return true;
+    if (::GetLastError() == ERROR_NO_MORE_FILES) return false;
+  }
+  return false;
+}
+
+// The wide structure holds every name, where that of ANSI has 260 bytes and fails at a longer one.
+DirectoryEntry EntryOf(const WIN32_FIND_DATAW& data) {
+  return {ToAnsi(data.cFileName), ToAnsi(data.cAlternateFileName)};
+}
 
 // What a directory holds, as far as it is wanted, in the order of the names.
 template <typename Wanted>
 std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& wanted) {
   std::vector<DirectoryEntry> found;
-  WIN32_FIND_DATAA data;
+  WIN32_FIND_DATAW data;
   const FindHandle find = FindFirst(directory + "*", data);
-  for (bool more = find != nullptr; more; more = ::FindNextFileA(find.get(), &data) != 0) {
+  for (bool more = find != nullptr; more; more = FindNext(find, data)) {
     if (wanted(data)) found.push_back(EntryOf(data));
   }
   std::vector<const std::string*> names;
@@ -49,9 +63,9 @@ std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& 
   return entries;
 }
 
-bool IsSubdirectory(const WIN32_FIND_DATAA& data) {
-  const std::string_view name = data.cFileName;
-  return (data.dwFileAttributes & NotListed) == FILE_ATTRIBUTE_DIRECTORY && name != "." && name != "..";
+bool IsSubdirectory(const WIN32_FIND_DATAW& data) {
+  const std::wstring_view name = data.cFileName;
+  return (data.dwFileAttributes & NotListed) == FILE_ATTRIBUTE_DIRECTORY && name != L"." && name != L"..";
 }
 
 bool HasWildcard(const std::string& path) {
@@ -65,8 +79,9 @@ bool HasWildcard(const std::string& path) {
 // find "a.zipx", and which would read the directory anew for each pattern.
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
   const std::string wanted = CharUpperBuffA(patterns);
-  return Collect(directory, [&](const WIN32_FIND_DATAA& data) {
-    return (data.dwFileAttributes & NotListed) == 0 && MatchesAnyPattern(CharUpperBuffA(data.cFileName), wanted);
+  return Collect(directory, [&](const WIN32_FIND_DATAW& data) {
+    return (data.dwFileAttributes & NotListed) == 0 &&
+           MatchesAnyPattern(CharUpperBuffA(ToAnsi(data.cFileName)), wanted);
   });
 }
 
@@ -78,7 +93,7 @@ std::vector<std::string> ListSubdirectories(const std::string& directory) {
 
 std::optional<DirectoryEntry> ListPath(const std::string& path) {
   if (HasWildcard(path)) return std::nullopt;
-  WIN32_FIND_DATAA data;
+  WIN32_FIND_DATAW data;
   if (!FindFirst(path, data) || data.dwFileAttributes & NotListed) return std::nullopt;
   return EntryOf(data);
 }

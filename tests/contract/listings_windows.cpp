@@ -1,0 +1,63 @@
+// Listings of directories in which Windows cannot read everything.
+#include <windows.h>
+
+#include <utility>
+#include <vector>
+
+#include "tests/contract/machine.h"
+
+extern "C" decltype(&::FindNextFileW) __imp_FindNextFileW;  // where the program's calls of the function lead
+
+namespace {
+
+using namespace contract;
+
+// How many calls from the second one on fail, and how many were made.
+int failing = 0, calls = 0;
+decltype(&::FindNextFileW) original = nullptr;
+
+BOOL WINAPI FindNextFileThatFails(HANDLE find, LPWIN32_FIND_DATAW data) {
+  if (++calls == 1 || calls > failing + 1) return original(find, data);
+  ::SetLastError(ERROR_FILENAME_EXCED_RANGE);
+  return FALSE;
+}
+
+class BrokenListings : public Machine {
+ protected:
+  BrokenListings() {
+    failing = 0;
+    for (const char* name : {"a.zip", "b.zip", "c.zip"}) Put(here_ + name);
+    DWORD access = 0;
+    ::VirtualProtect(&__imp_FindNextFileW, sizeof original, PAGE_READWRITE, &access);
+    original = std::exchange(__imp_FindNextFileW, FindNextFileThatFails);
+  }
+  ~BrokenListings() override { __imp_FindNextFileW = original; }
+
+  std::size_t Listed(int failingCalls) const {
+    failing = failingCalls;
+    calls = 0;
+    return ListDirectory(here_, "*").size();
+  }
+};
+
+TEST_F(BrokenListings, GoOnBehindAnEntryThatFailsAndEndWhereEverythingDoes) {
+  EXPECT_EQ(Listed(0), 3U);
+  EXPECT_EQ(Listed(1), 3U);
+  EXPECT_LT(Listed(1'000'000), 3U);
+  EXPECT_LT(calls, 20) << "a disk that is gone must not keep the program";
+}
+
+// As they are in the ANSI form of Windows' own listing: a letter that looks like it, or "?".
+TEST_F(BrokenListings, HoldNamesThatTheCodePageLacks) {
+  for (const wchar_t* name : {L"\u0100.smc", L"\u65E5.smc"}) {
+    const std::wstring path = std::wstring(here_.begin(), here_.end()) + name;
+    const HANDLE file = ::CreateFileW(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW, 0, nullptr);
+    EXPECT_NE(file, INVALID_HANDLE_VALUE);
+    ::CloseHandle(file);
+  }
+  std::vector<string> names;
+  for (const DirectoryEntry& entry : ListDirectory(here_, "*.smc")) names.push_back(entry.Name);
+  EXPECT_EQ(names, (std::vector<string>{"?.smc", "A.smc"}));
+}
+
+}  // namespace
