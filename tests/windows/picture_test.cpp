@@ -25,7 +25,7 @@ std::string LargeBmp(COLORREF colour) {
 }
 
 TEST_F(Pictures, ThatAreOnlyPassedByHoldNobodyUp) {
-  constexpr int games = 50;
+  constexpr int games = 100;
   Put("Imgs\\Zebra.gif", Gif(red));
   for (int i = 1; i <= games; ++i) {
     const std::string name = "zz" + std::to_string(100 + i);
