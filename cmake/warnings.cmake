@@ -9,6 +9,10 @@ if(TOLVARIS_SANITIZE)
     -fno-omit-frame-pointer)
   target_link_options(tolvaris_options INTERFACE -fsanitize=address,undefined)
 endif()
+if(TOLVARIS_FUZZ)
+  # The fuzzer sees which code its inputs reach; the targets alone are linked with it.
+  target_compile_options(tolvaris_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
 if(WIN32)
   target_compile_options(tolvaris_options INTERFACE $<$<COMPILE_LANGUAGE:CXX>:-ffunction-sections -fdata-sections>)
   # The same sources give the same programs: no time of the build goes into them.

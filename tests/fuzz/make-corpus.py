@@ -1,5 +1,9 @@
 #!/usr/bin/env python3
-"""Writes the packages that the fuzzer begins with: make-corpus.py DIRECTORY"""
+"""Writes what the fuzzer begins with: make-corpus.py DIRECTORY [TARGET...]
+
+For each target, or those named: the directory TARGET of first inputs, the dictionary TARGET.dict of words that inputs
+are made of, and TARGET.longest, the length in bytes beyond which an input only costs time.
+"""
 import sys
 from pathlib import Path
 
@@ -10,7 +14,7 @@ from pacote import HEADER_LIMIT, build  # noqa: E402
 EXAMPLE = build(b"Super Jogo", b"SUPERJOG", b"-873187034", b"GIF89a", b"123456789")
 LONGEST = HEADER_LIMIT - len(build(b"", b"", b"1", b"I", b"R")) + len(b"IR")
 
-SEEDS = {
+PACKAGES = {
     "example": EXAMPLE,
     "accents": build("Ação|Pão=1".encode("cp1252"), b"ACAO", b"1", b"BM", b"PK\3\4"),
     "other-case": EXAMPLE[:104].swapcase() + EXAMPLE[104:],
@@ -24,6 +28,74 @@ SEEDS = {
     "pieces": b"Super Jogo\nSUPERJOG\n-873187034\nGIF89a\n123456789",
     "pieces-odd": b" \xe7.\nLPT0 .a\n\r\r\n\0\n\n",
 }
+PACKAGE_WORDS = [
+    b"TOLVARIS", b"NOME=", b"NOMEDOS=", b"CRC=", b"iIMG=", b"tIMG=", b"iROM=", b"tROM=", b"|IMGROMDAT|", b"\r\n",
+    b"2147483647", b"2147483648", b"4294967297", b"18446744073709551616", b"CON", b"LPT1", b"..\\",
+]
 
-for file, content in SEEDS.items():
-    (Path(sys.argv[1]) / file).write_bytes(content)
+CATALOGUES = {
+    "entries": b"elan\nZebra\n|AGUA=\xc1gua Viva||ZEBRA=Zebra||ELAN=\xc9lan||AGUA=Outra|",
+    "broken": b"a\na=b\na=b|A=|=a|=|||A==a|a|A=a=b|A",
+    "empty": b"novo\nNave Nova\n",
+    "marks-in-names": b"A=B\na|b\n|A=B=a|b||C=",
+}
+CATALOGUE_WORDS = [b"|", b"=", b"|A=", b"=a|", b"|A=a|", b"||", b"=="]
+
+LANGUAGES = {
+    "example": b"Jogo\n| word |\n[OUTRA]\r\nJogo=Wrong\r\n[TOLVARIS20]\r\nJogo=Game\r\nDuas=||\r\n",
+    "quotes": b"Erro ao gravar\n\"a|b\"\n; Jogo=x\n[ tolvaris20 ] x\n  erro AO gravar  =  'Error'  \r\n[TOLVARIS20\n",
+    "bars": b"Tres\n|||\n[TOLVARIS20]\nTres=|||\nTres=x",
+    "long": b"Longo\n" + b"x" * 260 + b"\n[TOLVARIS20]\r\nLongo=" + b"|" * 3 + b"y" * 300,
+}
+LANGUAGE_WORDS = [b"[TOLVARIS20]", b"[", b"]", b"=", b";", b"|", b"||", b"\"", b"'", b"\r\n", b"\x1a"]
+
+ENTRIES = b"SaveDirectory = C:\\T\\Saves\r\nGameDirectory = C:\\T\\Roms\r\n"
+EMULATOR_CONFIGURATIONS = {
+    "right": b"C:\\T\\Saves\\\nC:\\T\\Roms\\\n" + ENTRIES,
+    "another-case": b"c:\\t\\SAVES\\\nC:\\T\\Roms\\\n" + ENTRIES.swapcase(),
+    "floppy": b"A:\\\nC:\\T\\Roms\\\na = 1\r\n" + ENTRIES + b"b=2",
+    "line-feeds": b"C:\\S\\\nC:\\R\\\n; a remark\n" + ENTRIES.replace(b"\r", b"") + b"c",
+    "repeated": b"C:\\S\\\nC:\\R\\\nSaveDirectory = X\r\n;SaveDirectory = X\r\nSaveDirectory = X",
+    "missing": b"C:\\S\\\nC:\\R\\\nSaveDirectory=C:\\S\r\n",
+    "empty-value": b"\n\nSaveDirectory =\r\nGameDirectory = ",
+}
+EMULATOR_WORDS = [b"SaveDirectory = ", b"GameDirectory = ", b"savedirectory =", b"GAMEDIRECTORY =", b"\r\n", b"\n", b"\\"]
+
+NEWER = b"ROMPath=\"C:\\\\T\\\\Roms\"\r\nSRAMPath=\"D:\\\\\"\r\n"
+NEWER_CONFIGURATIONS = {
+    "right": b"C:\\T\\Roms\\\nD:\\\n" + NEWER,
+    "another-case": b"c:\\t\\ROMS\nD:\n" + NEWER,
+    "changed": b"C:\\R\\\nC:\\S\\\n; mine\r\n" + NEWER + b"b=\"x\"",
+    "line-feeds": b"C:\\R\\\nC:\\S\\\n" + NEWER.replace(b"\r", b"") + b"c",
+    "behind": b"C:\\R\\\nC:\\S\\\nROMPath=\"X\" ; mine\r\nSRAMPath=C:\\S x",
+    "missing": b"C:\\R\\\nC:\\S\\\nROMPath=\"1\"\nROMPath=\"2",
+    "empty": b"\n\n",
+}
+NEWER_WORDS = [b"ROMPath=", b"SRAMPath=", b"ROMPath=\"\"", b"SRAMPath=\"C:\\\\\"", b"\"", b"\\\\", b"\\\"", b"\r\n"]
+
+# By target: the first inputs, the words, and the longest input.
+TARGETS = {
+    "package": (PACKAGES, PACKAGE_WORDS, 12000),
+    "catalogue": (CATALOGUES, CATALOGUE_WORDS, 160),
+    "language": (LANGUAGES, LANGUAGE_WORDS, 1000),
+    "emulator_configuration": (EMULATOR_CONFIGURATIONS, EMULATOR_WORDS, 1000),
+    "newer_configuration": (NEWER_CONFIGURATIONS, NEWER_WORDS, 1000),
+}
+
+
+def quoted(word):
+    return '"' + "".join(f"\\x{byte:02X}" for byte in word) + '"\n'
+
+
+def main():
+    directory = Path(sys.argv[1])
+    for target in sys.argv[2:] or TARGETS:
+        inputs, words, longest = TARGETS[target]
+        (directory / target).mkdir(parents=True, exist_ok=True)
+        for name, content in inputs.items():
+            (directory / target / name).write_bytes(content)
+        (directory / f"{target}.dict").write_text("".join(map(quoted, words)))
+        (directory / f"{target}.longest").write_text(f"{longest}\n")
+
+
+main()
