@@ -3,10 +3,11 @@
 
 declare -i passed=0 failed=0 skipped=0
 
-# A display and a Wine prefix of the tests' own, which all programs under scripts/wine-run then use.
+# A display and a Wine prefix of the tests' own, which all programs under scripts/wine-run then use; another name is
+# another prefix, for what may run at the same time: prepare_test_machine [NAME]
 prepare_test_machine() {
   start_display
-  prepare_prefix build/prefixes/tests
+  prepare_prefix "build/prefixes/${1:-tests}"
   mount_floppy "$WINEPREFIX/drive_c/Disquete1440" || say "No floppy-sized disk can be mounted here"
   # A disk is in drive A: while a test has made this directory.
   set_drive a "$WINEPREFIX/drive_c/Disquete1440/Disco"
