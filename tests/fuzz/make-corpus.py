@@ -4,7 +4,9 @@
 For each target, or those named: the directory TARGET of first inputs, the dictionary TARGET.dict of words that inputs
 are made of, and TARGET.longest, the length in bytes beyond which an input only costs time.
 """
+import struct
 import sys
+import zlib
 from pathlib import Path
 
 sys.dont_write_bytecode = True
@@ -73,12 +75,45 @@ NEWER_CONFIGURATIONS = {
 }
 NEWER_WORDS = [b"ROMPath=", b"SRAMPath=", b"ROMPath=\"\"", b"SRAMPath=\"C:\\\\\"", b"\"", b"\\\\", b"\\\"", b"\r\n"]
 
+
+def chunk(kind, data):
+    return struct.pack(">I", len(data)) + kind + data + struct.pack(">I", zlib.crc32(kind + data))
+
+
+def segment(marker, data):
+    return struct.pack(">BBH", 0xFF, marker, len(data) + 2) + data
+
+
+BMP_ROWS = b"\1\2\3\0" * 2
+GIF_IMAGE = b",\0\0\0\0\2\0\2\0\0\2\2\x44\1\0"
+JPEG_FRAME = segment(0xC0, b"\x08\0\x08\0\x08\1\1\x11\0")
+JPEG_SCAN = segment(0xDA, b"\1\1\0\0\x3f\0") + b"\x3f\xff\0\xff\xd0\x12"
+PNG_START = b"\x89PNG\r\n\x1a\n"
+PICTURES = {
+    "bmp": b"BM" + struct.pack("<IIIIiiHHIIIIII", 62, 0, 54, 40, 3, -2, 1, 8, 0, 0, 0, 0, 0, 0) + BMP_ROWS,
+    "bmp-old": b"BM" + struct.pack("<IIIIHHHH", 34, 0, 26, 12, 3, 2, 1, 8) + BMP_ROWS,
+    "bmp-runs": b"BM" + struct.pack("<IIIIiiHHIIIIII", 62, 0, 54, 40, 3, 2, 1, 8, 1, 8, 0, 0, 0, 0) + BMP_ROWS,
+    "gif": b"GIF89a\2\0\2\0\x80\0\0abcdef!\xf9\4\1\0\0\0\0" + GIF_IMAGE + b";",
+    "gif-empty-screen": b"GIF87a\0\0\0\0\0\0\0" + GIF_IMAGE + GIF_IMAGE,
+    "jpeg": b"\xff\xd8" + segment(0xE1, JPEG_FRAME) + JPEG_FRAME + JPEG_SCAN + b"\xff\xd9",
+    "jpeg-scans": b"\xff\xd8" + JPEG_FRAME + JPEG_SCAN + b"\xff" + JPEG_SCAN + JPEG_SCAN + b"\xff\xff\xd9more",
+    "png": PNG_START + chunk(b"IHDR", struct.pack(">IIBBBBB", 2, 2, 8, 2, 0, 0, 0))
+    + chunk(b"IDAT", zlib.compress(b"\0abcdef" * 2)) + chunk(b"IEND", b""),
+    "pieces": b"\0\x10\0\x20first\nsecond\nthird \xff",
+    "pieces-large": b"\xff\xff\xff\xff\n\n\xff\0\xff\xd9",
+}
+PICTURE_WORDS = [
+    b"BM", b"GIF89a", b"GIF87a", b"\xff\xd8\xff", b"\xff\xc0", b"\xff\xda", b"\xff\xd9", b"\xff\xd0", PNG_START,
+    b"IHDR", b"IDAT", b"IEND", b"!\xf9", b",", b"\xff\xff", b"\xff\xff\xff\x7f", b"\0\0\0\x80",
+]
+
 # By target: the first inputs, the words, and the longest input.
 TARGETS = {
     "package": (PACKAGES, PACKAGE_WORDS, 12000),
     "catalogue": (CATALOGUES, CATALOGUE_WORDS, 160),
     "language": (LANGUAGES, LANGUAGE_WORDS, 1000),
     "emulator_configuration": (EMULATOR_CONFIGURATIONS, EMULATOR_WORDS, 1000),
+    "picture": (PICTURES, PICTURE_WORDS, 600),
     "newer_configuration": (NEWER_CONFIGURATIONS, NEWER_WORDS, 1000),
 }
 
