@@ -93,6 +93,7 @@ PICTURES = {
     "bmp": b"BM" + struct.pack("<IIIIiiHHIIIIII", 62, 0, 54, 40, 3, -2, 1, 8, 0, 0, 0, 0, 0, 0) + BMP_ROWS,
     "bmp-old": b"BM" + struct.pack("<IIIIHHHH", 34, 0, 26, 12, 3, 2, 1, 8) + BMP_ROWS,
     "bmp-runs": b"BM" + struct.pack("<IIIIiiHHIIIIII", 62, 0, 54, 40, 3, 2, 1, 8, 1, 8, 0, 0, 0, 0) + BMP_ROWS,
+    "bmp-largest": b"BM" + struct.pack("<IIIIiiHHIIIIII", 62, 0, 54, 40, 8000, 8000, 1, 8, 1, 8, 0, 0, 0, 0) + BMP_ROWS,
     "gif": b"GIF89a\2\0\2\0\x80\0\0abcdef!\xf9\4\1\0\0\0\0" + GIF_IMAGE + b";",
     "gif-empty-screen": b"GIF87a\0\0\0\0\0\0\0" + GIF_IMAGE + GIF_IMAGE,
     "jpeg": b"\xff\xd8" + segment(0xE1, JPEG_FRAME) + JPEG_FRAME + JPEG_SCAN + b"\xff\xd9",
