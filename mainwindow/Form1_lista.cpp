@@ -74,6 +74,7 @@ void Form1::EncherLista(const std::vector<platform::DirectoryEntry>& Arquivos) {
   const std::string DirCurto = CaminhoCurto(DirRoms);
   std::vector<Jogo> Novos(Arquivos.size());
   std::vector<std::string> Nomes;
+  Nomes.reserve(Arquivos.size());
   for (std::size_t i = 0; i < Arquivos.size(); ++i) {
     Novos[i] = LerJogo(Arquivos[i], DirCurto);
     if (i % 10 == 0) platform::RunPendingEventsAtIntervals();

@@ -149,6 +149,7 @@ void ListBox::Add(const std::string& text) { AddEntry(*state_, text); }
 void ListBox::Fill(const std::vector<std::string>& texts) {
   Clear();
   if (!IsAlive(*state_)) return;
+  state_->Entries.reserve(texts.size());
   for (const std::string& text : texts) state_->Entries.push_back({text, simulated::SortKey(text)});
   const auto before = [](const auto& left, const auto& right) { return left.Key < right.Key; };
   if (state_->Sorted) std::stable_sort(state_->Entries.begin(), state_->Entries.end(), before);

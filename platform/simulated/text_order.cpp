@@ -107,6 +107,7 @@ void Trim(std::string& weights, unsigned char common) {
 std::string SortKey(std::string_view text) {
   static const Table table = MakeTable();
   std::string key, accents, styles, light;
+  for (std::string* each : {&key, &accents, &styles}) each->reserve(text.size() + 3);
   for (const char character : text) {
     const Weights& weights = table[Code(character)];
     if (weights.Light != 0) {  // the later its place in the text, the sooner it sorts
@@ -122,7 +123,7 @@ std::string SortKey(std::string_view text) {
   }
   Trim(accents, NoAccent);
   Trim(styles, NoStyle);
-  return key + '\x01' + accents + '\x01' + styles + '\x01' + light;
+  return key.append(1, '\x01').append(accents).append(1, '\x01').append(styles).append(1, '\x01').append(light);
 }
 
 }  // namespace platform::simulated
