@@ -7,7 +7,6 @@
 #include "autoconfig/procura.h"
 #include "platform/events.h"
 #include "platform/files.h"
-#include "platform/messages.h"
 #include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
@@ -15,6 +14,7 @@
 #include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 using platform::Label;
 using platform::ListBox;
@@ -61,10 +61,8 @@ std::string Identidade(const std::string& Caminho) {
 }
 
 std::string FiltroDeEmuladores() {
-  const auto Par = [](const std::string& Nome, const std::string& Padrao) {
-    return Traduzir(Nome) + '\0' + Padrao + '\0';
-  };
-  return Par("Emulador ZSnes (zsnes*.exe)", "zsnes*.exe") + Par("Programas (*.exe)", "*.exe");
+  const auto Par = [](Texto Nome, const std::string& Padrao) { return Traduzir(Nome) + '\0' + Padrao + '\0'; };
+  return Par(Texto::EmuladorZsnes, "zsnes*.exe") + Par(Texto::Programas, "*.exe");
 }
 
 }  // namespace
@@ -125,15 +123,14 @@ void FormCfg::Timer1_Tick() {
 
 // Between two directories the person can choose, save or cancel.
 void FormCfg::Procurar() {
-  Label2.SetCaption(Traduzir("Procurando..."));
+  Label2.SetCaption(Traduzir(Texto::Procurando));
   platform::RunPendingEvents();
   Procura Busca(LugaresUsuais());
   while (!IsClosed() && !Busca.Terminou()) {
     for (const std::string& Emulador : Busca.Passo()) Propor(Emulador);
     platform::RunPendingEvents();
   }
-  Label2.SetCaption(Emuladores.empty() ? Traduzir("Nenhum emulador foi encontrado. Clique em 'Procurar outro...'.")
-                                       : Traduzir("Busca concluída."_ansi));
+  Label2.SetCaption(Traduzir(Emuladores.empty() ? Texto::NenhumEmulador : Texto::BuscaConcluida));
 }
 
 int FormCfg::Acrescentar(const std::string& Emulador) {
@@ -168,8 +165,7 @@ Ajustes FormCfg::AjustesEscolhidos() const { return AjustesPara(Selecionado(), A
 void FormCfg::MostrarEscolha() {
   const Ajustes Novos = AjustesEscolhidos();
   for (std::size_t i = 0; i < Linhas.size(); ++i) {
-    const std::string& Texto = Novos.*Linhas[i].Texto;
-    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(Texto, ""), LarguraNoQuadro));
+    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(Novos.*Linhas[i].Texto, ""), LarguraNoQuadro));
   }
   Command1.Enable(!Selecionado().empty());
 }
@@ -186,7 +182,7 @@ void FormCfg::Command3_Click() {
   std::string Filtro = FiltroDeEmuladores();
   const std::string Atual = Selecionado();
   const std::string Caminho =
-      AbrirArquivo(*this, DiretorioDe(Atual), Traduzir("Procurar emulador"), "", Filtro, platform::HideReadOnly);
+      AbrirArquivo(*this, DiretorioDe(Atual), Traduzir(Texto::ProcurarEmulador), "", Filtro, platform::HideReadOnly);
   if (Caminho.empty()) return;
   Selecionar(Acrescentar(Caminho));
 }

@@ -79,8 +79,8 @@ std::string ConfiguracaoDoEmulador(const std::string& Emulador) {
   return ArquivoExiste(ParaDos) && !ArquivoExiste(ParaWindows) ? ParaDos : ParaWindows;
 }
 
-std::string Impedimento(const std::string& Texto) {
-  if (Texto.size() > MaiorAjuste) return "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres."_ansi;
-  if (Texto.starts_with("\\\\")) return "O caminho está em uma rede: dê uma letra de unidade a ele."_ansi;
-  return "";
+std::optional<Mensagem> Impedimento(const std::string& Texto) {
+  if (Texto.size() > MaiorAjuste) return Mensagem::CaminhoLongo;
+  if (Texto.starts_with("\\\\")) return Mensagem::CaminhoEmRede;
+  return std::nullopt;
 }

@@ -2,9 +2,11 @@
 #pragma once
 
 #include <array>
+#include <optional>
 #include <string>
 
 #include "support/cls_REG.h"
+#include "support/mensagens.h"
 
 // As the settings hold them: a leading backslash stands for the program's directory; empty: not set.
 struct Ajustes {
@@ -46,5 +48,5 @@ bool TemBranco(const std::string& Caminho);
 // The configuration file that the emulator reads, in its directory.
 std::string ConfiguracaoDoEmulador(const std::string& Emulador);
 
-// What keeps a text from being used as a setting, as a message; the empty text: nothing.
-std::string Impedimento(const std::string& Texto);
+// The message that says what keeps a text from being used as a setting; nothing when nothing does.
+std::optional<Mensagem> Impedimento(const std::string& Texto);

@@ -1,10 +1,10 @@
 #include "controller/Form3.h"
 
 #include "controller/teclas.h"
-#include "platform/messages.h"
-#include "platform/text.h"
 #include "resources/ids.h"
+#include "support/mensagens.h"
 #include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 namespace {
 
@@ -59,8 +59,8 @@ void Form3::Descarregar() {
 
 void Form3::Preparar() {
   Command1.SetCaption(Traduzir(Command1.Caption()));
-  Combo1.Add(Traduzir("Jogador 1"));
-  Combo1.Add(Traduzir("Jogador 2"));
+  Combo1.Add(Traduzir(Texto::Jogador1));
+  Combo1.Add(Traduzir(Texto::Jogador2));
   Combo1.Select(0);
   MostrarTeclas();
   SetCaption(Traduzir(Caption()));
@@ -79,8 +79,7 @@ void Form3::Combo1_Click() { MostrarTeclas(); }
 
 void Form3::Timer1_Tick() {
   Timer1.Enable(false);
-  platform::MessageBoxA(Traduzir("Guarde os comandos do controle. Se necessário anote-os."_ansi),
-                        Traduzir("Informação"_ansi), platform::Buttons::Ok, platform::Icon::Information);
+  MostrarMensagem(Mensagem::GuardeOsComandos);
 }
 
 void Form3::Command1_Click() { Close(); }

@@ -1,24 +1,12 @@
 // The delete command. Only the ROM file goes; the catalogue's entry and the picture stay for when it comes back.
 #include "mainwindow/Form1.h"
-#include "platform/messages.h"
-#include "platform/text.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
-#include "support/mod_Traducao.h"
-
-namespace {
-
-bool ConfirmarDelecao(const std::string& Nome) {
-  return platform::MessageBoxA(Traduzir("Deletar o jogo '") + " " + Nome + " " + Traduzir("' ?"),
-                               Traduzir("Confirmar deleção"_ansi), platform::Buttons::YesNoCancel,
-                               platform::Icon::Exclamation) == platform::Answer::Yes;
-}
-
-}  // namespace
 
 void Form1::Command6_Click() {
   const auto Escolhido = JogoSelecionado();
   if (!Escolhido) return;
-  if (!ConfirmarDelecao(NomeSelecionado())) {
+  if (MostrarMensagem(Mensagem::DeletarJogo, NomeSelecionado()) != platform::Answer::Yes) {
     Ativar(true);
     return;
   }

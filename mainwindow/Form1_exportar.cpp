@@ -1,16 +1,15 @@
 // The export command: the selected game as a plain copy of its ROM file, or as a package.
 #include "mainwindow/Form1.h"
 #include "mainwindow/arquivos_de_jogos.h"
-#include "mainwindow/mensagens.h"
 #include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/events.h"
-#include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
-#include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 namespace {
 
@@ -36,15 +35,15 @@ void Oferecer(Oferta& Ofertas, const std::string& Rotulo, const std::string& Pad
 Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
   Oferta Ofertas;
   if (TemImagem && Escolhido.Catalogado) {
-    Oferecer(Ofertas, Traduzir("Arquivo Tolvaris (*.tvk)"), "*.tvk");
+    Oferecer(Ofertas, Traduzir(Texto::ArquivoTolvaris), "*.tvk");
     Ofertas.ExtensaoPadrao = "tvk;";
   }
   const std::string Tipo = TipoDoArquivo(Escolhido.Arquivo);
   if (Tipo == "ZIP") {
-    Oferecer(Ofertas, Traduzir("Arquivo ZIP (*.zip)"), "*.zip");
+    Oferecer(Ofertas, Traduzir(Texto::ArquivoZip), "*.zip");
     Ofertas.ExtensaoPadrao += "zip";
   } else if (Tipo == "SMC") {
-    Oferecer(Ofertas, Traduzir("Arquivo SMC (*.smc)"), "*.smc");
+    Oferecer(Ofertas, Traduzir(Texto::ArquivoSmc), "*.smc");
     Ofertas.ExtensaoPadrao += "smc";
   } else {
     Oferecer(Ofertas, Tipo, "*.*");
@@ -55,7 +54,7 @@ Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
 
 std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemImagem) {
   Oferta Ofertas = TiposOferecidos(Escolhido, TemImagem);
-  return SalvarArquivo(Dono, "", Traduzir("Salvar como..."), Ofertas.ExtensaoPadrao, Escolhido.Nome, Ofertas.Filtro,
+  return SalvarArquivo(Dono, "", Traduzir(Texto::SalvarComo), Ofertas.ExtensaoPadrao, Escolhido.Nome, Ofertas.Filtro,
                        platform::HideReadOnly);
 }
 
@@ -98,7 +97,7 @@ Desfecho Salvar(const Form1& Dono, const Jogo& Escolhido, const std::string& Arq
   const std::string Caminho = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
   if (Caminho.empty()) return Desfecho::Desistencia;
   const auto Tamanho = platform::FileSize(Caminho);
-  if (Tamanho > 0 && !ConfirmarSubstituicao("Arquivo já existente."_ansi)) return Desfecho::Desistencia;
+  if (Tamanho > 0 && MostrarMensagem(Mensagem::ArquivoJaExiste) != platform::Answer::Yes) return Desfecho::Desistencia;
   RunPendingEvents();
   const Alvo Destino{Caminho, Tamanho ? Existing::Replace : Existing::Keep};
   return TipoDoArquivo(Caminho) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, Destino)
@@ -116,14 +115,18 @@ Desfecho SalvarSemExcecao(const Form1& Dono, const Jogo& Escolhido, const std::s
 void MostrarDesfecho(Desfecho Fim) {
   switch (Fim) {
     case Desfecho::Salvo:
-      return MostrarAviso("Arquivo salvo.", "Ok");
+      MostrarMensagem(Mensagem::ArquivoSalvo);
+      return;
     case Desfecho::ErroDeLeitura:
-      return ErroAoLer();
+      MostrarMensagem(Mensagem::ErroAoLer);
+      return;
     case Desfecho::ErroDeGravacao:
-      return ErroAoGravar();
+      MostrarMensagem(Mensagem::ErroAoGravar);
+      return;
     case Desfecho::ErroInesperado:
       RunPendingEvents();
-      return MostrarErro("Erro ao salvar arquivo.");
+      MostrarMensagem(Mensagem::ErroAoSalvar);
+      return;
     case Desfecho::Desistencia:
       return;
   }

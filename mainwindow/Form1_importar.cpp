@@ -2,17 +2,16 @@
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
 #include "mainwindow/arquivos_de_jogos.h"
-#include "mainwindow/mensagens.h"
 #include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/events.h"
-#include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
 #include "support/mod_Globais.h"
-#include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 namespace {
 
@@ -28,8 +27,8 @@ struct Importacao {
 
 std::string PerguntarArquivo(const Form1& Dono) {
   using namespace std::string_literals;
-  std::string Filtro = Traduzir("Arquivos suportados") + "\0*.zip;*.smc;*.tvk\0"s;
-  return AbrirArquivo(Dono, "", Traduzir("Adicionar..."), "", Filtro, platform::HideReadOnly);
+  std::string Filtro = Traduzir(Texto::ArquivosSuportados) + "\0*.zip;*.smc;*.tvk\0"s;
+  return AbrirArquivo(Dono, "", Traduzir(Texto::Adicionar), "", Filtro, platform::HideReadOnly);
 }
 
 Importacao ImportarRom(const std::string& Caminho, const std::string& Base) {
@@ -95,7 +94,7 @@ Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
   RunPendingEvents();
   const bool NaLista = Lista.InList1(Novo->Nome);
   const Encontro Encontrado = NaLista ? Encontro::OutraRom : OQueEncontra(*Novo);
-  if (Encontrado == Encontro::OutraRom && !ConfirmarSubstituicao("O jogo a ser adiciona já existe."_ansi)) {
+  if (Encontrado == Encontro::OutraRom && MostrarMensagem(Mensagem::JogoJaExiste) != platform::Answer::Yes) {
     return {Desfecho::Desistencia};
   }
   const Desfecho Fim = GravarJogo(*Novo, Encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace);
@@ -122,20 +121,17 @@ Importacao ImportarSemExcecao(const Form1& Lista, const std::string& Caminho) {
   }
 }
 
-void ErroCorrompido() {
-  platform::MessageBoxA(Traduzir("Houve uma diferença na medição dos códigos CRC."_ansi) + "\r\n" +
-                            Traduzir("Essa mudança indica que o arquivo está corrompido."_ansi),
-                        Traduzir("Erro"), platform::Buttons::Ok, platform::Icon::Critical);
-}
-
 void MostrarFracasso(Desfecho Fim) {
   switch (Fim) {
     case Desfecho::ErroDeLeitura:
-      return ErroAoLer();
+      MostrarMensagem(Mensagem::ErroAoLer);
+      return;
     case Desfecho::ErroDeGravacao:
-      return ErroAoGravar();
+      MostrarMensagem(Mensagem::ErroAoGravar);
+      return;
     case Desfecho::Corrompido:
-      return ErroCorrompido();
+      MostrarMensagem(Mensagem::JogoCorrompido);
+      return;
     case Desfecho::Adicionado:
     case Desfecho::Desistencia:
       return;
@@ -153,7 +149,7 @@ void Form1::Command4_Click() {
     Ativar(true);
     return;
   }
-  MostrarAviso("Jogo adicionado com sucesso.", "Ok");
+  MostrarMensagem(Mensagem::JogoAdicionado);
   CarregarLista(true);
   SelecionarNome(Feita.Nome);
 }

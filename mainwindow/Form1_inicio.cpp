@@ -3,13 +3,12 @@
 #include "controller/Form3.h"
 #include "mainwindow/Form1.h"
 #include "mainwindow/ajustes.h"
-#include "mainwindow/mensagens.h"
 #include "platform/events.h"
 #include "platform/registry.h"
 #include "platform/screen.h"
-#include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
@@ -17,20 +16,6 @@
 #include "support/mod_exe.h"
 
 namespace {
-
-bool PerguntarPelaConfiguracao() {
-  const std::string Pergunta = Traduzir("O Tolvaris não foi configurado."_ansi) + "\r\n" +
-                               Traduzir("Clique em 'Sim' para rodar o programa de auto-configuração."_ansi);
-  return platform::MessageBoxA(Pergunta, Traduzir("Configuração"_ansi), platform::Buttons::YesNoCancel,
-                               platform::Icon::Information) == platform::Answer::Yes;
-}
-
-void AvisarSemConfiguracao() {
-  const std::string Aviso =
-      Traduzir("Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado."_ansi) +
-      "\r\n" + Traduzir("Reinstale o programa.");
-  platform::MessageBoxA(Aviso, Traduzir("Erro"), platform::Buttons::Ok, platform::Icon::Critical);
-}
 
 // What an earlier run of the program has left half written.
 void ApagarRestosDeAntes() {
@@ -80,10 +65,10 @@ Form1::Configuracao Form1::VerificarConfiguracao() {
   if (!ArquivoEmulador.empty() && !ArquivoCfgEmulador.empty()) return Configuracao::Pronta;
   const std::string Configurador = DirPrograma + "tolvariscfg.exe";
   if (!ArquivoExiste(Configurador)) {
-    AvisarSemConfiguracao();
+    MostrarMensagem(Mensagem::SemConfigurador);
     return Configuracao::Desistir;
   }
-  if (!PerguntarPelaConfiguracao()) return Configuracao::Desistir;
+  if (MostrarMensagem(Mensagem::SemConfiguracao) != platform::Answer::Yes) return Configuracao::Desistir;
   std::string Diretorio = DirPrograma;
   ExecutarPrograma(Configurador, 500, true, 2, Diretorio);
   platform::RunPendingEvents();

@@ -1,11 +1,10 @@
 // The play command.
 #include "mainwindow/Form1.h"
 #include "mainwindow/configuracao_emulador.h"
-#include "mainwindow/mensagens.h"
 #include "platform/events.h"
 #include "platform/registry.h"
-#include "platform/text.h"
 #include "support/gravacao.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 #include "support/mod_exe.h"
@@ -38,7 +37,7 @@ void Form1::Command1_Click() {
   const auto Escolhido = JogoSelecionado();
   if (!Escolhido) return;
   if (!ArquivoExiste(ArquivoEmulador)) {
-    MostrarErro("O emulador ZSnes não foi encontrado."_ansi);
+    MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
     return;
   }
   platform::RunPendingEvents();
@@ -55,12 +54,12 @@ void Form1::Command1_Click() {
 std::optional<Jogo> Form1::JogoSelecionado() const {
   const int Linha = List1.Selected() == -1 ? -1 : IndiceJogo(NomeSelecionado());
   if (Linha == -1) {
-    ErroJogoDesconhecido();
+    MostrarMensagem(Mensagem::JogoDesconhecido);
     return std::nullopt;
   }
   const Jogo& Selecionado = Jogos[static_cast<std::size_t>(Linha)];
   if (!ArquivoExiste(Selecionado.Arquivo)) {
-    ErroJogoNaoEncontrado();
+    MostrarMensagem(Mensagem::JogoNaoEncontrado);
     return std::nullopt;
   }
   return Selecionado;
@@ -79,15 +78,14 @@ std::optional<std::string> Form1::DirSavesDoJogo() {
 
 bool Form1::EsperarDisquete() {
   while (!DisqueteNoDrive()) {
-    if (!PedirDisquete()) return false;
+    if (MostrarMensagem(Mensagem::SemDisquete) != platform::Answer::Retry) return false;
   }
   return true;
 }
 
 void Form1::AvisarALTF4() {
   if (LerTexto("AvisoALTF4") == "1") return;
-  MostrarAviso("Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'",
-               "Informação"_ansi);
+  MostrarMensagem(Mensagem::ComoFecharOJogo);
   GravarAjuste("AvisoALTF4", "1");
 }
 

@@ -9,6 +9,7 @@
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 namespace {
 
@@ -48,7 +49,7 @@ void Form1::CarregarLista(bool IgnorarUltimo) {
   Desativar(true);
   List1.Select(-1);
   List1.Clear();
-  SetCaption(Traduzir("Carregando..."));
+  SetCaption(Traduzir(Texto::Carregando));
   platform::RunPendingEvents();
   CriarDiretoriosQueFaltam();
   Catalogo().Atualizar();  // also for an empty list: after the downloader the catalogue is closed until here

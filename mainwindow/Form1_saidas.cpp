@@ -1,9 +1,8 @@
 // The two commands that lead out of the window: the downloader and the save-file manager.
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
-#include "mainwindow/mensagens.h"
-#include "platform/text.h"
 #include "savemanager/Form4.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 #include "support/mod_exe.h"
@@ -12,7 +11,7 @@
 void Form1::Command3_Click() {
   const std::string Downloader = DirPrograma + "tolvarisdownload.exe";
   if (!ArquivoExiste(Downloader)) {
-    MostrarErro("O programa de download não foi encontrado."_ansi);
+    MostrarMensagem(Mensagem::SemDownloader);
     return;
   }
   const std::string Selecionado = NomeSelecionado();

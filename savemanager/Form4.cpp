@@ -1,7 +1,6 @@
 #include "savemanager/Form4.h"
 
 #include "platform/events.h"
-#include "platform/text.h"
 #include "resources/ids.h"
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
@@ -40,17 +39,17 @@ Form4::Form4()
                .Lista = List1,
                .Lixeira = Image1,
                .Seta = ICONE_SETA_DIREITA,
-               .Copiar = "Copiar do disquete para o computador",
-               .JaExiste = "O salvamento selecionado já se encontra no Disquete (A:)."_ansi,
-               .FimPergunta = "' que está no Disquete (A:) ?"_ansi},
+               .Copiar = Texto::CopiarParaComputador,
+               .JaExiste = Mensagem::SalvamentoNoDisquete,
+               .Deletar = Mensagem::DeletarDoDisquete},
       Computador{.Lado = Origem::Computador,
                  .Diretorio = Diretorios[1],
                  .Lista = List2,
                  .Lixeira = Image2,
                  .Seta = ICONE_SETA_ESQUERDA,
-                 .Copiar = "Copiar do computador para o disquete",
-                 .JaExiste = "O salvamento selecionado já se encontra no Computador."_ansi,
-                 .FimPergunta = "' que está no Computador ?"_ansi} {
+                 .Copiar = Texto::CopiarParaDisquete,
+                 .JaExiste = Mensagem::SalvamentoNoComputador,
+                 .Deletar = Mensagem::DeletarDoComputador} {
   List1.OnClick = [this] { List1_Click(); };
   List2.OnClick = [this] { List2_Click(); };
   List1.OnKeyDown = [this](int tecla) { List1_KeyDown(tecla); };

@@ -7,6 +7,8 @@
 #include <string>
 
 #include "platform/controls.h"
+#include "support/mensagens.h"
+#include "support/textos.h"
 
 // Where the picked entry lies, and so which way a copy would go.
 enum class Origem : std::uint8_t { Nenhuma = 0, Disquete = 1, Computador = 2 };
@@ -50,10 +52,10 @@ class Form4 : public platform::Window {
     const std::string& Diretorio;
     platform::ListBox& Lista;
     platform::ImageButton& Lixeira;
-    int Seta;            // on the copy button: the icon of a copy from here
-    std::string Copiar;  // and its tool tip
-    std::string JaExiste;
-    std::string FimPergunta;
+    int Seta;           // on the copy button: the icon of a copy from here
+    Texto Copiar;       // and its tool tip
+    Mensagem JaExiste;  // here, before a copy replaces it
+    Mensagem Deletar;
   };
 
   Form4();

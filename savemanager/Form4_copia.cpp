@@ -1,37 +1,17 @@
 // Copying the picked file to the other side.
 #include "platform/events.h"
-#include "platform/messages.h"
-#include "platform/text.h"
 #include "savemanager/EspacoLivre.h"
 #include "savemanager/Form4.h"
 #include "support/gravacao.h"
+#include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
-#include "support/mod_Traducao.h"
+#include "support/textos.h"
 
 namespace {
-
-using platform::Answer;
-using platform::Buttons;
-using platform::Icon;
 
 // A missing file has length 0: its copy is tried, and fails.
 bool Cabe(const std::string& arquivo, const std::string& destino) {
   return TamanhoArquivo(arquivo) <= EspacoLivre(destino);
-}
-
-void AvisarDiscoCheio() {
-  platform::MessageBoxA(Traduzir("Não há espaço livre suficiente em disco para completar a operação."_ansi),
-                        Traduzir("Disco cheio"), Buttons::Ok, Icon::Exclamation);
-}
-
-void AvisarErro(const char* texto) {
-  platform::MessageBoxA(Traduzir(texto), Traduzir("Erro"), Buttons::Ok, Icon::Critical);
-}
-
-bool ConfirmarSubstituir(const std::string& jaExiste) {
-  const std::string pergunta = Traduzir(jaExiste) + "\r\n" + Traduzir("Você deseja substituí-lo ?"_ansi);
-  return platform::MessageBoxA(pergunta, Traduzir("Salvamento já existente"_ansi), Buttons::YesNoCancel,
-                               Icon::Question) == Answer::Yes;
 }
 
 }  // namespace
@@ -55,22 +35,26 @@ void Form4::Copiar(const Painel& origem, const Painel& destino) {
   const std::string para = CaminhoAtual(destino);
   if (de.empty() || para.empty()) return;
   ApagarRestos(destino.Diretorio);
-  if (!Cabe(de, para)) return AvisarDiscoCheio();
-  if (ArquivoExiste(para) && !ConfirmarSubstituir(destino.JaExiste)) return;
+  if (!Cabe(de, para)) {
+    MostrarMensagem(Mensagem::DiscoCheio);
+    return;
+  }
+  if (ArquivoExiste(para) && MostrarMensagem(destino.JaExiste) != platform::Answer::Yes) return;
   RecolherEscolha();
   Enable(false);
+  const std::string titulo = Caption();
   MostrarAndamento("");
   const Copia copia =
       CopiarArquivo(de, para, [this](int porCento) { MostrarAndamento(" " + std::to_string(porCento) + "%"); });
   Enable(true);
   origem.Lista.SetFocus();  // the copy button, which may have had the keyboard, is hidden now
-  if (copia != Copia::Feita) AvisarErro(copia == Copia::NaoLida ? "Erro ao ler arquivo." : "Erro ao gravar arquivo.");
+  if (copia != Copia::Feita) MostrarMensagem(copia == Copia::NaoLida ? Mensagem::ErroAoLer : Mensagem::ErroAoGravar);
   Listar(destino);
-  SetCaption(Traduzir("Salvamentos dos jogos"));
+  SetCaption(titulo);
 }
 
 void Form4::MostrarAndamento(const std::string& andamento) {
-  SetCaption(Traduzir("Copiando...") + andamento);
+  SetCaption(Traduzir(Texto::Copiando) + andamento);
   platform::RunPendingEvents();
 }
 

@@ -38,6 +38,11 @@ def project_files():
     return [name for name in listed if name and (ROOT / name).is_file()]
 
 
+# What only support/ does: a text that is written where it is shown would escape the translation's checks.
+MESSAGE = re.compile(r'MessageBoxA\(|Traduzir\("')
+SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "controller/", "mainwindow/", "package/", "savemanager/")
+
+
 def check_include(name, included):
     folder, _, _ = name.partition("/")
     other, separator, _ = included.partition("/")
@@ -60,6 +65,8 @@ def check_source(name):
         if match := INCLUDE.match(line):
             for fault in check_include(name, match[1]):
                 yield name, number, fault
+        if name.startswith(SHOWS_NO_TEXTS) and MESSAGE.search(line):
+            yield name, number, "shows a text that has no name in support/mensagens.h or textos.h"
 
 
 def check_compiled(sources, builds):

@@ -1,18 +1,19 @@
-"""Checks docs/what-it-shows.md: every text of the program stands there, and every test that it names exists.
+"""Checks what is written about the programs' texts against the programs.
 
-What the texts of the program are, check_translation.py sees to: they are the keys of the English translation.
+docs/what-it-shows.md: each message has its row, whose text, title, buttons and icon are those of the message; every other
+text stands there; every test that it names exists. LEIAME.md: each message has a row that says what to do.
 """
 
-import pathlib
 import re
 import sys
 
-ROOT = pathlib.Path(__file__).resolve().parent.parent
+from shown_texts import ROOT, SEPARATORS, VALUE, shown
+
 PAGE = ROOT / "docs/what-it-shows.md"
-TRANSLATION = ROOT / "translation/english.ini"
+GUIDE = ROOT / "LEIAME.md"
 
 TEST = re.compile(r"^TEST(?:_F|_P)?\(\s*(\w+),\s*(\w+)\s*\)", re.MULTILINE)
-NAMED = re.compile(r"`(\w+/\w+\.\w+)`")
+NAMED = re.compile(r"`(\w+/[A-Z]\w*\.\w+)`")
 ROW = re.compile(r"^\| (?!---)[^\n]*\n(?!\| ---)", re.MULTILINE)  # but the heads of tables
 
 
@@ -23,22 +24,37 @@ def tests():
             yield f"{folder}/{suite}.{name}"
 
 
-def texts():
-    for line in TRANSLATION.read_text(encoding="utf-8").splitlines():
-        if line and line[0] not in ";[":
-            yield line.partition("=")[0]
+def row_of(message):
+    """How a message's row begins."""
+    pieces = ["…" if piece == VALUE else f'"{piece}"' for piece in message.pieces if piece not in SEPARATORS]
+    return f'| `{message.name}` | {" ".join(pieces)} | "{message.title}", {message.buttons}, {message.icon} | '
+
+
+def bare(text):
+    """Without what the guide writes as it reads best: blanks, full stops and the value."""
+    return re.sub(r"[ .…]", "", text)
+
+
+def explained(guide):
+    """The first cell of each row of the guide's tables."""
+    return {bare(row.split(" | ")[0].lstrip("| ")) for row in ROW.findall(guide)}
 
 
 def main():
-    page = PAGE.read_text(encoding="utf-8")
+    page, existing = PAGE.read_text(encoding="utf-8"), set(tests())
     rows = ROW.findall(page)
-    existing, expected = set(tests()), list(texts())
-    faults = [f"{name} does not exist" for name in sorted(set(NAMED.findall(page)) - existing)]
-    faults += [f'"{text}" is missing' for text in expected if not any(f'"{text}"' in row for row in rows)]
-    faults += [f"no test is named: {row.strip()}" for row in rows if not NAMED.search(row)]
-    for fault in faults:
-        print(f"{PAGE.relative_to(ROOT)}: {fault}")
-    return 1 if faults or not (rows and existing and expected) else 0
+    messages, texts = shown()
+    faults = [f"{PAGE.name}: {name} does not exist" for name in sorted(set(NAMED.findall(page)) - existing)]
+    faults += [f"{PAGE.name}: no test is named: {row.strip()}" for row in rows if not NAMED.search(row)]
+    faults += [f"{PAGE.name}: no row begins with {row_of(message)}" for message in messages
+               if not any(row.startswith(row_of(message)) for row in rows)]
+    faults += [f'{PAGE.name}: "{text}" is missing' for text in sorted(texts)
+               if not any(f'"{text.strip(" ")}"' in row for row in rows)]
+    guide = explained(GUIDE.read_text(encoding="utf-8"))
+    faults += [f"{GUIDE.name}: what to do at {message.name} is missing" for message in messages
+               if bare("".join(message.texts())) not in guide]
+    print("\n".join(faults))
+    return 1 if faults or not (rows and existing and messages) else 0
 
 
 sys.exit(main())

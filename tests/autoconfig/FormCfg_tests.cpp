@@ -161,9 +161,8 @@ TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused)
     EXPECT_EQ(Mensagens(), Textos{mensagem});
     EXPECT_TRUE(Gravados() == Nada && !form->IsClosed());
   }
-  EXPECT_EQ(Impedimento(std::string(254, 'x')), "");
-  EXPECT_EQ(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"),
-            "O caminho está em uma rede: dê uma letra de unidade a ele."_ansi)
+  EXPECT_EQ(Impedimento(std::string(254, 'x')), std::nullopt);
+  EXPECT_EQ(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), Mensagem::CaminhoEmRede)
       << "read as relative to the program's directory";
 }
 
