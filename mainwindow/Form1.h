@@ -6,19 +6,11 @@
 #include <string>
 #include <vector>
 
+#include "collection/jogo.h"
 #include "platform/controls.h"
 #include "platform/files.h"
 #include "platform/pictures.h"
 #include "support/cls_REG.h"
-
-// A game: one file of the ROM directory.
-struct Jogo {
-  std::string Nome;          // shown in the list: the catalogue's name, or the file's base name
-  std::string DOSName;       // the catalogue's DOS name of Nome; empty when the game is not in the catalogue
-  std::string ArquivoCurto;  // Arquivo in 8.3 form, for the emulator's command line
-  std::string Arquivo;       // full path of the ROM file
-  bool Catalogado = false;   // the catalogue has an entry for the file's base name
-};
 
 class Form1 : public platform::Window {
  public:

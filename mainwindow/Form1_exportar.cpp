@@ -1,13 +1,9 @@
 // The export command: the selected game as a plain copy of its ROM file, or as a package.
+#include "collection/saida.h"
 #include "mainwindow/Form1.h"
-#include "mainwindow/arquivos_de_jogos.h"
-#include "package/cls_CRC.h"
-#include "package/pacote.h"
 #include "platform/events.h"
 #include "support/caminhos.h"
-#include "support/gravacao.h"
 #include "support/mensagens.h"
-#include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
 #include "support/textos.h"
 
@@ -16,128 +12,82 @@ namespace {
 using platform::Existing;
 using platform::RunPendingEvents;
 
-enum class Desfecho { Salvo, Desistencia, ErroDeLeitura, ErroDeGravacao, ErroInesperado };
-
-struct Alvo {
-  std::string Caminho;
-  Existing Existente;
-};
-
 struct Oferta {
   std::string Filtro, ExtensaoPadrao;  // as the save dialog takes them
 };
 
-void Oferecer(Oferta& Ofertas, const std::string& Rotulo, const std::string& Padrao) {
-  Ofertas.Filtro.append(Rotulo).append(1, '\0').append(Padrao).append(1, '\0');
+void Oferecer(Oferta& ofertas, const std::string& rotulo, const std::string& padrao) {
+  ofertas.Filtro.append(rotulo).append(1, '\0').append(padrao).append(1, '\0');
 }
 
 // What the game can be saved as. A package needs a picture and a catalogue entry.
-Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
-  Oferta Ofertas;
-  if (TemImagem && Escolhido.Catalogado) {
-    Oferecer(Ofertas, Traduzir(Texto::ArquivoTolvaris), "*.tvk");
-    Ofertas.ExtensaoPadrao = "tvk;";
+Oferta TiposOferecidos(const Jogo& escolhido, bool temImagem) {
+  Oferta ofertas;
+  if (temImagem && escolhido.Catalogado) {
+    Oferecer(ofertas, Traduzir(Texto::ArquivoTolvaris), "*.tvk");
+    ofertas.ExtensaoPadrao = "tvk;";
   }
-  const std::string Tipo = TipoDoArquivo(Escolhido.Arquivo);
-  if (Tipo == "ZIP") {
-    Oferecer(Ofertas, Traduzir(Texto::ArquivoZip), "*.zip");
-    Ofertas.ExtensaoPadrao += "zip";
-  } else if (Tipo == "SMC") {
-    Oferecer(Ofertas, Traduzir(Texto::ArquivoSmc), "*.smc");
-    Ofertas.ExtensaoPadrao += "smc";
+  const std::string tipo = TipoDoArquivo(escolhido.Arquivo);
+  if (tipo == "ZIP") {
+    Oferecer(ofertas, Traduzir(Texto::ArquivoZip), "*.zip");
+    ofertas.ExtensaoPadrao += "zip";
+  } else if (tipo == "SMC") {
+    Oferecer(ofertas, Traduzir(Texto::ArquivoSmc), "*.smc");
+    ofertas.ExtensaoPadrao += "smc";
   } else {
-    Oferecer(Ofertas, Tipo, "*.*");
-    Ofertas.ExtensaoPadrao += Escolhido.Arquivo.substr(Escolhido.Arquivo.size() - Tipo.size());
+    Oferecer(ofertas, tipo, "*.*");
+    ofertas.ExtensaoPadrao += escolhido.Arquivo.substr(escolhido.Arquivo.size() - tipo.size());
   }
-  return Ofertas;
+  return ofertas;
 }
 
-std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemImagem) {
-  Oferta Ofertas = TiposOferecidos(Escolhido, TemImagem);
-  return SalvarArquivo(Dono, "", Traduzir(Texto::SalvarComo), Ofertas.ExtensaoPadrao, Escolhido.Nome, Ofertas.Filtro,
+std::string PerguntarDestino(const Form1& dono, const Jogo& escolhido, bool temImagem) {
+  Oferta ofertas = TiposOferecidos(escolhido, temImagem);
+  return SalvarArquivo(dono, "", Traduzir(Texto::SalvarComo), ofertas.ExtensaoPadrao, escolhido.Nome, ofertas.Filtro,
                        platform::HideReadOnly);
 }
 
-// Over a file only when it was asked for: one that could not be seen then, or came since, stays.
-Desfecho Gravar(const Alvo& Destino, std::string_view Conteudo) {
-  ApagarRestos(DiretorioDe(Destino.Caminho));
-  return Substituicao(Destino.Caminho, Conteudo, Destino.Existente).Concluir() ? Desfecho::Salvo
-                                                                               : Desfecho::ErroDeGravacao;
+// Nothing: the person gave up.
+std::optional<Saida> Salvar(const Form1& dono, const Jogo& escolhido, const std::string& arquivoImagem) {
+  const std::string caminho = PerguntarDestino(dono, escolhido, !arquivoImagem.empty());
+  if (caminho.empty()) return std::nullopt;
+  const auto tamanho = platform::FileSize(caminho);
+  if (tamanho > 0 && MostrarMensagem(Mensagem::ArquivoJaExiste) != platform::Answer::Yes) return std::nullopt;
+  RunPendingEvents();
+  const Destino destino{caminho, tamanho ? Existing::Replace : Existing::Keep};
+  return TipoDoArquivo(caminho) == "TVK" ? SalvarPacote(escolhido, arquivoImagem, destino, RunPendingEvents)
+                                         : SalvarRom(escolhido, destino, RunPendingEvents);
 }
 
-Desfecho SalvarCopia(const Jogo& Escolhido, const Alvo& Destino) {
-  const std::string Conteudo = LerArquivo(Escolhido.Arquivo);
-  if (Conteudo.empty()) return Desfecho::ErroDeLeitura;
-  RunPendingEvents();
-  return Gravar(Destino, Conteudo);
-}
-
-// The ROM is read once, to where the package has it, and the header is then put before the blocks: texts of many
-// megabytes cost more than reading the file.
-Desfecho SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const Alvo& Destino) {
-  constexpr std::size_t Folga = 1024;  // a longer header costs a copy, no more
-  const std::int32_t TamanhoImagem = TamanhoArquivo(ArquivoImagem), TamanhoRom = TamanhoArquivo(Escolhido.Arquivo);
-  std::string Pacote;
-  Pacote.reserve(Folga + static_cast<std::size_t>(TamanhoImagem) + static_cast<std::size_t>(TamanhoRom));
-  AcrescentarArquivo(Pacote, ArquivoImagem);
-  const std::size_t InicioRom = Pacote.size();
-  if (InicioRom != static_cast<std::size_t>(TamanhoImagem)) return Desfecho::ErroInesperado;
-  AcrescentarArquivo(Pacote, Escolhido.Arquivo);
-  if (Pacote.size() - InicioRom != static_cast<std::size_t>(TamanhoRom)) return Desfecho::ErroInesperado;
-  RunPendingEvents();
-  cls_CRC Medida;
-  const auto Soma = Medida.CRC(std::string_view(Pacote).substr(InicioRom));
-  if (!Soma) return Desfecho::ErroInesperado;
-  Pacote.insert(0, MontarPacote(Escolhido.Nome, Escolhido.DOSName, TextoCRC(*Soma), TamanhoImagem, TamanhoRom, {}, {}));
-  RunPendingEvents();
-  return Gravar(Destino, Pacote);
-}
-
-Desfecho Salvar(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
-  const std::string Caminho = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
-  if (Caminho.empty()) return Desfecho::Desistencia;
-  const auto Tamanho = platform::FileSize(Caminho);
-  if (Tamanho > 0 && MostrarMensagem(Mensagem::ArquivoJaExiste) != platform::Answer::Yes) return Desfecho::Desistencia;
-  RunPendingEvents();
-  const Alvo Destino{Caminho, Tamanho ? Existing::Replace : Existing::Keep};
-  return TipoDoArquivo(Caminho) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, Destino)
-                                         : SalvarCopia(Escolhido, Destino);
-}
-
-Desfecho SalvarSemExcecao(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
+std::optional<Saida> SalvarSemExcecao(const Form1& dono, const Jogo& escolhido, const std::string& arquivoImagem) {
   try {
-    return Salvar(Dono, Escolhido, ArquivoImagem);
+    return Salvar(dono, escolhido, arquivoImagem);
   } catch (...) {
-    return Desfecho::ErroInesperado;
+    return Saida::SemPacote;
   }
 }
 
-void MostrarDesfecho(Desfecho Fim) {
-  switch (Fim) {
-    case Desfecho::Salvo:
-      MostrarMensagem(Mensagem::ArquivoSalvo);
-      return;
-    case Desfecho::ErroDeLeitura:
-      MostrarMensagem(Mensagem::ErroAoLer);
-      return;
-    case Desfecho::ErroDeGravacao:
-      MostrarMensagem(Mensagem::ErroAoGravar);
-      return;
-    case Desfecho::ErroInesperado:
-      RunPendingEvents();
-      MostrarMensagem(Mensagem::ErroAoSalvar);
-      return;
-    case Desfecho::Desistencia:
-      return;
+Mensagem MensagemDe(Saida fim) {
+  switch (fim) {
+    case Saida::Feita:
+      return Mensagem::ArquivoSalvo;
+    case Saida::NaoLida:
+      return Mensagem::ErroAoLer;
+    case Saida::NaoGravada:
+      return Mensagem::ErroAoGravar;
+    default:
+      return Mensagem::ErroAoSalvar;
   }
 }
 
 }  // namespace
 
 void Form1::Command5_Click() {
-  const auto Escolhido = JogoSelecionado();
-  if (!Escolhido) return;
+  const auto escolhido = JogoSelecionado();
+  if (!escolhido) return;
   Desativar(false);
-  MostrarDesfecho(SalvarSemExcecao(*this, *Escolhido, CaminhoImagem(IndiceJogo(Escolhido->Nome))));
+  const auto fim = SalvarSemExcecao(*this, *escolhido, CaminhoImagem(IndiceJogo(escolhido->Nome)));
+  if (fim == Saida::SemPacote) RunPendingEvents();
+  if (fim) MostrarMensagem(MensagemDe(*fim));
   Ativar(true);
 }

@@ -1,16 +1,13 @@
-// The import command: a ROM file is copied into the ROM directory as it is; a package brings name, picture and ROM.
+// The import command: asks for a file, and whether a game may be replaced, and tells what became of it.
 #include "catalog/cls_DAT.h"
+#include "collection/entrada.h"
 #include "mainwindow/Form1.h"
-#include "mainwindow/arquivos_de_jogos.h"
-#include "package/cls_CRC.h"
 #include "package/pacote.h"
 #include "platform/events.h"
 #include "support/caminhos.h"
-#include "support/gravacao.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_CommonDialog.h"
-#include "support/mod_Globais.h"
 #include "support/textos.h"
 
 namespace {
@@ -18,123 +15,63 @@ namespace {
 using platform::Existing;
 using platform::RunPendingEvents;
 
-enum class Desfecho { Adicionado, Desistencia, ErroDeLeitura, ErroDeGravacao, Corrompido };
-
 struct Importacao {
-  Desfecho Fim;
-  std::string Nome = {};  // of the new game in the list
+  std::optional<Entrada> Fim;  // nothing: the person gave up, or the file is none that can be imported
+  std::string Nome = {};       // of the new game in the list
 };
 
-std::string PerguntarArquivo(const Form1& Dono) {
+std::string PerguntarArquivo(const Form1& dono) {
   using namespace std::string_literals;
-  std::string Filtro = Traduzir(Texto::ArquivosSuportados) + "\0*.zip;*.smc;*.tvk\0"s;
-  return AbrirArquivo(Dono, "", Traduzir(Texto::Adicionar), "", Filtro, platform::HideReadOnly);
+  std::string filtro = Traduzir(Texto::ArquivosSuportados) + "\0*.zip;*.smc;*.tvk\0"s;
+  return AbrirArquivo(dono, "", Traduzir(Texto::Adicionar), "", filtro, platform::HideReadOnly);
 }
 
-Importacao ImportarRom(const std::string& Caminho, const std::string& Base) {
-  const std::string Conteudo = LerArquivo(Caminho);
-  if (Conteudo.empty()) return {Desfecho::ErroDeLeitura};
+Importacao ImportarPacote(const Form1& lista, const std::string& caminho) {
+  const std::string conteudo = LerArquivo(caminho);
+  const auto novo = LerPacote(conteudo);
+  if (!novo) return {Entrada::NaoLida};
   RunPendingEvents();
-  if (!GravarInteiro(DirRoms + UltimaParte(Caminho), Conteudo)) return {Desfecho::ErroDeGravacao};
-  return {Desfecho::Adicionado, Base};
+  const bool naLista = lista.InList1(novo->Nome);
+  const Encontro encontrado = naLista ? Encontro::OutraRom : OQueEncontra(*novo);
+  if (encontrado == Encontro::OutraRom && MostrarMensagem(Mensagem::JogoJaExiste) != platform::Answer::Yes) return {};
+  const Existing existente = encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace;
+  const Entrada fim = PorPacote(*novo, existente, RunPendingEvents);
+  if (fim == Entrada::Feita && !naLista) Catalogo().RegistrarRom(novo->Nome, novo->DOSName);
+  return {fim, novo->Nome};
 }
 
-std::string ArquivoDaRom(const Pacote& Novo) { return DirRoms + Novo.DOSName + ".zip"; }
-
-// Makes the new contents the files' own. What has to be written in place can fail, and goes first; what lies complete
-// beside its file can only take the name.
-bool TomarNomes(Substituicao& Figura, Substituicao& Rom) {
-  return Figura.EstaAoLado() ? Rom.Concluir() && Figura.Concluir() : Figura.Concluir() && Rom.Concluir();
-}
-
-// Whether the ROM as it stands on the disk has the package's checksum.
-Desfecho ConferirRom(const std::string& Arquivo, const Pacote& Novo) {
-  const auto Soma = CRCDoArquivo(Arquivo);
-  if (!Soma) return Desfecho::ErroDeLeitura;
-  return *Soma == Novo.CRC ? Desfecho::Adicionado : Desfecho::Corrompido;
-}
-
-// A package whose ROM has no checksum, since the file ends before it or within it, is refused, and one that is damaged
-// is told, before anything changes. The new game is complete on the disk before the old one goes.
-Desfecho GravarJogo(const Pacote& Novo, Existing RomExistente) {
-  cls_CRC Medida;
-  const auto Soma = Medida.CRC(Novo.Rom);
-  if (!Soma || Novo.Imagem.empty()) return Desfecho::ErroDeLeitura;
-  if (TextoCRC(*Soma) != Novo.CRC) return Desfecho::Corrompido;
-  const std::string ArquivoImagem = DirImgs + Novo.Nome + ".gif", ArquivoRom = ArquivoDaRom(Novo);
-  Substituicao Figura(ArquivoImagem, Novo.Imagem), Rom(ArquivoRom, Novo.Rom, RomExistente);
-  RunPendingEvents();
-  const bool ConferidaAntes = Rom.EstaAoLado();
-  Desfecho Fim = ConferidaAntes ? ConferirRom(Rom.Provisorio(), Novo) : Desfecho::Adicionado;
-  if (Fim != Desfecho::Adicionado) return Fim;
-  if (!TomarNomes(Figura, Rom)) return Desfecho::ErroDeLeitura;
-  if (!ConferidaAntes) Fim = ConferirRom(ArquivoRom, Novo);
-  if (Fim == Desfecho::Corrompido) {
-    ApagarArquivo(ArquivoRom);
-    ApagarArquivo(ArquivoImagem);
-  }
-  return Fim;
-}
-
-// What the package's ROM meets under its file name, which a game of another name can have. A file that cannot be seen
-// counts as none, and nothing takes its place.
-enum class Encontro { Nada, MesmaRom, OutraRom };
-
-Encontro OQueEncontra(const Pacote& Novo) {
-  const std::string Arquivo = ArquivoDaRom(Novo);
-  const auto Tamanho = platform::FileSize(Arquivo);
-  if (!Tamanho) return Encontro::Nada;
-  return *Tamanho == 0 || LerArquivo(Arquivo) == Novo.Rom ? Encontro::MesmaRom : Encontro::OutraRom;
-}
-
-Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
-  const std::string Conteudo = LerArquivo(Caminho);
-  const auto Novo = LerPacote(Conteudo);
-  if (!Novo) return {Desfecho::ErroDeLeitura};
-  RunPendingEvents();
-  const bool NaLista = Lista.InList1(Novo->Nome);
-  const Encontro Encontrado = NaLista ? Encontro::OutraRom : OQueEncontra(*Novo);
-  if (Encontrado == Encontro::OutraRom && MostrarMensagem(Mensagem::JogoJaExiste) != platform::Answer::Yes) {
-    return {Desfecho::Desistencia};
-  }
-  const Desfecho Fim = GravarJogo(*Novo, Encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace);
-  if (Fim == Desfecho::Adicionado && !NaLista) Catalogo().RegistrarRom(Novo->Nome, Novo->DOSName);
-  return {Fim, Novo->Nome};
-}
-
-Importacao Importar(const Form1& Lista, const std::string& Caminho) {
-  if (Caminho.empty()) return {Desfecho::Desistencia};
-  const auto Base = NomeBase(UltimaParte(Caminho));
-  if (!ArquivoExiste(Caminho) || !Base) return {Desfecho::ErroDeLeitura};
-  const std::string Tipo = TipoDoArquivo(Caminho);
-  if (Tipo == "ZIP" || Tipo == "SMC") return ImportarRom(Caminho, *Base);
-  if (Tipo == "TVK") return ImportarPacote(Lista, Caminho);
-  return {Desfecho::Desistencia};
+Importacao Importar(const Form1& lista, const std::string& caminho) {
+  if (caminho.empty()) return {};
+  const auto base = NomeBase(UltimaParte(caminho));
+  if (!ArquivoExiste(caminho) || !base) return {Entrada::NaoLida};
+  const std::string tipo = TipoDoArquivo(caminho);
+  if (tipo == "ZIP" || tipo == "SMC") return {PorRom(caminho, RunPendingEvents), *base};
+  if (tipo == "TVK") return ImportarPacote(lista, caminho);
+  return {};
 }
 
 // Whatever goes wrong unexpectedly (a file larger than the memory) counts as a file that cannot be read.
-Importacao ImportarSemExcecao(const Form1& Lista, const std::string& Caminho) {
+Importacao ImportarSemExcecao(const Form1& lista, const std::string& caminho) {
   try {
-    return Importar(Lista, Caminho);
+    return Importar(lista, caminho);
   } catch (...) {
-    return {Desfecho::ErroDeLeitura};
+    return {Entrada::NaoLida};
   }
 }
 
-void MostrarFracasso(Desfecho Fim) {
-  switch (Fim) {
-    case Desfecho::ErroDeLeitura:
-      MostrarMensagem(Mensagem::ErroAoLer);
-      return;
-    case Desfecho::ErroDeGravacao:
-      MostrarMensagem(Mensagem::ErroAoGravar);
-      return;
-    case Desfecho::Corrompido:
-      MostrarMensagem(Mensagem::JogoCorrompido);
-      return;
-    case Desfecho::Adicionado:
-    case Desfecho::Desistencia:
-      return;
+bool EhPacote(const std::string& caminho) { return TipoDoArquivo(caminho) == "TVK"; }
+
+// Of a package, what cannot be written is told like what cannot be read.
+Mensagem MensagemDe(Entrada fim, bool pacote) {
+  switch (fim) {
+    case Entrada::Feita:
+      return Mensagem::JogoAdicionado;
+    case Entrada::NaoGravada:
+      return pacote ? Mensagem::ErroAoLer : Mensagem::ErroAoGravar;
+    case Entrada::Corrompida:
+      return Mensagem::JogoCorrompido;
+    default:
+      return Mensagem::ErroAoLer;
   }
 }
 
@@ -143,13 +80,13 @@ void MostrarFracasso(Desfecho Fim) {
 void Form1::Command4_Click() {
   Desativar(false);
   RunPendingEvents();
-  const Importacao Feita = ImportarSemExcecao(*this, PerguntarArquivo(*this));
-  if (Feita.Fim != Desfecho::Adicionado) {
-    MostrarFracasso(Feita.Fim);
+  const std::string caminho = PerguntarArquivo(*this);
+  const Importacao feita = ImportarSemExcecao(*this, caminho);
+  if (feita.Fim) MostrarMensagem(MensagemDe(*feita.Fim, EhPacote(caminho)));
+  if (feita.Fim != Entrada::Feita) {
     Ativar(true);
     return;
   }
-  MostrarMensagem(Mensagem::JogoAdicionado);
   CarregarLista(true);
-  SelecionarNome(Feita.Nome);
+  SelecionarNome(feita.Nome);
 }

@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "catalog/cls_DAT.h"
+#include "collection/jogo.h"
 #include "mainwindow/Form1.h"
 #include "platform/events.h"
 #include "platform/files.h"
@@ -20,21 +21,6 @@ void CriarDiretoriosQueFaltam() {
   for (const std::string* Diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
     if (!DiretorioExiste(*Diretorio)) CriarCaminho(*Diretorio);
   }
-}
-
-// The directory listing carries each file's own short name; asking the disk again, file by file, costs milliseconds
-// each in a large directory.
-Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto) {
-  Jogo Novo;
-  const auto Ponto = Entrada.Name.rfind('.');
-  if (Ponto == std::string::npos) return Novo;
-  std::int16_t Encontrado = 0;
-  Novo.Nome = Catalogo().DefineNome(Entrada.Name.substr(0, Ponto), Encontrado);
-  Novo.Catalogado = Encontrado != 0;
-  if (Novo.Catalogado) Novo.DOSName = Catalogo().DefineDOSName(Novo.Nome);
-  Novo.ArquivoCurto = DirCurto + (Entrada.ShortName.empty() ? Entrada.Name : Entrada.ShortName);
-  Novo.Arquivo = DirRoms + Entrada.Name;
-  return Novo;
 }
 
 void Habilitar(std::initializer_list<platform::Control*> Controles, bool Habilitado) {

@@ -1,25 +1,11 @@
 // The preview picture, and small look-ups that several commands share.
+#include "collection/jogo.h"
 #include "mainwindow/Form1.h"
 #include "platform/text.h"
 #include "support/mod_Arquivos.h"
-#include "support/mod_Globais.h"
-
-namespace {
-
-constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg", ".png"};  // the first one present is shown
-
-std::string ImagemDe(const std::string& Nome) {
-  for (const char* Extensao : ExtensoesDeImagem) {
-    std::string Caminho = DirImgs + Nome + Extensao;
-    if (ArquivoExiste(Caminho)) return Caminho;
-  }
-  return {};
-}
-
-}  // namespace
 
 void Form1::MostrarImagem() {
-  const std::string Caminho = List1.Selected() == -1 ? std::string{} : ImagemDe(NomeSelecionado());
+  const std::string Caminho = List1.Selected() == -1 ? std::string{} : ImagemDoJogo(NomeSelecionado());
   if (Caminho.empty()) {
     Image1.SetPicture(Picture1);
     return;
@@ -30,7 +16,7 @@ void Form1::MostrarImagem() {
 
 std::string Form1::CaminhoImagem(int Linha) const {
   if (Linha < 0 || static_cast<std::size_t>(Linha) >= Jogos.size()) return {};
-  return ImagemDe(Jogos[static_cast<std::size_t>(Linha)].Nome);
+  return ImagemDoJogo(Jogos[static_cast<std::size_t>(Linha)].Nome);
 }
 
 int Form1::IndiceJogo(const std::string& Nome) const {

@@ -12,14 +12,15 @@ import sys
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 LONGEST = 400  # lines
 
-# Who may include whose headers, besides its own: app -> windows -> package, catalog -> support -> platform.
+# Who may include whose headers, besides its own: app -> windows -> collection -> package, catalog -> support -> platform.
 SUPPORT = {"platform", "support"}
-WINDOW = SUPPORT | {"catalog", "package", "resources"}
+WINDOW = SUPPORT | {"catalog", "package", "collection", "resources"}
 MAY_INCLUDE = {
     "platform": {"resources"},
     "support": {"platform"},
     "catalog": SUPPORT,
     "package": SUPPORT,
+    "collection": SUPPORT | {"catalog", "package"},
     "controller": WINDOW,
     "savemanager": WINDOW,
     "mainwindow": WINDOW | {"controller", "savemanager"},
@@ -40,7 +41,7 @@ def project_files():
 
 # What only support/ does: a text that is written where it is shown would escape the translation's checks.
 MESSAGE = re.compile(r'MessageBoxA\(|Traduzir\("')
-SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "controller/", "mainwindow/", "package/", "savemanager/")
+SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "collection/", "controller/", "mainwindow/", "package/", "savemanager/")
 
 
 def check_include(name, included):

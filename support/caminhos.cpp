@@ -1,5 +1,17 @@
 #include "support/caminhos.h"
 
+#include "platform/text.h"
+
 std::string DiretorioDe(const std::string& Caminho) { return Caminho.substr(0, Caminho.rfind('\\') + 1); }
 
 std::string UltimaParte(const std::string& Caminho) { return Caminho.substr(Caminho.rfind('\\') + 1); }
+
+std::optional<std::string> NomeBase(const std::string& NomeDoArquivo) {
+  const auto ponto = NomeDoArquivo.rfind('.');
+  if (ponto == std::string::npos) return std::nullopt;
+  return NomeDoArquivo.substr(0, ponto);
+}
+
+std::string TipoDoArquivo(const std::string& Caminho) {
+  return platform::CharUpperBuffA(Caminho.size() > 3 ? Caminho.substr(Caminho.size() - 3) : Caminho);
+}

@@ -1,6 +1,7 @@
 // The parts of a path's text. Nothing here looks at a disk.
 #pragma once
 
+#include <optional>
 #include <string>
 
 // Up to its last backslash, that included; empty when there is none.
@@ -8,3 +9,9 @@ std::string DiretorioDe(const std::string& Caminho);
 
 // Behind its last backslash: all of it when there is none.
 std::string UltimaParte(const std::string& Caminho);
+
+// A file name without its last "." and what follows; nothing when it has no ".".
+std::optional<std::string> NomeBase(const std::string& NomeDoArquivo);
+
+// The last three characters, in upper case: the type that decides how a file is treated.
+std::string TipoDoArquivo(const std::string& Caminho);

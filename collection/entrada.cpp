@@ -1,0 +1,72 @@
+#include "collection/entrada.h"
+
+#include "package/cls_CRC.h"
+#include "support/caminhos.h"
+#include "support/gravacao.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+
+namespace {
+
+using platform::Existing;
+
+std::string ArquivoDaRom(const Pacote& novo) { return DirRoms + novo.DOSName + ".zip"; }
+
+// Makes the new contents the files' own. What has to be written in place can fail, and goes first; what lies complete
+// beside its file can only take the name.
+bool TomarNomes(Substituicao& figura, Substituicao& rom) {
+  return figura.EstaAoLado() ? rom.Concluir() && figura.Concluir() : figura.Concluir() && rom.Concluir();
+}
+
+// Whether the ROM as it stands on the disk has the package's checksum.
+Entrada ConferirRom(const std::string& arquivo, const Pacote& novo) {
+  platform::File aberto(arquivo, platform::Access::Read);
+  const auto soma = cls_CRC().CRC(aberto);
+  if (!soma) return Entrada::NaoLida;
+  return TextoCRC(*soma) == novo.CRC ? Entrada::Feita : Entrada::Corrompida;
+}
+
+// The same of the package as it was read.
+Entrada ConferirPacote(const Pacote& novo) {
+  const auto soma = cls_CRC().CRC(novo.Rom);
+  if (!soma || novo.Imagem.empty()) return Entrada::NaoLida;
+  return TextoCRC(*soma) == novo.CRC ? Entrada::Feita : Entrada::Corrompida;
+}
+
+}  // namespace
+
+Entrada PorRom(const std::string& Caminho, const EntrePassos& Pausa) {
+  const std::string conteudo = LerArquivo(Caminho);
+  if (conteudo.empty()) return Entrada::NaoLida;
+  Pausa();
+  const std::string destino = DirRoms + UltimaParte(Caminho);
+  const bool existia = ArquivoExiste(destino);
+  if (GravarArquivo(destino, conteudo, 1, true) == 1) return Entrada::Feita;
+  if (!existia) ApagarArquivo(destino);
+  return Entrada::NaoGravada;
+}
+
+Encontro OQueEncontra(const Pacote& Novo) {
+  const std::string arquivo = ArquivoDaRom(Novo);
+  const auto tamanho = platform::FileSize(arquivo);
+  if (!tamanho) return Encontro::Nada;
+  return *tamanho == 0 || LerArquivo(arquivo) == Novo.Rom ? Encontro::MesmaRom : Encontro::OutraRom;
+}
+
+Entrada PorPacote(const Pacote& Novo, Existing RomExistente, const EntrePassos& Pausa) {
+  Entrada fim = ConferirPacote(Novo);
+  if (fim != Entrada::Feita) return fim;
+  const std::string arquivoImagem = DirImgs + Novo.Nome + ".gif", arquivoRom = ArquivoDaRom(Novo);
+  Substituicao figura(arquivoImagem, Novo.Imagem), rom(arquivoRom, Novo.Rom, RomExistente);
+  Pausa();
+  const bool conferidaAntes = rom.EstaAoLado();
+  if (conferidaAntes) fim = ConferirRom(rom.Provisorio(), Novo);
+  if (fim != Entrada::Feita) return fim;
+  if (!TomarNomes(figura, rom)) return Entrada::NaoGravada;
+  if (!conferidaAntes) fim = ConferirRom(arquivoRom, Novo);
+  if (fim == Entrada::Corrompida) {
+    ApagarArquivo(arquivoRom);
+    ApagarArquivo(arquivoImagem);
+  }
+  return fim;
+}

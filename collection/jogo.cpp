@@ -1,0 +1,33 @@
+#include "collection/jogo.h"
+
+#include "catalog/cls_DAT.h"
+#include "support/caminhos.h"
+#include "support/mod_Arquivos.h"
+#include "support/mod_Globais.h"
+
+namespace {
+
+constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg", ".png"};  // the first one present is shown
+
+}  // namespace
+
+Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto) {
+  Jogo jogo;
+  const auto base = NomeBase(Entrada.Name);
+  if (!base) return jogo;
+  Booleano encontrado = Falso;
+  jogo.Nome = Catalogo().DefineNome(*base, encontrado);
+  jogo.Catalogado = encontrado != Falso;
+  if (jogo.Catalogado) jogo.DOSName = Catalogo().DefineDOSName(jogo.Nome);
+  jogo.ArquivoCurto = DirCurto + (Entrada.ShortName.empty() ? Entrada.Name : Entrada.ShortName);
+  jogo.Arquivo = DirRoms + Entrada.Name;
+  return jogo;
+}
+
+std::string ImagemDoJogo(const std::string& Nome) {
+  for (const char* extensao : ExtensoesDeImagem) {
+    std::string caminho = DirImgs + Nome + extensao;
+    if (ArquivoExiste(caminho)) return caminho;
+  }
+  return "";
+}
