@@ -3,16 +3,16 @@
 
 #include "autoconfig/FormCfg.h"
 #include "support/mod_Configuracao.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
 const std::string Chave = ChaveConfiguracao, ParaDos = "C:\\Tolvaris\\ZSNES\\zsnes.exe";
 const std::string Emulador = "C:\\Tolvaris\\ZSNES\\zsnesw.exe", Configuracao = "C:\\Tolvaris\\ZSNES\\zsnesw.cfg";
-const Textos Nada(5, "-");
-const Textos Padroes = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
+const Texts Nada(5, "-");
+const Texts Padroes = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
 
-struct Janela : Maquina {
+struct Janela : FreshMachine {
   Janela() { PutFile(Emulador, "MZ"); }
 
   void Abrir() {
@@ -25,8 +25,8 @@ struct Janela : Maquina {
   void Outro(const std::string& caminho) { QueueFileDialog(caminho), Click(form->Command3); }
 
   // RomDir, SaveDir, ImgDir, EmuExe and EmuCFG as they are stored; "-": not set.
-  static Textos Gravados() {
-    Textos textos;
+  static Texts Gravados() {
+    Texts textos;
     for (const NomeDeAjuste& cada : NomesDosAjustes) textos.push_back(StoredText(Chave, cada.Nome).value_or("-"));
     return textos;
   }
@@ -38,7 +38,7 @@ TEST_F(Janela, ShowsWhatItFoundInEachLanguageAndWritesIt) {
   const std::string diretorios = "|Jogos:|C:\\Tolvaris\\Roms\\|Salvamentos:|C:\\Tolvaris\\Saves\\|";
   RemoveFile(Emulador);
   AbrirEProcurar();
-  EXPECT_EQ(TextosDe(*form),
+  EXPECT_EQ(TextsOf(*form),
             "Configuração do Tolvaris|Emuladores encontrados:||Nenhum emulador foi encontrado. Clique em 'Procurar "
             "outro...'.|&Procurar outro...| Configuração |&Gravar|&Cancelar|Emulador:||Arquivo de configuração:|"_ansi +
                 diretorios + "Imagens:|C:\\Tolvaris\\Imgs\\");
@@ -52,13 +52,13 @@ TEST_F(Janela, ShowsWhatItFoundInEachLanguageAndWritesIt) {
           "&Gravar=Save\r\n&Cancelar=Cancel\r\nBusca concluída.=Done\r\n"_ansi);
   AbrirEProcurar();
   EXPECT_FALSE(form->Timer1.Enabled());
-  EXPECT_EQ(Entradas(form->List1), Emulador + "|");
-  EXPECT_EQ(TextosDe(*form), "Setup|Found||Done|Other|Settings|Save|Cancel|Emulador:|" + Emulador +
-                                 "|Arquivo de configuração:|"_ansi + Configuracao + diretorios +
-                                 "Pictures|C:\\Tolvaris\\Imgs\\");
+  EXPECT_EQ(EntriesOf(form->List1), Emulador + "|");
+  EXPECT_EQ(TextsOf(*form), "Setup|Found||Done|Other|Settings|Save|Cancel|Emulador:|" + Emulador +
+                                "|Arquivo de configuração:|"_ansi + Configuracao + diretorios +
+                                "Pictures|C:\\Tolvaris\\Imgs\\");
   DenyKey(Chave);
   Gravar();
-  EXPECT_EQ(Mensagens(), Textos{Erro + "Não foi possível gravar a configuração."_ansi});
+  EXPECT_EQ(TakeMessages(), Texts{Error + "Não foi possível gravar a configuração."_ansi});
   EXPECT_FALSE(form->IsClosed());
   DenyKey(Chave, false);
   Gravar();
@@ -83,8 +83,8 @@ TEST_F(Janela, CancelWritesNothingEvenInTheMiddleOfTheSearch) {
 
 TEST_F(Janela, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
   const std::string meu = "D:\\Meu Emulador\\zsnes.exe", cfg = "D:\\Meu Emulador\\zsnes.cfg";
-  const Textos tudo = {"D:\\Jogos\\", "\\Salvos\\", "-", meu, "-"}, soCfg = {"-", "-", "-", "", "D:\\meu.cfg"};
-  const std::tuple<Textos, std::vector<int>, Textos> casos[] = {
+  const Texts tudo = {"D:\\Jogos\\", "\\Salvos\\", "-", meu, "-"}, soCfg = {"-", "-", "-", "", "D:\\meu.cfg"};
+  const std::tuple<Texts, std::vector<int>, Texts> casos[] = {
       // what is set, what is chosen in the list, and what is set afterwards
       {tudo, {1, 0}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", meu, cfg}},
       {tudo, {1}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", Padroes[3], Padroes[4]}},
@@ -107,7 +107,7 @@ TEST_F(Janela, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
       DoubleClick(form->List1);
     }
     EXPECT_EQ(Gravados(), depois);
-    EXPECT_EQ(Mensagens(), Textos());
+    EXPECT_EQ(TakeMessages(), Texts());
   }
 }
 
@@ -133,8 +133,8 @@ TEST_F(Janela, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
     Abrir();
     Outro(arquivo);
     Gravar();
-    EXPECT_EQ(Gravados(), (Textos{"\\Roms\\", "\\Saves\\", "\\Imgs\\", gravado, configuracao})) << arquivo;
-    EXPECT_EQ(Mensagens(), curtos ? Textos() : Textos{aviso + arquivo});
+    EXPECT_EQ(Gravados(), (Texts{"\\Roms\\", "\\Saves\\", "\\Imgs\\", gravado, configuracao})) << arquivo;
+    EXPECT_EQ(TakeMessages(), curtos ? Texts() : Texts{aviso + arquivo});
   }
   PutFile("C:\\E\\zsnes.cfg", "x");
   EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";
@@ -152,13 +152,13 @@ TEST_F(Janela, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused)
   EXPECT_EQ(pedido.InitialDirectory, "C:\\Outro\\");
   EXPECT_EQ(pedido.Title + pedido.Filter,
             "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
-  const std::string demais = Erro + "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
+  const std::string demais = Error + "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
   for (const auto& [arquivo, mensagem] :
-       {std::pair("C:\\Outro\\vazio.exe"s, Erro + "O emulador ZSnes não foi encontrado."_ansi),
+       {std::pair("C:\\Outro\\vazio.exe"s, Error + "O emulador ZSnes não foi encontrado."_ansi),
         {longo + "z.exe", demais + longo + "zsnesw.cfg"}}) {
     Outro(arquivo);
     Gravar();
-    EXPECT_EQ(Mensagens(), Textos{mensagem});
+    EXPECT_EQ(TakeMessages(), Texts{mensagem});
     EXPECT_TRUE(Gravados() == Nada && !form->IsClosed());
   }
   EXPECT_EQ(Impedimento(std::string(254, 'x')), std::nullopt);
@@ -172,7 +172,7 @@ const std::string Depois = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPat
 
 TEST_F(Janela, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
   const std::string antiga = "SaveDirectory = C:\\S\r\n";
-  const Textos pergunta = {
+  const Texts pergunta = {
       "Confirmar, Yes/No/Cancel, question: Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris "
       "não altera ao jogar.\r\n"
       "Com ele a opção de usar disquete não tem efeito.\r\n\r\n"
@@ -187,7 +187,7 @@ TEST_F(Janela, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
     AbrirEProcurar();
     QueueAnswer(resposta);
     Gravar();
-    EXPECT_EQ(Mensagens(), antes == Antes ? pergunta : Textos()) << antes;
+    EXPECT_EQ(TakeMessages(), antes == Antes ? pergunta : Texts()) << antes;
     EXPECT_EQ(Content(Configuracao), depois);
     EXPECT_EQ(Gravados(), grava ? Padroes : Nada);
     EXPECT_EQ(form->IsClosed(), grava);
@@ -213,12 +213,12 @@ TEST_F(Janela, EveryFaultLeavesWholeFilesAndIsSaid) {
   const auto conferir = [&] {
     const std::string conteudo = Content(Configuracao).value_or("");
     EXPECT_TRUE(conteudo == Antes || conteudo == Depois) << conteudo;
-    const Textos mensagens = Mensagens();
+    const Texts mensagens = TakeMessages();
     EXPECT_EQ(fechou, mensagens.empty() || !mensagens.back().starts_with("Erro, "));
     EXPECT_TRUE(Gravados() == Padroes || (Gravados()[4] == "-" && !fechou)) << "configured is only what is complete";
     EXPECT_EQ(abertos, 0U);
   };
-  EXPECT_GT(ComCadaFalha(preparar, operar, conferir), 20);
+  EXPECT_GT(WithEachFault(preparar, operar, conferir), 20);
 }
 
 }  // namespace

@@ -1,11 +1,11 @@
 #include "catalog/cls_DAT.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
 const std::string Arquivo = "C:\\Tolvaris\\tolvaris.dat";
 
-struct CatalogoDeJogos : Maquina {
+struct CatalogoDeJogos : FreshMachine {
   // The name of a DOS name, or "-" when there is none.
   std::string Nome(const std::string& dosName) const {
     Booleano encontrado = 7;
@@ -64,7 +64,7 @@ TEST_F(CatalogoDeJogos, RegistrarRomAppendsOneEntryInOneWriteWholeOrNotAtAll) {
   };
   const auto registrar = [&] { Catalogo.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
   const auto conferir = [&] { EXPECT_TRUE(Content(Arquivo) == velho || Content(Arquivo) == velho + entrada); };
-  EXPECT_GE(ComCadaFalha(Fault::Once, preparar, registrar, conferir), 2);
+  EXPECT_GE(WithEachFault(Fault::Once, preparar, registrar, conferir), 2);
   const auto escritas = WriteCount(Arquivo);
   registrar();
   EXPECT_EQ(WriteCount(Arquivo), escritas + 1);

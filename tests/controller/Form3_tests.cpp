@@ -1,5 +1,5 @@
 #include "controller/Form3.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
@@ -7,9 +7,9 @@ namespace {
 void Usar(const std::string& primeiro, const std::string& segundo, void (*fechar)(Form3&)) {
   QueueModal([&](platform::Window& aberta) {
     auto& janela = static_cast<Form3&>(aberta);
-    EXPECT_EQ(TextosDe(janela), primeiro);
+    EXPECT_EQ(TextsOf(janela), primeiro);
     Choose(janela.Combo1, 1);
-    EXPECT_EQ(TextosDe(janela), segundo);
+    EXPECT_EQ(TextsOf(janela), segundo);
     Choose(janela.Combo1, 2);
     EXPECT_EQ(janela.Combo1.Selected(), 1) << "there is no third player";
     for (int vez = 0; vez < 2; ++vez) Tick(janela.Timer1);
@@ -20,7 +20,7 @@ void Usar(const std::string& primeiro, const std::string& segundo, void (*fechar
 }
 
 TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
-  Maquina::Reiniciar();
+  FreshMachine::Renew();
   const std::string teclas2 = "Home|Page Down|Delete|End|Shift d.|ENTER|U|J|I|K|O|L";
   const std::string teclas1 = "Seta direita|Seta esquerda|Seta baixo|Shift e.|CTRL e.|A|Z|S|X|D|C";
   Usar("Controle||&Fechar|Seta cima|" + teclas1, "Controle||&Fechar|" + teclas2,
@@ -30,13 +30,13 @@ TEST(Form3, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
           "[TOLVARIS20]\r\nControle=Pad\r\n&Fechar=&Close\r\nSeta cima=Up\r\nInformação=Note\r\n"
           "Guarde os comandos do controle. Se necessário anote-os.=Learn them.\r\n"_ansi);
   Usar("Pad||&Close|Up|" + teclas1, "Pad||&Close|" + teclas2, [](Form3&) { Form3::Descarregar(); });
-  const Textos lembretes = {"Informação, OK, information: Guarde os comandos do controle. Se necessário anote-os."_ansi,
-                            "Note, OK, information: Learn them."};
-  EXPECT_EQ(Mensagens(), lembretes) << "also: both windows were opened";
+  const Texts lembretes = {"Informação, OK, information: Guarde os comandos do controle. Se necessário anote-os."_ansi,
+                           "Note, OK, information: Learn them."};
+  EXPECT_EQ(TakeMessages(), lembretes) << "also: both windows were opened";
 }
 
 TEST(Form3, OpensAgainAfterAWindowThatCouldNotBeMade) {
-  Maquina::Reiniciar();
+  FreshMachine::Renew();
   RefuseWindows();
   Form3::ABRIR();
   Form3::Descarregar();

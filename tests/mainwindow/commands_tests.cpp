@@ -8,14 +8,14 @@ namespace {
 struct Commands : Menu {};
 
 TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
-  const Textos unknown = {Erro + "Erro interno: jogo não encontrado no sistema."_ansi};
-  const Textos gone = {Erro + "O jogo não foi encontrado."_ansi};
-  const std::tuple<const char*, std::function<void()>, Textos, Textos> cases[] = {
+  const Texts unknown = {Error + "Erro interno: jogo não encontrado no sistema."_ansi};
+  const Texts gone = {Error + "O jogo não foi encontrado."_ansi};
+  const std::tuple<const char*, std::function<void()>, Texts, Texts> cases[] = {
       // what is missing, what play says, and what export and delete say
       {"a selection", [this] { form->List1.Select(-1); }, {}, unknown},
       {"the game's row", [this] { form->Jogos.clear(); }, unknown, unknown},
       {"the ROM", [] { RemoveFile(Roms + "SEMFIG.SMC"); }, gone, gone},
-      {"the emulator", [] { RemoveFile(Emulator); }, {Erro + "O emulador ZSnes não foi encontrado."_ansi}, {}},
+      {"the emulator", [] { RemoveFile(Emulator); }, {Error + "O emulador ZSnes não foi encontrado."_ansi}, {}},
   };
   for (const auto& [name, spoil, playSays, othersSay] : cases) {
     SCOPED_TRACE(name);
@@ -24,12 +24,12 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
     spoil();
     const Files before = Standing();
     Click(form->Command1);
-    EXPECT_EQ(Mensagens(), playSays);
+    EXPECT_EQ(TakeMessages(), playSays);
     EXPECT_EQ(Focused() == &form->List1, playSays.empty());
     EXPECT_EQ(States(), GameSelected);
     for (platform::Button* command : {&form->Command5, &form->Command6}) {
       Click(*command);
-      EXPECT_TRUE(othersSay.empty() || Mensagens() == othersSay);
+      EXPECT_TRUE(othersSay.empty() || TakeMessages() == othersSay);
     }
     EXPECT_TRUE(Standing() == before && StartedProcesses().empty());
     EXPECT_EQ(StoredText(Key, "LRom"), std::nullopt);
@@ -73,7 +73,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
     };
     const auto check = [&] {
       EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
-      Textos shown = Mensagens();
+      Texts shown = TakeMessages();
       const bool asked =
           std::erase_if(shown, [](const std::string& text) { return text.starts_with("Confirmar"); }) > 0;
       EXPECT_TRUE(asked || result == Roms + "SUPERJOG.zip" || Content(result) == before[result]) << "replaced unasked";
@@ -81,7 +81,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
       EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
       EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
       EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok, ") || Content(result) != before[result]);
-      EXPECT_EQ(Restos({Roms, Imgs, "C:\\Emu\\", "C:\\"}), Textos{});
+      EXPECT_EQ(Leftovers({Roms, Imgs, "C:\\Emu\\", "C:\\"}), Texts{});
       for (const bool cut : {false, true}) {
         if (cut) CutPower();
         for (const Files& files : {before, after, Standing()}) {
@@ -96,7 +96,7 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
     prepare();
     operate();
     after = Standing();
-    EXPECT_GT(ComCadaFalha(prepare, operate, check), 5);
+    EXPECT_GT(WithEachFault(prepare, operate, check), 5);
   }
 }
 
@@ -119,7 +119,7 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
     EXPECT_EQ(Selected(), neighbour) << name;
     EXPECT_EQ(States(), *neighbour ? GameSelected : NothingSelected) << name;
   }
-  EXPECT_EQ(Mensagens()[0], "Confirmar deleção, Yes/No/Cancel, exclamation: Deletar o jogo ' Sem figura ' ?"_ansi);
+  EXPECT_EQ(TakeMessages()[0], "Confirmar deleção, Yes/No/Cancel, exclamation: Deletar o jogo ' Sem figura ' ?"_ansi);
 }
 
 }  // namespace

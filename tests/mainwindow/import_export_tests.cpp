@@ -4,9 +4,9 @@ namespace {
 
 const std::string Added = "Ok, OK, information: Jogo adicionado com sucesso.",
                   Saved = "Ok, OK, information: Arquivo salvo.";
-const std::string ReadError = Erro + "Erro ao ler arquivo.", WriteError = Erro + "Erro ao gravar arquivo.";
-const std::string ExportError = Erro + "Erro ao salvar arquivo.";
-const std::string Corrupt = Erro +
+const std::string ReadError = Error + "Erro ao ler arquivo.", WriteError = Error + "Erro ao gravar arquivo.";
+const std::string ExportError = Error + "Erro ao salvar arquivo.";
+const std::string Corrupt = Error +
                             "Houve uma diferença na medição dos códigos CRC.\r\n"
                             "Essa mudança indica que o arquivo está corrompido."_ansi;
 const std::string ReplaceGame =
@@ -53,7 +53,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
                          {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||SUPERJOG=Outro|"}};
   const struct {
     std::string Path, Content;
-    Textos Shown;
+    Texts Shown;
     std::string Selected = {};
     Files New = {};  // what stands there afterwards, beside what stood there
     Before Happens = Nothing;
@@ -102,7 +102,7 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
     each.Happens();
     QueueEvent([this] { EXPECT_EQ(States(), Busy); });
     ChooseFile(form->Command4, each.Path);
-    EXPECT_EQ(Mensagens(), each.Shown);
+    EXPECT_EQ(TakeMessages(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
     EXPECT_EQ(Selected(), each.Selected);
     EXPECT_EQ(States(), each.Selected.empty() ? NothingSelected : GameSelected);
@@ -117,7 +117,7 @@ TEST_F(Import, OfAPackageWithTheRomThatIsThereAlreadyAsksNothing) {
   PutFile("C:\\novo.tvk", Package("Novo", "UM"));
   ASSERT_TRUE(Start());
   ChooseFile(form->Command4, "C:\\novo.tvk");
-  EXPECT_EQ(Mensagens(), Textos{Added});
+  EXPECT_EQ(TakeMessages(), Texts{Added});
   EXPECT_EQ(Selected(), "Novo");
 }
 
@@ -132,7 +132,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
   const struct {
     std::string Name, Offered;  // the extension and the types
     std::string Target;
-    Textos Shown;
+    Texts Shown;
     std::optional<std::string> Left;  // content of the target afterwards
     Before Happens = Nothing;
   } cases[] = {
@@ -162,7 +162,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     if (each.Left) expected[each.Target] = each.Left;
     QueueEvent([this] { EXPECT_EQ(States(), Busy); });
     ChooseFile(form->Command5, each.Target);
-    EXPECT_EQ(Mensagens(), each.Shown);
+    EXPECT_EQ(TakeMessages(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
     EXPECT_EQ(States(), NothingSelected);  // the game commands wait for the next click
     const auto& asked = ShownFileDialogs().back();

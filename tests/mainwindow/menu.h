@@ -9,7 +9,7 @@
 #include "catalog/cls_DAT.h"
 #include "mainwindow/Form1.h"
 #include "package/pacote.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 using Files = std::map<std::string, std::optional<std::string>>;  // contents by full path
 
@@ -25,7 +25,7 @@ inline std::string Package(const std::string& name, const std::string& dosName, 
                       static_cast<std::int64_t>(rom.size()), picture, rom);
 }
 
-struct Menu : Maquina {
+struct Menu : FreshMachine {
   Menu() { SetUpMachine(); }
   ~Menu() override { End(); }
 
@@ -36,7 +36,7 @@ struct Menu : Maquina {
 
   void SetUpMachine() {
     End();
-    Reiniciar();
+    Renew();
     for (const char* shown : {"AvisoControle", "AvisoALTF4"}) PutText(Key, shown, "1");
     PutText(Key, "EmuExe", Emulator);
     PutText(Key, "EmuCFG", EmulatorConfig);

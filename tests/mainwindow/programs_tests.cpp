@@ -27,7 +27,7 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   const std::string notice =
       "Informação, OK, information: Para fechar o jogo precione e segure a tecla 'ALT' e "
       "simultaneamente aperte e tecla 'F4'"_ansi;
-  EXPECT_EQ(Mensagens(), Textos{notice});
+  EXPECT_EQ(TakeMessages(), Texts{notice});
   EXPECT_EQ(States(), GameSelected);
 
   const auto writes = WriteCount(EmulatorConfig);
@@ -59,7 +59,7 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
     EXPECT_EQ(Content(EmulatorConfig), after) << name;
   }
   EXPECT_EQ(StartedProcesses().size(), 7U);
-  EXPECT_EQ(Mensagens(), Textos{});
+  EXPECT_EQ(TakeMessages(), Texts{});
   EXPECT_FALSE(form->Form_Load()) << "loaded again once a game was started, the window closes";
   EXPECT_TRUE(form->IsClosed());
 }
@@ -77,7 +77,7 @@ TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
   const std::string prompt =
       "Disquete A:, Retry/Cancel, exclamation: Não há disquete na unidade A:\\\r\n\r\n"
       "Coloque um disquete e clique em 'Repetir'."_ansi;
-  EXPECT_EQ(Mensagens(), Textos(3, prompt));
+  EXPECT_EQ(TakeMessages(), Texts(3, prompt));
   EXPECT_TRUE(StartedProcesses().empty());
   EXPECT_EQ(StoredText(Key, "Disquete"), std::nullopt);
   EXPECT_EQ(States(), GameSelected);
@@ -127,7 +127,7 @@ TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
 TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
   ASSERT_TRUE(Start());
   Click(form->Command3);
-  EXPECT_EQ(Mensagens(), Textos{Erro + "O programa de download não foi encontrado."_ansi});
+  EXPECT_EQ(TakeMessages(), Texts{Error + "O programa de download não foi encontrado."_ansi});
   EXPECT_EQ(States(), GameSelected);
 
   PutFile(Downloader, "no program");

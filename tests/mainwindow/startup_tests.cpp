@@ -64,8 +64,8 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   EXPECT_EQ(form->Left(), 1500);
   EXPECT_EQ(form->Top(), 3000);
   EXPECT_EQ(form->Check1.Value(), 1);
-  EXPECT_EQ((Textos{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
-            (Textos{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
+  EXPECT_EQ((Texts{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
+            (Texts{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
   EXPECT_TRUE(DirectoryStands(DirRoms) && DirectoryStands(DirImgs));
 }
 
@@ -85,14 +85,14 @@ TEST_F(Startup, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
   }
   PassTime(3601);
   ASSERT_TRUE(Start());
-  EXPECT_EQ(Entradas(form->List1), "Nome comprido|Sem figura|Super Jogo|");
+  EXPECT_EQ(EntriesOf(form->List1), "Nome comprido|Sem figura|Super Jogo|");
   for (const std::string& path : AllFiles()) EXPECT_FALSE(path.ends_with(mark)) << path;
 }
 
 TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   const std::string configurator = Home + "tolvariscfg.exe";
   const std::string missing =
-      Erro +
+      Error +
       "Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado.\r\n"
       "Reinstale o programa."_ansi;
   const std::string question =
@@ -114,7 +114,7 @@ TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   QueueAnswer(Answer::Yes);
   EXPECT_TRUE(Start());
   EXPECT_EQ(runs, 2);
-  EXPECT_EQ(Mensagens(), (Textos{missing, question, question, question}));
+  EXPECT_EQ(TakeMessages(), (Texts{missing, question, question, question}));
   EXPECT_EQ(StartedProcesses().back().CommandLine + "|" + StartedProcesses().back().Directory,
             configurator + "|" + Home);
 }
@@ -138,11 +138,11 @@ TEST_F(Startup, TranslatesTheWindowAndItsMessages) {
           "[TOLVARIS20]\r\nJogar=Play\r\nUsar disquete para salvar o jogo=Keep saves on a floppy\r\n"
           "Deletar jogo=Delete game\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nConfirmar deleção=Confirm\r\n"_ansi);
   StartAndPick("Super Jogo");
-  EXPECT_EQ(TextosDe(*form),
+  EXPECT_EQ(TextsOf(*form),
             "Tolvaris||Play|Keep saves on a floppy|Ler/Gravar salvamento de jogos do disquete|Baixar jogos da internet|"
             "Importar jogo de...|Exportar jogo para...|Delete game|");
   Click(form->Command6);
-  EXPECT_EQ(Mensagens(), Textos{"Confirm, Yes/No/Cancel, exclamation: Delete ' Super Jogo ' now?"});
+  EXPECT_EQ(TakeMessages(), Texts{"Confirm, Yes/No/Cancel, exclamation: Delete ' Super Jogo ' now?"});
 }
 
 }  // namespace

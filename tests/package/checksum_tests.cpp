@@ -5,7 +5,7 @@
 
 #include "package/cls_CRC.h"
 #include "package/crc32.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
@@ -41,7 +41,7 @@ TEST(ClsCRC, AnyReadThatFailsLeavesNoValue) {
     falhou = CallFailed();
   };
   const auto preparar = [] { PutFile(Caminho, std::string(2 * Pedaco + 1, 'x')); };
-  EXPECT_GT(ComCadaFalha(preparar, somar, [&] { EXPECT_NE(temValor, falhou); }), 3);  // each of three reads among them
+  EXPECT_GT(WithEachFault(preparar, somar, [&] { EXPECT_NE(temValor, falhou); }), 3);  // each of three reads among them
 }
 
 // The register is all that is carried on, so any register stands for bytes that another way has taken before.

@@ -2,7 +2,7 @@
 #include "catalog/cls_DAT.h"
 #include "resources/ids.h"
 #include "savemanager/Form4.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
@@ -11,7 +11,7 @@ using namespace platform;
 const std::string NosDois = "Corrida 2 [State 0]", Velho = "velho no disquete", Novo = "novo no computador";
 const std::string SemNome = "SEMNOME [State 2]", Fonte = "C:\\Saves\\SEMNOME.zs2", Alvo = "A:\\SEMNOME.zs2";
 
-const std::string ErroAoGravar = Erro + "Erro ao gravar arquivo.", ErroAoLer = Erro + "Erro ao ler arquivo.";
+const std::string ErroAoGravar = Error + "Erro ao gravar arquivo.", ErroAoLer = Error + "Erro ao ler arquivo.";
 const std::string DiscoCheio =
     "Disco cheio, OK, exclamation: Não há espaço livre suficiente em disco para completar a operação."_ansi;
 const std::string Deletar = "Confirmar deleção, Yes/No/Cancel, question: "_ansi;
@@ -22,11 +22,11 @@ std::string JaExiste(const std::string& lado) {
 }
 
 // Saves: one on the floppy, one on the computer, and one on both.
-struct Salvamentos : Maquina {
+struct Salvamentos : FreshMachine {
   Salvamentos() { Preparar(); }
 
   static void Preparar() {
-    Reiniciar();
+    Renew();
     AddDisk('A', 1457664);
     DirSaves = "C:\\Saves\\";
     PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||DOIS=Corrida 2|");
@@ -70,8 +70,8 @@ TEST_F(Salvamentos, AreListedUnderTheNamesOfTheirGamesAndThePickedOneDecides) {
       {&Form4::List1, 1, "1 1" + doDisquete + "UM.srm"},
   };
   Abrir([&](Form4& janela) {
-    EXPECT_EQ(Entradas(janela.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
-    EXPECT_EQ(Entradas(janela.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
+    EXPECT_EQ(EntriesOf(janela.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
+    EXPECT_EQ(EntriesOf(janela.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
     janela.List2_Click();
     janela.Command1_Click();
     EXPECT_TRUE(NadaEscolhido(janela) && ShownMessages().empty()) << "nothing is picked yet";
@@ -90,7 +90,7 @@ TEST_F(Salvamentos, AreCopiedInPiecesWhateverIsClickedMeanwhile) {
   PutFile("A:\\UM.srm", longo);
   PutFile("A:\\RESTO.srm.0f3a99c2.novo~", "of a copy that was broken off");
   PassTime(3601);
-  Textos titulos;
+  Texts titulos;
   Abrir([&](Form4& janela) {
     Escolher(janela.List1, "Jogo Um");
     const std::function<void()> olhar = [&] {
@@ -105,13 +105,13 @@ TEST_F(Salvamentos, AreCopiedInPiecesWhateverIsClickedMeanwhile) {
     };
     QueueEvent(olhar);
     Click(janela.Command1);
-    EXPECT_EQ(titulos, (Textos{"Copiando...", "Copiando... 49%", "Copiando... 99%"}));
+    EXPECT_EQ(titulos, (Texts{"Copiando...", "Copiando... 49%", "Copiando... 99%"}));
     EXPECT_EQ(janela.Caption(), "Salvamentos dos jogos");
     EXPECT_FALSE(janela.IsClosed());
     EXPECT_EQ(Focused(), &janela.List1) << "the copy button is hidden: the keyboard goes where the copy came from";
     EXPECT_TRUE(NadaEscolhido(janela));
-    EXPECT_EQ(Entradas(janela.List1), "Corrida 2 [State 0]|Jogo Um|") << "the pane of the source is not filled again";
-    EXPECT_EQ(Entradas(janela.List2), "Corrida 2 [State 0]|Jogo Um|SEMNOME [State 2]|");
+    EXPECT_EQ(EntriesOf(janela.List1), "Corrida 2 [State 0]|Jogo Um|") << "the pane of the source is not filled again";
+    EXPECT_EQ(EntriesOf(janela.List2), "Corrida 2 [State 0]|Jogo Um|SEMNOME [State 2]|");
   });
   EXPECT_EQ(Content("C:\\Saves\\UM.srm"), longo);
   EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), Novo);
@@ -140,7 +140,7 @@ TEST_F(Salvamentos, AreReplacedAndDeletedOnlyAfterYes) {
     EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), sim && !disquete ? resto : Novo);
     const std::string lado = disquete ? "Disquete (A:)" : "Computador";
     const std::string pergunta = "Deletar o salvamento do jogo '" + NosDois + "' que está no "_ansi + lado + " ?";
-    EXPECT_EQ(Mensagens(), Textos{apagar ? Deletar + pergunta : JaExiste(lado)});
+    EXPECT_EQ(TakeMessages(), Texts{apagar ? Deletar + pergunta : JaExiste(lado)});
   }
 }
 
@@ -154,7 +154,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
   const Fazer resto = [&] { restoNovo(), SetAge("A:\\X.srm.0f3a99c2.novo~", 3601); };
   const std::string existe = JaExiste("Disquete (A:)");
   // What happens before the copy button is pressed, and during the copy; what is said; what the floppy holds then.
-  const std::tuple<const char*, Fazer, Fazer, Textos, std::optional<std::string>> casos[] = {
+  const std::tuple<const char*, Fazer, Fazer, Texts, std::optional<std::string>> casos[] = {
       {"just room", [] { SetFreeSpace('A', 512); }, nada, {}, "sem nome"},
       {"no room", [] { SetFreeSpace('A', 0); }, nada, {DiscoCheio}, {}},
       {"no disk", tirar, nada, {DiscoCheio}, {}},
@@ -172,7 +172,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
     SCOPED_TRACE(nome);
     Preparar();
     QueueAnswer(Answer::Yes);
-    const bool tentado = ditas != Textos{DiscoCheio};
+    const bool tentado = ditas != Texts{DiscoCheio};
     Abrir([&, &antes = antes, &durante = durante, &noDisquete = noDisquete](Form4& janela) {
       Escolher(janela.List2, SemNome);
       antes();
@@ -182,7 +182,7 @@ TEST_F(Salvamentos, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
       EXPECT_EQ(janela.List1.FindExact(SemNome) >= 0, tentado && noDisquete);
       EXPECT_EQ(janela.Caption(), "Salvamentos dos jogos");
     });
-    EXPECT_EQ(Mensagens(), ditas);
+    EXPECT_EQ(TakeMessages(), ditas);
     EXPECT_EQ(Content(Alvo), noDisquete);
   }
 }
@@ -202,14 +202,14 @@ TEST_F(Salvamentos, AreOldOrNewButWholeWhateverCallOfThePlatformFails) {
     });
   };
   const auto conferir = [&] {
-    const Textos ditas = Mensagens();
+    const Texts ditas = TakeMessages();
     const bool avisado = !ditas.empty() && ditas.back() != JaExiste("Disquete (A:)");
     avisos += avisado ? 1 : 0;
     EXPECT_EQ(Content("A:\\DOIS.zst"), oferecido && !avisado ? Novo : Velho);
     EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), Novo);
-    EXPECT_EQ(Restos({"A:\\"}), Textos{});
+    EXPECT_EQ(Leftovers({"A:\\"}), Texts{});
   };
-  EXPECT_GE(ComCadaFalha(Preparar, copiar, conferir), 3);
+  EXPECT_GE(WithEachFault(Preparar, copiar, conferir), 3);
   EXPECT_TRUE(oferecido && avisos > 0);
 }
 
@@ -222,10 +222,10 @@ TEST_F(Salvamentos, AreShownAndDeletedInTheLanguageOfTheTranslation) {
       "Deletar o salvamento do jogo '=|Delete '|\r\n' que está no Computador ?=|' here?|"_ansi);
   Abrir([](Form4& janela) {
     Escolher(janela.List2, SemNome);
-    EXPECT_EQ(TextosDe(janela), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
+    EXPECT_EQ(TextsOf(janela), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
     PressKey(janela.List2, 46);
   });
-  EXPECT_EQ(Mensagens(), Textos{Deletar + "Delete 'SEMNOME [State 2]' here?"});
+  EXPECT_EQ(TakeMessages(), Texts{Deletar + "Delete 'SEMNOME [State 2]' here?"});
 }
 
 }  // namespace

@@ -1,10 +1,10 @@
 #include "catalog/cls_DAT.h"
 #include "savemanager/nomes.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
-struct Nomes : Maquina {
+struct Nomes : FreshMachine {
   Nomes() {
     PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||A=Igual||B=Igual||ACAO=Ação|"_ansi);
     Catalogo.Carregar();

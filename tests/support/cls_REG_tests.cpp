@@ -1,5 +1,5 @@
 #include "support/cls_REG.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
@@ -7,7 +7,7 @@ constexpr std::uint32_t Raiz = platform::RootCurrentUser;
 const std::string Chave = ChaveConfiguracao;
 const cls_REG Registro;
 
-struct Registros : Maquina {};
+struct Registros : FreshMachine {};
 
 TEST_F(Registros, AValueIsReadByItsTypeAndKeepsItWhenItIsSet) {
   const std::string um = "\x01\0\0\0"s, longo(254, 'x');

@@ -1,7 +1,7 @@
 // Reading, writing and copying files, also when something goes wrong.
 #include "platform/files.h"
 #include "support/mod_Arquivos.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
@@ -10,7 +10,7 @@ using platform::Existing;
 const std::string Alvo = "C:\\Jogos\\alvo.smc";
 const std::string Longo(200'000, 'l');  // more than three pieces of a copy
 
-struct Arquivos : Maquina {};
+struct Arquivos : FreshMachine {};
 
 TEST_F(Arquivos, LerArquivoGivesTheWantedBytesAndBlanksForWhatIsMissing) {
   const std::string dez = "012345678\0"s;
@@ -95,13 +95,13 @@ TEST_F(Arquivos, AreOldOrNewWhateverFailsAndWhenThePowerIsCut) {
         for (const bool corte : {false, true}) {
           if (corte) CutPower();
           EXPECT_EQ(Content(Alvo), gravado ? std::optional(caso.Depois) : caso.Antes) << (corte ? "power cut" : "");
-          EXPECT_EQ(Restos({"C:\\Jogos\\"}), Textos{});
+          EXPECT_EQ(Leftovers({"C:\\Jogos\\"}), Texts{});
         }
       };
-      EXPECT_GE(ComCadaFalha(Fault::Once, preparar, operar, conferir), 3);
+      EXPECT_GE(WithEachFault(Fault::Once, preparar, operar, conferir), 3);
       EXPECT_TRUE(gravado);  // by the last run, in which nothing failed
       for (const Fault falha : {Fault::FromThenOn, Fault::PowerCut}) {
-        if (!noLugar && !caso.NoLugar) ComCadaFalha(falha, preparar, operar, conferir);
+        if (!noLugar && !caso.NoLugar) WithEachFault(falha, preparar, operar, conferir);
       }
     }
   }

@@ -2,11 +2,11 @@
 #include "support/mod_CommonDialog.h"
 #include "support/mod_Traducao.h"
 #include "support/mod_exe.h"
-#include "tests/maquina.h"
+#include "tests/fresh_machine.h"
 
 namespace {
 
-struct Servicos : Maquina {};
+struct Servicos : FreshMachine {};
 
 TEST_F(Servicos, TraduzirTakesTheValueOfTheTranslationFileWithoutItsBars) {
   const std::string longo(254, 'x'), arquivo = "C:\\Tolvaris\\language.ini";
