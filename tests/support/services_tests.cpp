@@ -6,91 +6,122 @@
 
 namespace {
 
-struct Servicos : FreshMachine {};
+struct Services : FreshMachine {};
 
-TEST_F(Servicos, TraduzirTakesTheValueOfTheTranslationFileWithoutItsBars) {
-  const std::string longo(254, 'x'), arquivo = "C:\\Tolvaris\\language.ini";
-  PutFile(arquivo,
+TEST_F(Services, TraduzirTakesTheValueOfTheTranslationFileWithoutItsBars) {
+  const std::string longest(254, 'x'), file = "C:\\Tolvaris\\language.ini";
+  PutFile(file,
           "[OUTRA]\r\nErro=Wrong\r\n[TOLVARIS20]\r\nJogo=Game\r\nBranco=| word |\r\nDuas=||\r\nTres=|||\r\n"
           "Meio=a|b\r\nVazio=\r\nUma=|\r\nLongo=" +
-              longo + "y\r\n");
-  const std::pair<const char*, std::string> casos[] = {
-      {"Jogo", "Game"}, {"Branco", " word "}, {"Duas", "Duas"}, {"Tres", ""}, {"Meio", "ab"},
-      {"Uma", "Uma"},   {"Vazio", "Vazio"},   {"Erro", "Erro"}, {"", ""},     {"Longo", longo}};
-  for (const auto& [texto, traducao] : casos) {
-    ArquivoIdioma = arquivo;
-    EXPECT_EQ(Traduzir(texto), traducao);
+              longest + "y\r\n");
+  const std::tuple<const char*, const char*, std::string> cases[] = {
+      {"a word", "Jogo", "Game"},
+      {"bars around blanks", "Branco", " word "},
+      {"two bars alone are none", "Duas", "Duas"},
+      {"three bars", "Tres", ""},
+      {"a bar in the middle", "Meio", "ab"},
+      {"a bar alone is none", "Uma", "Uma"},
+      {"an empty value", "Vazio", "Vazio"},
+      {"in another section", "Erro", "Erro"},
+      {"no text", "", ""},
+      {"a value that is cut", "Longo", longest},
+  };
+  for (const auto& [name, text, translation] : cases) {
+    ArquivoIdioma = file;
+    EXPECT_EQ(Traduzir(text), translation) << name;
     ArquivoIdioma.clear();
-    EXPECT_EQ(Traduzir(texto), texto);
+    EXPECT_EQ(Traduzir(text), text) << name << ", without a translation";
   }
 }
 
-TEST_F(Servicos, AProgramStartsWithItsPriorityInItsDirectory) {
-  const std::tuple<std::string, std::string, int, std::string, std::uint32_t> casos[] = {
-      {"C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "", 2, "C:\\Roms\\", 0x20},
-      {"C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "C:\\Emu", 1, "C:\\Emu", 0x40},
-      {"C:\\Emu 2\\emu.exe -x", "", 3, "C:\\Emu 2\\", 0x80},
-      {"C:\\Emu\\emu.exe", "", 4, "C:\\Emu\\", 0x100},
-      {"C:\\Emu\\emu.exe", "", 5, "C:\\Emu\\", 0x20},
+TEST_F(Services, AProgramStartsWithItsPriorityInItsDirectory) {
+  const struct {
+    const char* Name;
+    std::string Command, Wanted;
+    int Priority;
+    std::string Used;
+    std::uint32_t Class;
+  } cases[] = {
+      {"no directory", "C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "", 2, "C:\\Roms\\", 0x20},
+      {"a directory, idle", "C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "C:\\Emu", 1, "C:\\Emu", 0x40},
+      {"a blank in the command, high", "C:\\Emu 2\\emu.exe -x", "", 3, "C:\\Emu 2\\", 0x80},
+      {"the program alone, real time", "C:\\Emu\\emu.exe", "", 4, "C:\\Emu\\", 0x100},
+      {"no such priority", "C:\\Emu\\emu.exe", "", 5, "C:\\Emu\\", 0x20},
   };
   PutFile("C:\\Emu\\emu.exe", "MZ");
   PutFile("C:\\Emu 2\\emu.exe", "MZ");
   PutDirectory("C:\\Roms");
-  for (const auto& [comando, pedido, prioridade, usado, classe] : casos) {
-    std::string diretorio = pedido;
-    ASSERT_TRUE(ExecutarPrograma(comando, 100, false, prioridade, diretorio)) << comando;
-    const StartedProcess& processo = StartedProcesses().back();
-    EXPECT_EQ(processo.CommandLine + "|" + processo.Directory + "|" + diretorio, comando + "|" + usado + "|" + usado);
-    EXPECT_EQ(processo.CreationFlags, classe);
+  for (const auto& [name, command, wanted, priority, used, priorityClass] : cases) {
+    SCOPED_TRACE(name);
+    std::string directory = wanted;
+    ASSERT_TRUE(ExecutarPrograma(command, 100, false, priority, directory));
+    EXPECT_EQ(directory, used);
+    const StartedProcess& process = StartedProcesses().back();
+    EXPECT_EQ(process.CommandLine, command);
+    EXPECT_EQ(process.Directory, used);
+    EXPECT_EQ(process.CreationFlags, priorityClass);
   }
-  EXPECT_TRUE(SleptMilliseconds() == 0 && PendingEventRuns() == 0);
+  EXPECT_EQ(SleptMilliseconds(), 0U);
+  EXPECT_EQ(PendingEventRuns(), 0);
 }
 
-TEST_F(Servicos, WaitingLetsEventsRunInTheRhythmAndOnceWhereNothingStarted) {
+TEST_F(Services, WaitingLetsEventsRunInTheRhythmAndOnceWhereNothingStarted) {
   PutFile("C:\\cfg.exe", "MZ");
-  bool terminou = false, clicou = false;
-  OnProcess("C:\\cfg.exe", 3, [&] { terminou = true; });
-  QueueEvent([&] { clicou = !terminou; });
-  std::string diretorio = "C:\\";
-  EXPECT_TRUE(ExecutarPrograma("C:\\cfg.exe", 500, true, 2, diretorio));
-  EXPECT_TRUE(terminou && clicou);
-  EXPECT_TRUE(PendingEventRuns() == 3 && SleptMilliseconds() <= 1500);
-  for (const bool esperar : {false, true}) {
-    const auto antes = SleptMilliseconds();
-    EXPECT_FALSE(ExecutarPrograma("C:\\nada.exe", 500, esperar, 2, diretorio));
-    EXPECT_EQ(SleptMilliseconds() - antes, esperar ? 500u : 0u);
+  bool ended = false, clicked = false;
+  OnProcess("C:\\cfg.exe", 3, [&] { ended = true; });
+  QueueEvent([&] { clicked = !ended; });
+  std::string directory = "C:\\";
+  EXPECT_TRUE(ExecutarPrograma("C:\\cfg.exe", 500, true, 2, directory));
+  EXPECT_TRUE(ended);
+  EXPECT_TRUE(clicked) << "before the program had ended";
+  EXPECT_EQ(PendingEventRuns(), 3);
+  EXPECT_LE(SleptMilliseconds(), 1500U);
+  for (const bool wait : {false, true}) {
+    const auto before = SleptMilliseconds();
+    EXPECT_FALSE(ExecutarPrograma("C:\\nada.exe", 500, wait, 2, directory));
+    EXPECT_EQ(SleptMilliseconds() - before, wait ? 500u : 0u);
   }
   EXPECT_EQ(PendingEventRuns(), 3 + 1);
 }
 
 // Saving takes every path that fits, under a name filled up with blanks; opening only a file that is listed.
-TEST_F(Servicos, DialogsGiveTheChosenPathOrNothing) {
-  const platform::Window dono({"Dono", 1500, 1500});
-  std::string filtro;
-  const auto salvar = [&](const std::string& nome) { return SalvarArquivo(dono, "C:\\J", "", "zip", nome, filtro, 4); };
-  for (const auto& [tamanho, brancos] : {std::pair(0u, 254u), {253u, 1u}, {254u, 1u}, {300u, 1u}}) {
-    const std::string nome(tamanho, 'n');
-    EXPECT_EQ(salvar(nome), "");
-    const platform::OpenFileName& pedido = ShownFileDialogs().back();
-    EXPECT_EQ(pedido.File, nome + std::string(brancos, ' '));
-    EXPECT_TRUE(pedido.Owner == &dono && pedido.FileSize == 255 && pedido.InitialDirectory == "C:\\J");
-    EXPECT_EQ(pedido.Filter, "Todos os arquivos (*.*)\0*.*\0"s);
+TEST_F(Services, DialogsGiveTheChosenPathOrNothing) {
+  const platform::Window owner({"Dono", 1500, 1500});
+  std::string filter;
+  const auto save = [&](const std::string& name) { return SalvarArquivo(owner, "C:\\J", "", "zip", name, filter, 4); };
+  for (const auto& [length, blanks] : {std::pair(0u, 254u), {253u, 1u}, {254u, 1u}, {300u, 1u}}) {
+    const std::string name(length, 'n');
+    EXPECT_EQ(save(name), "");
+    const platform::OpenFileName& asked = ShownFileDialogs().back();
+    EXPECT_EQ(asked.File, name + std::string(blanks, ' '));
+    EXPECT_EQ(asked.Owner, &owner);
+    EXPECT_EQ(asked.FileSize, 255U);
+    EXPECT_EQ(asked.InitialDirectory, "C:\\J");
+    EXPECT_EQ(asked.Filter, "Todos os arquivos (*.*)\0*.*\0"s);
   }
   PutFile("C:\\J\\Maçã"_ansi, "x");
   PutFile("C:\\J\\oculto", "x", 0x22);
-  const std::string longo = "C:\\" + std::string(251, 'x');
-  const std::tuple<std::string, bool, bool> casos[] = {
-      {"C:\\j\\MAÇÃ"_ansi, true, true}, {"C:\\J\\oculto", true, false}, {"C:\\J", true, false},
-      {longo + "x", false, false},      {longo, true, false},           {"", true, false},
+  const std::string longest = "C:\\" + std::string(251, 'x');
+  const struct {
+    const char* Name;
+    std::string Path;
+    bool Saved, Opened;
+  } cases[] = {
+      {"in another letter case", "C:\\j\\MAÇÃ"_ansi, true, true},
+      {"hidden", "C:\\J\\oculto", true, false},
+      {"a directory", "C:\\J", true, false},
+      {"too long", longest + "x", false, false},
+      {"the longest, and not there", longest, true, false},
+      {"cancelled", "", true, false},
   };
-  for (const auto& [caminho, salvo, aberto] : casos) {
-    QueueFileDialog(caminho);
-    EXPECT_EQ(salvar("Um nome de jogo comprido"), salvo ? caminho : "");
-    QueueFileDialog(caminho);
-    EXPECT_EQ(AbrirArquivo(dono, "", "", "", filtro, 4), aberto ? caminho : "");
+  for (const auto& [name, path, saved, opened] : cases) {
+    QueueFileDialog(path);
+    EXPECT_EQ(save("Um nome de jogo comprido"), saved ? path : "") << name;
+    QueueFileDialog(path);
+    EXPECT_EQ(AbrirArquivo(owner, "", "", "", filter, 4), opened ? path : "") << name;
   }
   QueueFileDialog("  C:\\com brancos.tvk ");
-  EXPECT_EQ(salvar("Jogo"), "C:\\com brancos.tvk");
+  EXPECT_EQ(save("Jogo"), "C:\\com brancos.tvk");
 }
 
 }  // namespace
