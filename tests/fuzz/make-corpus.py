@@ -11,7 +11,7 @@ from pathlib import Path
 
 sys.dont_write_bytecode = True
 sys.path.insert(0, str(Path(__file__).parent.parent / "package"))
-from pacote import HEADER_LIMIT, build  # noqa: E402
+from package_format import HEADER_LIMIT, build  # noqa: E402
 
 EXAMPLE = build(b"Super Jogo", b"SUPERJOG", b"-873187034", b"GIF89a", b"123456789")
 LONGEST = HEADER_LIMIT - len(build(b"", b"", b"1", b"I", b"R")) + len(b"IR")

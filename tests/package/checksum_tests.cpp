@@ -9,53 +9,56 @@
 
 namespace {
 
-constexpr std::size_t Pedaco = 1'048'576;
-const std::string Caminho = "C:\\Roms\\JOGO.ZIP";
+constexpr std::size_t ChunkSize = 1'048'576;
+const std::string Path = "C:\\Roms\\JOGO.ZIP";
 
-TEST(ClsCRC, AddsTheValuesAtTheEndOfEveryChunk) {
-  const std::pair<std::string, std::string> casos[] = {
-      {"123456789", "-873187034"},
-      {"abc", "891568578"},
-      {std::string(Pedaco + 1, '\0'), "-2451737276"},
-      {std::string(2 * Pedaco + 512, '\xFF'), "-3555091706"},
-      {"", "none"},
-      {std::string(2 * Pedaco, 'x'), "none"},
+TEST(Checksum, AddsTheValuesAtTheEndOfEveryChunk) {
+  const struct {
+    const char* Name;
+    std::string Content, Text;
+  } cases[] = {
+      {"the nine digits", "123456789", "-873187034"},
+      {"a value above zero", "abc", "891568578"},
+      {"a chunk and a byte", std::string(ChunkSize + 1, '\0'), "-2451737276"},
+      {"two chunks and a piece", std::string(2 * ChunkSize + 512, '\xFF'), "-3555091706"},
+      {"no bytes", "", "none"},
+      {"two whole chunks", std::string(2 * ChunkSize, 'x'), "none"},
   };
   Reset();
-  cls_CRC soma;  // the same for all: nothing is left from one file to the next
-  for (const auto& [conteudo, texto] : casos) {
-    PutFile(Caminho, conteudo);
-    platform::File arquivo(Caminho, platform::Access::Read);
-    for (const auto& valor : {soma.CRC(arquivo), soma.CRC(conteudo)}) {
-      EXPECT_EQ(valor ? TextoCRC(*valor) : "none", texto) << conteudo.size();
+  cls_CRC sum;  // the same for all: nothing is left from one file to the next
+  for (const auto& [name, content, text] : cases) {
+    PutFile(Path, content);
+    platform::File file(Path, platform::Access::Read);
+    for (const auto& value : {sum.CRC(file), sum.CRC(content)}) {
+      EXPECT_EQ(value ? TextoCRC(*value) : "none", text) << name;
     }
-    EXPECT_TRUE(arquivo.IsOpen());
+    EXPECT_TRUE(file.IsOpen());
   }
 }
 
-TEST(ClsCRC, AnyReadThatFailsLeavesNoValue) {
-  bool temValor = false, falhou = false;
-  const auto somar = [&] {
-    platform::File arquivo(Caminho, platform::Access::Read);
-    temValor = cls_CRC().CRC(arquivo).has_value();
-    falhou = CallFailed();
+TEST(Checksum, AnyReadThatFailsLeavesNoValue) {
+  bool hasValue = false, failed = false;
+  const auto add = [&] {
+    platform::File file(Path, platform::Access::Read);
+    hasValue = cls_CRC().CRC(file).has_value();
+    failed = CallFailed();
   };
-  const auto preparar = [] { PutFile(Caminho, std::string(2 * Pedaco + 1, 'x')); };
-  EXPECT_GT(WithEachFault(preparar, somar, [&] { EXPECT_NE(temValor, falhou); }), 3);  // each of three reads among them
+  const auto prepare = [] { PutFile(Path, std::string(2 * ChunkSize + 1, 'x')); };
+  EXPECT_GT(WithEachFault(prepare, add, [&] { EXPECT_NE(hasValue, failed); }), 3);  // each of three reads among them
 }
 
 // The register is all that is carried on, so any register stands for bytes that another way has taken before.
 TEST(Crc32, AllWaysAgreeOnEveryLengthWhateverTheAlignmentAndTheRegister) {
-  std::vector maneiras = {CRC32::Atualizar, CRC32::AtualizarPorFatias};
-  if (CRC32::TemMultiplicacao()) maneiras.push_back(CRC32::AtualizarPorDobras);
-  std::mt19937 acaso(1);
+  std::vector ways = {CRC32::Atualizar, CRC32::AtualizarPorFatias};
+  if (CRC32::TemMultiplicacao()) ways.push_back(CRC32::AtualizarPorDobras);
+  std::mt19937 random(1);
   std::string bytes(3'000, '\0');
-  std::ranges::generate(bytes, [&] { return static_cast<char>(acaso()); });
-  for (const auto maneira : maneiras) {
-    for (std::size_t tamanho = 0; tamanho < bytes.size() - 16; ++tamanho) {
-      const std::string_view parte = std::string_view(bytes).substr(acaso() % 16, tamanho);
-      const auto registro = static_cast<std::uint32_t>(acaso());
-      ASSERT_EQ(maneira(registro, parte), CRC32::AtualizarPorByte(registro, parte)) << tamanho;
+  std::ranges::generate(bytes, [&] { return static_cast<char>(random()); });
+  for (const auto way : ways) {
+    for (std::size_t length = 0; length < bytes.size() - 16; ++length) {
+      const std::string_view part = std::string_view(bytes).substr(random() % 16, length);
+      const auto start = static_cast<std::uint32_t>(random());
+      ASSERT_EQ(way(start, part), CRC32::AtualizarPorByte(start, part)) << length;
     }
   }
 }

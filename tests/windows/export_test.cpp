@@ -64,7 +64,7 @@ TEST_F(ExportGame, OffersWhatAGameCanBeSavedAsAndAsksBeforeItReplacesAFile) {
   FileDialog(*program).Press(VK_ESCAPE);
   ExpectQuietEnd();
   ExpectFiles(before, FilesIn(Home));
-  EXPECT_EQ(Pacote(Outside, "ler d.tvk figura rom"), "\xC3\x89lan\nELAN\n-849089814\n-849089814\n");
+  EXPECT_EQ(PackageFormat(Outside, "read d.tvk figura rom"), "\xC3\x89lan\nELAN\n-849089814\n-849089814\n");
   EXPECT_EQ(ContentOf(Outside + "figura"), Gif(RGB(10, 200, 60)));
   EXPECT_TRUE(ContentOf(Outside + "rom") == rom);
 }

@@ -89,13 +89,13 @@ std::string Gif(COLORREF colour) {
          size + std::string("\0\2\2\x44\1\0;", 7);
 }
 
-std::string Pacote(const std::string& directory, const std::string& arguments) {
+std::string PackageFormat(const std::string& directory, const std::string& arguments) {
   // A program of the machine that Wine runs on. Its output takes its name when it is complete.
-  const Program python("/bin/sh -c \"python3 '" PACOTE_PY "' " + arguments + " >saida- 2>&1; mv saida- saida\"",
-                       directory);
-  EXPECT_SOON(std::filesystem::exists(Path(directory + "saida"))) << arguments;
-  const std::string output = ContentOf(directory + "saida");
-  std::filesystem::remove(Path(directory + "saida"));
+  const Program python(
+      "/bin/sh -c \"python3 '" PACKAGE_FORMAT_PY "' " + arguments + " >output- 2>&1; mv output- output\"", directory);
+  EXPECT_SOON(std::filesystem::exists(Path(directory + "output"))) << arguments;
+  const std::string output = ContentOf(directory + "output");
+  std::filesystem::remove(Path(directory + "output"));
   return output;
 }
 

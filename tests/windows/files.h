@@ -53,8 +53,9 @@ std::string Bytes(unsigned kind, size_t size);
 // A GIF file of one pixel.
 std::string Gif(COLORREF colour);
 
-// Has the implementation of packages in Python (tests/package/pacote.py) do something in a directory; its output.
-std::string Pacote(const std::string& directory, const std::string& arguments);
+// Has the implementation of packages in Python (tests/package/package_format.py) do something in a directory; its
+// output.
+std::string PackageFormat(const std::string& directory, const std::string& arguments);
 
 // A package, whose checksum is given: the tests know it from elsewhere.
 std::string Package(const std::string& name, const std::string& dosName, const std::string& checksum,

@@ -55,7 +55,7 @@ TEST_F(ImportGame, OfAPackageAsksBeforeItReplaces) {
   const std::string path = Outside + "jogo.TVK";
   PutFile(Outside + "figura", Gif(red));
   PutFile(Outside + "rom", rom);
-  EXPECT_EQ(Pacote(Outside, "montar jogo.TVK '" + name + "' CORACAO figura rom"), "");
+  EXPECT_EQ(PackageFormat(Outside, "build jogo.TVK '" + name + "' CORACAO figura rom"), "");
   Start();
   Files expected = FilesIn(Home);
   Choose(Import, path);

@@ -194,7 +194,7 @@ TEST_F(Kill, PackageOverAGame) {
   const std::string picture = Gif(RGB(9, 8, 7)) + Bytes(2, 4 << 20), rom = Bytes(3, (8 << 20) + 5);
   PutFile(Outside + "figura", picture);
   PutFile(Outside + "rom", rom);
-  ASSERT_EQ(Pacote(Outside, "montar jogo.tvk 'Élan' ELAN figura rom"), "");
+  ASSERT_EQ(PackageFormat(Outside, "build jogo.tvk 'Élan' ELAN figura rom"), "");
   for (const char* piece : {"figura", "rom"}) DeleteFileA((Outside + piece).c_str());
   const std::string game = Home + "Roms\\ELAN.zip", preview = Home + "Imgs\\Élan.gif";
   unchanged[Outside + "jogo.tvk"] = ContentOf(Outside + "jogo.tvk");
@@ -216,7 +216,7 @@ TEST_F(Kill, ExportOverAFile) {
   unchanged[Home + "Roms\\ELAN.zip"] = rom;
   PutFile(Outside + "figura", picture);
   PutFile(Outside + "rom", rom);
-  ASSERT_EQ(Pacote(Outside, "montar saiu.tvk 'Élan' ELAN figura rom"), "");
+  ASSERT_EQ(PackageFormat(Outside, "build saiu.tvk 'Élan' ELAN figura rom"), "");
   const std::string package = ContentOf(path);
   for (const char* piece : {"figura", "rom"}) DeleteFileA((Outside + piece).c_str());
   Run({"export",

@@ -1,9 +1,10 @@
 #!/usr/bin/env python3
 """The game package written and read by a program of its own, to hold the C++ one against.
 
-  pacote.py montar PACKAGE NAME DOSNAME PICTURE ROM    writes a package; the checksum is computed
-  pacote.py ler PACKAGE PICTURE ROM                    writes the two blocks there, and prints name, DOS name, checksum
-                                                       text and the ROM's own checksum, a line each
+  package_format.py build PACKAGE NAME DOSNAME PICTURE ROM
+    writes a package; the checksum is computed
+  package_format.py read PACKAGE PICTURE ROM
+    writes the two blocks there, and prints name, DOS name, checksum text and the ROM's own checksum, a line each
 
 Names on the command line are texts; in the package they are bytes of code page 1252.
 """
@@ -53,11 +54,11 @@ def parse(content):
 
 def main(arguments):
     match arguments:
-        case ["montar", package, name, dos_name, picture, rom]:
+        case ["build", package, name, dos_name, picture, rom]:
             image, data = Path(picture).read_bytes(), Path(rom).read_bytes()
             names = (name.encode(CODE_PAGE), dos_name.encode(CODE_PAGE))
             Path(package).write_bytes(build(*names, str(checksum(data)).encode(), image, data))
-        case ["ler", package, *targets]:
+        case ["read", package, *targets]:
             *texts, image, data = parse(Path(package).read_bytes())
             for text in texts:
                 print(text.decode(CODE_PAGE, "backslashreplace"))
