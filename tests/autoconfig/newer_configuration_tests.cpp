@@ -6,23 +6,23 @@
 namespace {
 
 constexpr char Roms[] = "C:\\Meus Jogos\\Roms\\", Saves[] = "D:\\";
-const std::string LinhaRoms = R"(ROMPath="C:\\Meus Jogos\\Roms")", LinhaSaves = R"(SRAMPath="D:\\")";
+const std::string RomsLine = R"(ROMPath="C:\\Meus Jogos\\Roms")", SavesLine = R"(SRAMPath="D:\\")";
 
-TEST(ConfiguracaoNova, IsToldByAKeyAtTheBeginningOfALine) {
-  for (const char* nova : {"ROMPath=\"\"", "; a remark\r\nSRAMPath=\"C:\\\\S\"\r\n"})
-    EXPECT_TRUE(FormaNova(nova)) << nova;
-  for (const char* antiga : {"", "ROMPath = \"\"\r\nSRAMPath =", "; ROMPath=\"\"\r\n SRAMPath=\"\""}) {
-    EXPECT_FALSE(FormaNova(antiga)) << antiga;
+TEST(NewerConfiguration, IsToldByAKeyAtTheBeginningOfALine) {
+  for (const char* newer : {"ROMPath=\"\"", "; a remark\r\nSRAMPath=\"C:\\\\S\"\r\n"})
+    EXPECT_TRUE(FormaNova(newer)) << newer;
+  for (const char* older : {"", "ROMPath = \"\"\r\nSRAMPath =", "; ROMPath=\"\"\r\n SRAMPath=\"\""}) {
+    EXPECT_FALSE(FormaNova(older)) << older;
   }
 }
 
-TEST(ConfiguracaoNova, NamesTheTwoDirectoriesAndKeepsEveryOtherByte) {
+TEST(NewerConfiguration, NamesTheTwoDirectoriesAndKeepsEveryOtherByte) {
   std::string bytes;  // all of them, on 150 lines
   for (int i = 0; i < 150 * 256; ++i) bytes += static_cast<char>(i);
-  const std::string r = LinhaRoms, s = LinhaSaves, certo = "a=1\r\n" + r + "\r\n" + s + "\r\n";
-  const std::tuple<const char*, std::string, std::string> casos[] = {
+  const std::string r = RomsLine, s = SavesLine, right = "a=1\r\n" + r + "\r\n" + s + "\r\n";
+  const std::tuple<const char*, std::string, std::string> cases[] = {
       // nothing afterwards: no change
-      {"right already", certo, ""},
+      {"right already", right, ""},
       {"right in other letters, and with a backslash more",
        "rompath=\"\"\nROMPath=\"c:\\\\MEUS jogos\\\\roms\\\\\"\n" + s, ""},
       {"empty values between other lines", "ROMPath=\"\"\r\nb=\"x\"\r\nSRAMPath=\"\"\r\n\r\nc=2",
@@ -39,10 +39,10 @@ TEST(ConfiguracaoNova, NamesTheTwoDirectoriesAndKeepsEveryOtherByte) {
       {"any bytes", bytes + "\nSRAMPath=\"\"\n" + bytes + "\nROMPath=\"\xE7\"\r\n" + bytes,
        bytes + "\n" + s + "\n" + bytes + "\n" + r + "\r\n" + bytes},
   };
-  for (const auto& [nome, antes, depois] : casos) {
-    const auto novo = ComDiretorios(antes, Roms, Saves);
-    EXPECT_EQ(novo.value_or(""), depois) << nome;
-    EXPECT_EQ(ComDiretorios(novo.value_or(antes), Roms, Saves), std::nullopt) << nome << ", again";
+  for (const auto& [name, before, after] : cases) {
+    const auto changed = ComDiretorios(before, Roms, Saves);
+    EXPECT_EQ(changed.value_or(""), after) << name;
+    EXPECT_EQ(ComDiretorios(changed.value_or(before), Roms, Saves), std::nullopt) << name << ", again";
   }
 }
 

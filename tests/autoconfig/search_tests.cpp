@@ -1,0 +1,58 @@
+#include "autoconfig/procura.h"
+#include "tests/fresh_machine.h"
+
+namespace {
+
+struct Search : FreshMachine {
+  Texts FindAll(std::vector<Lugar> places) {
+    Procura search(std::move(places));
+    Texts found;
+    for (steps = 0; !search.Terminou() && steps < 100000; ++steps) {
+      for (const std::string& each : search.Passo()) found.push_back(each);
+    }
+    return found;
+  }
+
+  int steps = 0;
+};
+
+TEST_F(Search, UsualPlacesInTheOrderOfTheirLikelihood) {
+  AddDisk('D', 1 << 20);
+  AddDisk('A', 1 << 20);
+  SetEnvironment("programfiles", "C:\\Prog");
+  SetEnvironment("ProgramFiles(x86)", "C:\\Prog 32\\");
+  SetEnvironment("ProgramW6432", "E:");
+  SetEnvironment("Path", ";\"D:\\No caminho\\\"; C:\\Emu no caminho ;\\\\servidor\\zsnes;A:\\zsnes;zsnes;");
+  Texts inOrder = {"C:\\Tolvaris\\zsnesw.exe"};
+  for (const std::string nearby :
+       {"C:\\Tolvaris\\", "C:\\Tolvaris\\B\\", "C:\\Tolvaris\\A\\A\\A\\", "C:\\Prog\\Meu Emu\\", "C:\\Prog\\Um\\Dois\\",
+        "C:\\Prog 32\\x\\", "C:\\ZSNES 1.51\\", "C:\\Emu\\1\\2\\", "D:\\Prog\\", "D:\\zsnes\\", "D:\\No caminho\\"}) {
+    inOrder.push_back(nearby + "zsnes.exe");
+  }
+  for (const std::string& file : inOrder) PutFile(file, "MZ");
+  for (const std::string distant : {"C:\\Tolvaris\\A\\A\\A\\A", "C:\\Prog\\a\\b\\c", "C:\\Outro", "A:\\zsnes",
+                                    "D:\\No caminho\\x", "C:\\Tolvaris\\Escondido"}) {
+    PutFile(distant + "\\zsnesw.exe", "MZ");
+  }
+  SetAttributes("C:\\Tolvaris\\Escondido", 0x12);
+  PutFile("C:\\Emu no caminho\\zsnesw.exe", "");    // damaged
+  PutDirectory("C:\\Tolvaris\\zsnes\\zsnesw.exe");  // not a file
+  EXPECT_EQ(FindAll(LugaresUsuais()), inOrder);
+}
+
+TEST_F(Search, EndsInAForestWithoutEndAndReportsNothingTwice) {
+  for (int i = 0; i < 70 * 70; ++i) PutDirectory("C:\\Z\\" + std::to_string(i / 70) + "\\" + std::to_string(i % 70));
+  PutFile("C:\\Z\\7\\zsnes.exe", "MZ");
+  PutFile("C:\\P\\Q\\zsnes.exe", "MZ");
+  const Texts expected = {"C:\\Z\\7\\zsnes.exe", "C:\\P\\Q\\zsnes.exe"};
+  EXPECT_EQ(FindAll({{"C:\\Z\\", 50}, {"c:\\z\\7\\", 0}, {"C:\\P\\Q\\", 0}, {"C:\\p\\q\\", 3}}), expected);
+  EXPECT_GT(steps, 1000);
+  EXPECT_LT(steps, 4000);
+  EXPECT_EQ(FindAll({{"Q:\\", 3}, {"C:\\Nada\\", 3}, {"C:\\Z\\7\\zsnes.exe\\", 3}}), Texts());
+  EXPECT_EQ(FindAll({{"C:\\P\\", 0}, {"C:\\P\\", 1}}), Texts{expected[1]}) << "seen again with more levels";
+  for (int i = 0; i < 3100; ++i) PutDirectory("C:\\R\\" + std::to_string(i));
+  PutFile("C:\\R\\Zsnes\\zsnes.exe", "MZ");
+  EXPECT_EQ(FindAll({{"C:\\R\\", 2}}), Texts{"C:\\R\\Zsnes\\zsnes.exe"}) << "likely names go before very many";
+}
+
+}  // namespace

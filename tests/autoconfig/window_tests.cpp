@@ -1,0 +1,244 @@
+// The auto-configuration window, on a machine in memory with an emulator.
+#include <memory>
+
+#include "autoconfig/FormCfg.h"
+#include "support/mod_Configuracao.h"
+#include "tests/fresh_machine.h"
+
+namespace {
+
+const std::string Key = ChaveConfiguracao, DosEmulator = "C:\\Tolvaris\\ZSNES\\zsnes.exe";
+const std::string Emulator = "C:\\Tolvaris\\ZSNES\\zsnesw.exe", Configuration = "C:\\Tolvaris\\ZSNES\\zsnesw.cfg";
+const Texts Nothing(5, "-");
+const Texts Defaults = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
+
+struct Configurator : FreshMachine {
+  Configurator() { PutFile(Emulator, "MZ"); }
+
+  void Open() {
+    form = std::make_unique<FormCfg>();
+    form->Form_Load();
+    form->Show();
+  }
+  void OpenAndSearch() { Open(), Tick(form->Timer1); }
+  void Save() { Click(form->Command1); }
+  void ChooseOther(const std::string& path) { QueueFileDialog(path), Click(form->Command3); }
+
+  // RomDir, SaveDir, ImgDir, EmuExe and EmuCFG as they are stored; "-": not set.
+  static Texts Stored() {
+    Texts texts;
+    for (const NomeDeAjuste& each : NomesDosAjustes) texts.push_back(StoredText(Key, each.Nome).value_or("-"));
+    return texts;
+  }
+
+  std::unique_ptr<FormCfg> form;
+};
+
+TEST_F(Configurator, ShowsWhatItFoundInEachLanguageAndWritesIt) {
+  const std::string directories = "|Jogos:|C:\\Tolvaris\\Roms\\|Salvamentos:|C:\\Tolvaris\\Saves\\|";
+  RemoveFile(Emulator);
+  OpenAndSearch();
+  EXPECT_EQ(TextsOf(*form),
+            "Configuração do Tolvaris|Emuladores encontrados:||Nenhum emulador foi encontrado. Clique em 'Procurar "
+            "outro...'.|&Procurar outro...| Configuração |&Gravar|&Cancelar|Emulador:||Arquivo de configuração:|"_ansi +
+                directories + "Imagens:|C:\\Tolvaris\\Imgs\\");
+  EXPECT_FALSE(form->Command1.Enabled()) << "there is nothing to save";
+  PressKey(form->List1, 13);
+  EXPECT_EQ(Stored(), Nothing);
+  EXPECT_FALSE(form->IsClosed());
+  PutFile(Emulator, "MZ");
+  PutFile("C:\\Tolvaris\\language.ini",
+          "[TOLVARIS20]\r\nConfiguração do Tolvaris=Setup\r\nEmuladores encontrados:=Found\r\n"
+          "&Procurar outro...=Other\r\n Configuração =Settings\r\nImagens:=Pictures\r\n"
+          "&Gravar=Save\r\n&Cancelar=Cancel\r\nBusca concluída.=Done\r\n"_ansi);
+  OpenAndSearch();
+  EXPECT_FALSE(form->Timer1.Enabled());
+  EXPECT_EQ(EntriesOf(form->List1), Emulator + "|");
+  EXPECT_EQ(TextsOf(*form), "Setup|Found||Done|Other|Settings|Save|Cancel|Emulador:|" + Emulator +
+                                "|Arquivo de configuração:|"_ansi + Configuration + directories +
+                                "Pictures|C:\\Tolvaris\\Imgs\\");
+  DenyKey(Key);
+  Save();
+  EXPECT_EQ(TakeMessages(), Texts{Error + "Não foi possível gravar a configuração."_ansi});
+  EXPECT_FALSE(form->IsClosed());
+  DenyKey(Key, false);
+  Save();
+  EXPECT_EQ(Stored(), Defaults);
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_TRUE(ShownMessages().empty());
+  LerCaminhos({});
+  EXPECT_EQ(ArquivoEmulador, Emulator) << "as start-up reads it";
+}
+
+TEST_F(Configurator, CancelWritesNothingEvenInTheMiddleOfTheSearch) {
+  for (int i = 0; i < 200; ++i) PutDirectory("C:\\Tolvaris\\" + std::to_string(i));
+  Open();
+  QueueEvent([this] {
+    EXPECT_EQ(form->Label2.Caption(), "Procurando...");
+    QueueEvent([this] { Click(form->Command2); });
+  });
+  Tick(form->Timer1);
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_LT(PendingEventRuns(), 10) << "the search has ended at once";
+  EXPECT_EQ(Stored(), Nothing);
+  EXPECT_EQ(WritesEver(), 0U);
+}
+
+TEST_F(Configurator, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
+  const std::string mine = "D:\\Meu Emulador\\zsnes.exe", cfg = "D:\\Meu Emulador\\zsnes.cfg";
+  const Texts all = {"D:\\Jogos\\", "\\Salvos\\", "-", mine, "-"}, fileOnly = {"-", "-", "-", "", "D:\\meu.cfg"};
+  const std::tuple<const char*, Texts, std::vector<int>, Texts> cases[] = {
+      // what is set, what is chosen in the list, and what is set afterwards
+      {"another one and back", all, {1, 0}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", mine, cfg}},
+      {"another one", all, {1}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", Defaults[3], Defaults[4]}},
+      {"none, a file alone was set", fileOnly, {}, {"\\Roms\\", "\\Saves\\", "\\Imgs\\", Defaults[3], "D:\\meu.cfg"}},
+      {"another one, a file alone was set",
+       fileOnly,
+       {1},
+       {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnes.exe", "\\ZSNES\\zsnes.cfg"}},
+  };
+  for (const auto& [name, before, chosen, after] : cases) {
+    SCOPED_TRACE(name);
+    Reset();
+    AddDisk('D', 1 << 20);
+    for (const std::string& file : {mine, Emulator, DosEmulator}) PutFile(file, "MZ");
+    for (std::size_t i = 0; i < before.size(); ++i) {
+      if (before[i] != "-") PutText(Key, NomesDosAjustes[i].Nome, before[i]);
+    }
+    OpenAndSearch();
+    EXPECT_EQ(form->List1.Selected(), 0);
+    for (const int index : chosen) Choose(form->List1, index);
+    if (chosen.empty()) {
+      PressKey(form->List1, 13);
+    } else {
+      DoubleClick(form->List1);
+    }
+    EXPECT_EQ(Stored(), after);
+    EXPECT_EQ(TakeMessages(), Texts());
+  }
+}
+
+TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
+  const struct {
+    const char* Name;
+    bool ShortNames;
+    std::string Program, Chosen;    // the program's directory, and the emulator
+    std::string Emulator, Setting;  // how it and its configuration file are set
+  } cases[] = {
+      {"below the program", true, "C:\\Tolvaris", "C:\\tolvaris\\zsnesw.exe", "\\zsnesw.exe", "\\zsnesw.cfg"},
+      {"below a program in a path with blanks", true, "C:\\Tolvaris da", "C:\\Tolvaris da\\Z\\zsnesw.exe",
+       "C:\\TOLVAR~1\\Z\\zsnesw.exe", "\\Z\\zsnesw.cfg"},
+      {"a blank below the program", true, "C:\\TolvarisX", "C:\\TolvarisX\\Meu Emu\\zsnes.exe", "\\MEUEMU~1\\zsnes.exe",
+       "\\Meu Emu\\zsnes.cfg"},
+      {"a blank beside the program", true, "C:\\Tolvaris", "C:\\Tolvaris 2\\zsnesw.exe", "C:\\TOLVAR~1\\zsnesw.exe",
+       "C:\\Tolvaris 2\\zsnesw.cfg"},
+      {"no blank, nothing is shortened", true, "C:\\Tolvaris", "C:\\Comprido9\\ZSNESW15.exe",
+       "C:\\Comprido9\\ZSNESW15.exe", "C:\\Comprido9\\zsnesw.cfg"},
+      {"the program at the root", true, "C:\\", "C:\\Emu\\outro.exe", "\\Emu\\outro.exe", "\\Emu\\zsnesw.cfg"},
+      {"no short names", false, "C:\\Meu Tolvaris", "C:\\Meu Tolvaris\\Z\\zsnes.exe", "\\Z\\zsnes.exe",
+       "\\Z\\zsnes.cfg"},
+  };
+  const std::string warning =
+      "Informação, OK, exclamation: O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\n"
+      "Se os jogos não abrirem, mude o emulador para um diretório sem espaços.\r\n\r\n"_ansi;
+  for (const auto& [name, shortNames, program, chosen, emulator, setting] : cases) {
+    SCOPED_TRACE(name);
+    Reset();
+    if (!shortNames) KeepNoShortNames();
+    SetProgramDirectory(program);
+    PutFile(chosen, "MZ");
+    Open();
+    ChooseOther(chosen);
+    Save();
+    EXPECT_EQ(Stored(), (Texts{"\\Roms\\", "\\Saves\\", "\\Imgs\\", emulator, setting}));
+    EXPECT_EQ(TakeMessages(), shortNames ? Texts() : Texts{warning + chosen});
+  }
+  PutFile("C:\\E\\zsnes.cfg", "x");
+  EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";
+}
+
+TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused) {
+  const std::string longPath = "C:\\" + std::string(120, 'a') + "\\" + std::string(121, 'b') + "\\";
+  for (const std::string& file : {"C:\\Outro\\zsnes.exe"s, longPath + "z.exe"}) PutFile(file, "MZ");
+  PutFile("C:\\Outro\\vazio.exe", "");
+  OpenAndSearch();
+  for (const char* file : {"C:\\Outro\\zsnes.exe", "", "C:\\TOLVARIS\\zsnes\\ZSNESW.EXE"}) ChooseOther(file);
+  EXPECT_EQ(form->List1.Count(), 2) << "nothing when it is cancelled, and nothing twice";
+  EXPECT_EQ(form->Label4[0].Caption(), Emulator) << "the last one that was chosen";
+  const auto& asked = ShownFileDialogs().back();
+  EXPECT_EQ(asked.InitialDirectory, "C:\\Outro\\");
+  EXPECT_EQ(asked.Title + asked.Filter,
+            "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
+  const std::string tooLong = Error + "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
+  for (const auto& [file, message] :
+       {std::pair("C:\\Outro\\vazio.exe"s, Error + "O emulador ZSnes não foi encontrado."_ansi),
+        {longPath + "z.exe", tooLong + longPath + "zsnesw.cfg"}}) {
+    ChooseOther(file);
+    Save();
+    EXPECT_EQ(TakeMessages(), Texts{message});
+    EXPECT_EQ(Stored(), Nothing);
+    EXPECT_FALSE(form->IsClosed());
+  }
+  EXPECT_EQ(Impedimento(std::string(254, 'x')), std::nullopt);
+  EXPECT_EQ(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), Mensagem::CaminhoEmRede)
+      << "read as relative to the program's directory";
+}
+
+// The emulator's configuration file in the newer form.
+const std::string Before = "x=1\r\nROMPath=\"\"\r\nSRAMPath=\"\"\r\n";
+const std::string After = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPath=\"C:\\\\Tolvaris\\\\Saves\"\r\n";
+
+TEST_F(Configurator, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
+  const std::string older = "SaveDirectory = C:\\S\r\n";
+  const Texts question = {
+      "Confirmar, Yes/No/Cancel, question: Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris "
+      "não altera ao jogar.\r\n"
+      "Com ele a opção de usar disquete não tem efeito.\r\n\r\n"
+      "Gravar agora nessa configuração os diretórios de jogos e de salvamentos do Tolvaris ?"_ansi};
+  const std::tuple<const char*, std::string, Answer, std::string, bool> cases[] = {
+      // the file before, the answer to the question, the file afterwards, and whether the settings are written
+      {"cancelled", Before, Answer::Cancel, Before, false},  {"refused", Before, Answer::No, Before, true},
+      {"agreed", Before, Answer::Yes, After, true},          {"right already", After, Answer::Ok, After, true},
+      {"in the older form", older, Answer::Ok, older, true},
+  };
+  for (const auto& [name, before, answer, after, saved] : cases) {
+    SCOPED_TRACE(name);
+    PutFile(Configuration, before);
+    OpenAndSearch();
+    QueueAnswer(answer);
+    Save();
+    EXPECT_EQ(TakeMessages(), before == Before ? question : Texts());
+    EXPECT_EQ(Content(Configuration), after);
+    EXPECT_EQ(Stored(), saved ? Defaults : Nothing);
+    EXPECT_EQ(form->IsClosed(), saved);
+  }
+}
+
+// Whatever fails: the file is the old or the new one, whole, and what is not as it was asked for has been said.
+TEST_F(Configurator, EveryFaultLeavesWholeFilesAndIsSaid) {
+  bool closed = false;
+  std::size_t open = 0;
+  const auto prepare = [this] {
+    PutFile(Emulator, "MZ");
+    PutFile(Configuration, Before);
+    OpenAndSearch();
+    QueueAnswer(Answer::Yes);
+  };
+  const auto operate = [&] {
+    Save();
+    closed = form->IsClosed();
+    open = OpenFiles() + OpenRegistryHandles();
+    CutPower();
+  };
+  const auto check = [&] {
+    const std::string content = Content(Configuration).value_or("");
+    EXPECT_TRUE(content == Before || content == After) << content;
+    const Texts messages = TakeMessages();
+    EXPECT_EQ(closed, messages.empty() || !messages.back().starts_with("Erro, "));
+    EXPECT_TRUE(Stored() == Defaults || (Stored()[4] == "-" && !closed)) << "configured is only what is complete";
+    EXPECT_EQ(open, 0U);
+  };
+  EXPECT_GT(WithEachFault(prepare, operate, check), 20);
+}
+
+}  // namespace
