@@ -31,7 +31,8 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
       Click(*command);
       EXPECT_TRUE(othersSay.empty() || TakeMessages() == othersSay);
     }
-    EXPECT_TRUE(Standing() == before && StartedProcesses().empty());
+    EXPECT_TRUE(Standing() == before);
+    EXPECT_TRUE(StartedProcesses().empty());
     EXPECT_EQ(StoredText(Key, "LRom"), std::nullopt);
   }
 }

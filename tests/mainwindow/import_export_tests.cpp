@@ -51,47 +51,51 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   const Files renamed = {{Roms + "SUPERJOG.zip", Rom},
                          {Imgs + "Outro.gif", "new"},
                          {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||SUPERJOG=Outro|"}};
+  const std::string fresh = Package("Novo", "NOVO"), other = Package("Outro", "SUPERJOG", "new");
+  const std::string anotherCase = Package("SUPER jogo", "SUPERJOG", "new");
+  const std::string wrongSum = Package("Super Jogo", "SUPERJOG", "new", "987654321");
   const struct {
+    const char* Name;
     std::string Path, Content;
     Texts Shown;
+    Before Happens = Nothing;
     std::string Selected = {};
     Files New = {};  // what stands there afterwards, beside what stood there
-    Before Happens = Nothing;
   } cases[] = {
-      {"D:\\NOVO.SMC", "rom", {Added}, "NOVO", {{Roms + "NOVO.SMC", "rom"}}},
-      {"D:\\a.b.zip", "zip", {Added}, "a.b", {{Roms + "a.b.zip", "zip"}}},
-      {"D:\\x.gzip", "zip", {Added}, "", {{Roms + "x.gzip", "zip"}}},  // copied, but no name that the list shows
-      {"D:\\p.tVk", Package("Ação=Jogo"_ansi, "ação"_ansi), {Added}, "Ação=Jogo"_ansi, package},
-      {"", "", {}},  // cancelled
-      {"D:\\vazio.zip", "", {ReadError}},
-      {"D:\\preso.zip", "x", {ReadError}, "", {}, Locked("D:\\preso.zip")},
-      {"D:\\semponto", "x", {ReadError}},
-      {"D:\\x.txt", "x", {}},
-      {"D:\\nada.tvk", "no package", {ReadError}},
-      {"D:\\soma.tvk", Package("Novo", "NOVO", "figura", "123456788"), {Corrupt}},
-      {"D:\\curto.tvk", Package("Novo", "NOVO").substr(0, 105), {Corrupt}},
-      {"D:\\disco.tvk", Package("Novo", "NOVO"), {Corrupt}, "", {}, altered},
-      {"D:\\disco.tvk", whole, {ReplaceGame, Corrupt}, "", {}, alteredOld},
-      {"D:\\rom cortada.tvk", whole.substr(0, 115), {ReplaceGame, Corrupt}, "", {}, Yes},
-      {"D:\\fim da figura.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, "", {}, Yes},
-      {"D:\\figura cortada.tvk", whole.substr(0, 105), {ReplaceGame, ReadError}, "", {}, Yes},
-      {"D:\\so o cabecalho.tvk", whole.substr(0, 104), {ReplaceGame, ReadError}, "", {}, Yes},
-      {"D:\\figura.tvk", Package("No|vo", "NOVO"), {ReadError}},  // the picture cannot have this name: nor the ROM
-      {"D:\\rom.tvk", Package("Novo", "NO|VO"), {ReadError}},
-      {"D:\\longo.tvk", Package("Longo", "LONGO", "figura", WithoutChecksum), {ReadError}},
-      {"D:\\SUPERJOG.zip", "longer than it was", {WriteError}, "", {}, Room(3)},
-      {"D:\\novo.smc", "rom of a new game", {WriteError}, "", {}, Room(3)},
-      {"D:\\so a figura cabe.tvk", whole, {ReplaceGame, ReadError}, "", {}, Room(5)},
-      {"D:\\no lugar.tvk", whole, {ReplaceGame, Added}, "Super Jogo", replaced, inPlace},
-      {"D:\\sem rom, no lugar.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, "", {}, inPlace},
-      {"D:\\outro.tvk", Package("Outro", "SUPERJOG", "new"), {ReplaceGame}, "", {}, No},
-      {"D:\\outro.tvk", Package("Outro", "SUPERJOG", "new"), {ReplaceGame, Added}, "", renamed, Yes},
-      {"D:\\v.tvk", Package("SUPER jogo", "SUPERJOG", "new"), {ReplaceGame}, "", {}, No},
-      {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new", "987654321"), {ReplaceGame, Corrupt}, "", {}, Yes},
-      {"D:\\v.tvk", Package("Super Jogo", "SUPERJOG", "new"), {ReplaceGame, Added}, "Super Jogo", replaced, Yes},
+      {"a ROM", "D:\\NOVO.SMC", "rom", {Added}, Nothing, "NOVO", {{Roms + "NOVO.SMC", "rom"}}},
+      {"two points in the name", "D:\\a.b.zip", "zip", {Added}, Nothing, "a.b", {{Roms + "a.b.zip", "zip"}}},
+      {"a name that the list does not show", "D:\\x.gzip", "zip", {Added}, Nothing, "", {{Roms + "x.gzip", "zip"}}},
+      {"a package", "D:\\p.tVk", Package("Ação=Jogo"_ansi, "ação"_ansi), {Added}, Nothing, "Ação=Jogo"_ansi, package},
+      {"cancelled", "", "", {}},
+      {"an empty file", "D:\\vazio.zip", "", {ReadError}},
+      {"a locked file", "D:\\preso.zip", "x", {ReadError}, Locked("D:\\preso.zip")},
+      {"no extension", "D:\\semponto", "x", {ReadError}},
+      {"another extension", "D:\\x.txt", "x", {}},
+      {"no package", "D:\\p.tvk", "no package", {ReadError}},
+      {"another checksum", "D:\\p.tvk", Package("Novo", "NOVO", "figura", "123456788"), {Corrupt}},
+      {"cut in the ROM", "D:\\p.tvk", fresh.substr(0, 105), {Corrupt}},
+      {"the disk holds something else", "D:\\p.tvk", fresh, {Corrupt}, altered},
+      {"the disk holds something else, over a game", "D:\\p.tvk", whole, {ReplaceGame, Corrupt}, alteredOld},
+      {"cut in the ROM, over a game", "D:\\p.tvk", whole.substr(0, 115), {ReplaceGame, Corrupt}, Yes},
+      {"cut behind the picture, over a game", "D:\\p.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, Yes},
+      {"cut in the picture, over a game", "D:\\p.tvk", whole.substr(0, 105), {ReplaceGame, ReadError}, Yes},
+      {"only the header, over a game", "D:\\p.tvk", whole.substr(0, 104), {ReplaceGame, ReadError}, Yes},
+      {"no name for a picture: nor for the ROM", "D:\\p.tvk", Package("No|vo", "NOVO"), {ReadError}},
+      {"no name for a ROM", "D:\\p.tvk", Package("Novo", "NO|VO"), {ReadError}},
+      {"a ROM without a checksum", "D:\\p.tvk", Package("Longo", "LONGO", "figura", WithoutChecksum), {ReadError}},
+      {"no room, over a ROM", "D:\\SUPERJOG.zip", "longer than it was", {WriteError}, Room(3)},
+      {"no room", "D:\\novo.smc", "rom of a new game", {WriteError}, Room(3)},
+      {"room for the picture only", "D:\\p.tvk", whole, {ReplaceGame, ReadError}, Room(5)},
+      {"in place", "D:\\p.tvk", whole, {ReplaceGame, Added}, inPlace, "Super Jogo", replaced},
+      {"in place, cut behind the picture", "D:\\p.tvk", whole.substr(0, 107), {ReplaceGame, ReadError}, inPlace},
+      {"another game of that ROM: no", "D:\\p.tvk", other, {ReplaceGame}, No},
+      {"another game of that ROM: yes", "D:\\p.tvk", other, {ReplaceGame, Added}, Yes, "", renamed},
+      {"over a game in another letter case: no", "D:\\p.tvk", anotherCase, {ReplaceGame}, No},
+      {"another checksum, over a game", "D:\\p.tvk", wrongSum, {ReplaceGame, Corrupt}, Yes},
+      {"over a game: yes", "D:\\p.tvk", whole, {ReplaceGame, Added}, Yes, "Super Jogo", replaced},
   };
   for (const auto& each : cases) {
-    SCOPED_TRACE(each.Path + " " + each.Content.substr(0, 100));
+    SCOPED_TRACE(each.Name);
     SetUpMachine();
     AddDisk('D', 100'000'000);
     PutFile(Roms + "SUPERJOG.zip", "old");
@@ -130,33 +134,40 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
   const std::string rom = Roms + "SUPERJOG.zip", picture = Imgs + "Super Jogo.gif";
   const Before putLongRom = [&] { PutFile(rom, WithoutChecksum); };
   const struct {
-    std::string Name, Offered;  // the extension and the types
+    const char* Name;
+    std::string Game, Offered;  // the extension and the types
     std::string Target;
     Texts Shown;
     std::optional<std::string> Left;  // content of the target afterwards
     Before Happens = Nothing;
   } cases[] = {
-      {"Super Jogo", both, "C:\\x.zip", {Saved}, Rom},
-      {"Super Jogo", both, "C:\\x.TvK", {Saved}, Package("Super Jogo", "SUPERJOG")},
-      {"Sem figura", smc, "C:\\x.tvk", {Saved}, Package("Sem figura", "SEMFIG", "")},
-      {"Nome comprido", smc, "C:\\x.tvk", {Saved}, Package("Nome comprido", "")},
-      {"Nome comprido", smc, "C:\\x", {Saved}, Rom},
-      {"Super Jogo", both, "", {}, {}},  // cancelled
-      {"Super Jogo", both, "C:\\old.zip", {ReplaceFile}, "old", No},
-      {"Super Jogo", both, "C:\\old.zip", {ReplaceFile, Saved}, Rom, Yes},
-      {"Super Jogo", both, "Q:\\x.zip", {WriteError}, {}},
-      {"Super Jogo", both, "C:\\x.zip", {WriteError}, {}, Room(3)},
-      {"Super Jogo", both, "C:\\old.tvk", {ReplaceFile, WriteError}, "old", Room(3)},
-      {"Super Jogo", both, "C:\\x.zip", {ReadError}, {}, Locked(rom)},
-      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(rom)},
-      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(picture)},
-      {"Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, putLongRom},
+      {"a ROM", "Super Jogo", both, "C:\\x.zip", {Saved}, Rom},
+      {"a package", "Super Jogo", both, "C:\\x.TvK", {Saved}, Package("Super Jogo", "SUPERJOG")},
+      {"a package without a picture", "Sem figura", smc, "C:\\x.tvk", {Saved}, Package("Sem figura", "SEMFIG", "")},
+      {"a package without a DOS name", "Nome comprido", smc, "C:\\x.tvk", {Saved}, Package("Nome comprido", "")},
+      {"no extension", "Nome comprido", smc, "C:\\x", {Saved}, Rom},
+      {"cancelled", "Super Jogo", both, "", {}, {}},
+      {"over a file: no", "Super Jogo", both, "C:\\old.zip", {ReplaceFile}, "old", No},
+      {"over a file: yes", "Super Jogo", both, "C:\\old.zip", {ReplaceFile, Saved}, Rom, Yes},
+      {"to a missing disk", "Super Jogo", both, "Q:\\x.zip", {WriteError}, {}},
+      {"no room for a ROM", "Super Jogo", both, "C:\\x.zip", {WriteError}, {}, Room(3)},
+      {"no room for a package over a file",
+       "Super Jogo",
+       both,
+       "C:\\old.tvk",
+       {ReplaceFile, WriteError},
+       "old",
+       Room(3)},
+      {"a locked ROM", "Super Jogo", both, "C:\\x.zip", {ReadError}, {}, Locked(rom)},
+      {"a locked ROM, as a package", "Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(rom)},
+      {"a locked picture", "Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, Locked(picture)},
+      {"a ROM without a checksum", "Super Jogo", both, "C:\\x.tvk", {ExportError}, {}, putLongRom},
   };
   for (const auto& each : cases) {
-    SCOPED_TRACE(each.Name + " to " + each.Target + testing::PrintToString(each.Shown));
+    SCOPED_TRACE(each.Name);
     SetUpMachine();
     for (const char* old : {"C:\\old.zip", "C:\\old.tvk"}) PutFile(old, "old");
-    StartAndPick(each.Name);
+    StartAndPick(each.Game);
     each.Happens();
     Files expected = Standing();
     if (each.Left) expected[each.Target] = each.Left;
@@ -167,7 +178,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     EXPECT_EQ(States(), NothingSelected);  // the game commands wait for the next click
     const auto& asked = ShownFileDialogs().back();
     EXPECT_EQ(asked.DefaultExtension + asked.Filter, each.Offered);
-    EXPECT_EQ(asked.Title + asked.File.substr(0, each.Name.size() + 1), "Salvar como..." + each.Name + " ");
+    EXPECT_EQ(asked.Title + asked.File.substr(0, each.Game.size() + 1), "Salvar como..." + each.Game + " ");
   }
 }
 

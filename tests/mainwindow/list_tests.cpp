@@ -17,7 +17,9 @@ TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
   ASSERT_EQ(form->Jogos.size(), 6U);
   const Jogo &first = form->Jogos[0], &unknown = form->Jogos[1];
   EXPECT_EQ(first.Arquivo + "|" + first.DOSName, Roms + "acao.ZIP|ACAO");
-  EXPECT_TRUE(first.Catalogado && !unknown.Catalogado && unknown.DOSName.empty());
+  EXPECT_TRUE(first.Catalogado);
+  EXPECT_FALSE(unknown.Catalogado);
+  EXPECT_EQ(unknown.DOSName, "");
   for (const Jogo& each : form->Jogos) EXPECT_EQ(each.ArquivoCurto, Form1::CaminhoCurto(each.Arquivo));
   EXPECT_NE(unknown.ArquivoCurto, unknown.Arquivo);
 
@@ -28,13 +30,19 @@ TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
 
 TEST_F(List, SelectsTheLastGamePlayedAndWithoutItLeavesOnlyTheCommandsThatNeedNoGame) {
   PutFile(Imgs + "Super Jogo.gif", SmallGif());
-  const std::tuple<const char*, const char*, const char*, int> cases[] = {
-      // the ROM directory, the last game, what is selected then, and how many games there are
-      {"", "sUPER jogo", "Super Jogo", 3}, {"", "", "", 3}, {"", "Outro", "", 3}, {"\\Vazio\\", "Super Jogo", "", 0},
-      {"Q:\\Roms\\", "Super Jogo", "", 0},
+  const struct {
+    const char *Name, *Directory, *Last;  // the settings
+    const char* Selected;
+    int Count;
+  } cases[] = {
+      {"in another letter case", "", "sUPER jogo", "Super Jogo", 3},
+      {"none was played", "", "", "", 3},
+      {"one that is gone", "", "Outro", "", 3},
+      {"an empty directory", "\\Vazio\\", "Super Jogo", "", 0},
+      {"a directory on a missing disk", "Q:\\Roms\\", "Super Jogo", "", 0},
   };
-  for (const auto& [directory, last, selected, count] : cases) {
-    SCOPED_TRACE(std::string(directory) + " " + last);
+  for (const auto& [name, directory, last, selected, count] : cases) {
+    SCOPED_TRACE(name);
     PutText(Key, "RomDir", directory);
     PutText(Key, "LRom", last);
     ASSERT_TRUE(Start());
@@ -64,7 +72,8 @@ TEST_F(List, WhileItIsReadNothingCanBeStartedAndTheWindowLives) {
   form->CarregarLista(true);
   EXPECT_EQ(looks, 1);
   EXPECT_GE(PendingEventRuns() - runsBefore, 3 + 3);  // at rows 0, 10 and 20, and around
-  EXPECT_TRUE(ShownFileDialogs().empty() && StartedProcesses().empty());
+  EXPECT_TRUE(ShownFileDialogs().empty());
+  EXPECT_TRUE(StartedProcesses().empty());
   EXPECT_EQ(States(), NothingSelected);
 }
 
@@ -87,19 +96,21 @@ TEST_F(List, IsWholeWhenItIsFilledAgainWhileItIsRead) {
 
 TEST_F(List, PreviewTakesTheFirstPicturePresent) {
   ASSERT_TRUE(Start());
-  const std::tuple<const char*, std::string, std::string> steps[] = {
-      // a picture file that is put there, its content, and the picture that is shown then
-      {".jpg", "", ""},  // an empty file counts as none: the default picture
-      {".png", SmallPng(), SmallPng()},
-      {".jpg", SmallJpeg(), SmallJpeg()},
-      {".bmp", SmallBmp(), SmallBmp()},
-      {".gif", SmallGif(), SmallGif()},
-      {".gif", "damaged", SmallGif()},  // leaves the picture that is shown
+  const struct {
+    const char *Name, *Extension;
+    std::string Content, Shown;
+  } steps[] = {
+      {"an empty file counts as none: the default picture", ".jpg", "", ""},
+      {"the last of the four", ".png", SmallPng(), SmallPng()},
+      {"before it", ".jpg", SmallJpeg(), SmallJpeg()},
+      {"before that", ".bmp", SmallBmp(), SmallBmp()},
+      {"the first", ".gif", SmallGif(), SmallGif()},
+      {"a damaged one leaves the picture that is shown", ".gif", "damaged", SmallGif()},
   };
-  for (const auto& [extension, content, shown] : steps) {
+  for (const auto& [name, extension, content, shown] : steps) {
     PutFile(Imgs + "Sem figura" + extension, content);
     Pick("Sem figura");
-    EXPECT_EQ(ContentOf(form->Image1.ShownPicture()), shown) << extension << content.size();
+    EXPECT_EQ(ContentOf(form->Image1.ShownPicture()), shown) << name;
   }
   RemoveFile(Imgs + "Super Jogo.gif");
   Pick("Super Jogo");

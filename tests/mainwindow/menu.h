@@ -81,17 +81,21 @@ struct Menu : FreshMachine {
 
   std::string Selected() const { return form->List1.Text(form->List1.Selected()); }
 
-  // The commands that are enabled by their numbers, then "k" for Check1, "l" for the list and "i" for a shown picture.
+  // The controls that are enabled, and "picture" when one is shown.
   std::string States() const {
-    const platform::Control* controls[] = {&form->Command1, &form->Command2, &form->Command3, &form->Command4,
-                                           &form->Command5, &form->Command6, &form->Check1,   &form->List1};
-    std::string letters;
-    for (std::size_t i = 0; i < std::size(controls); ++i) letters.append(controls[i]->Enabled() ? 1 : 0, "123456kl"[i]);
-    if (form->Image1.Visible()) letters += 'i';
-    return letters;
+    const std::pair<const char*, const platform::Control*> controls[] = {
+        {"play ", &form->Command1},   {"saves ", &form->Command2},  {"download ", &form->Command3},
+        {"import ", &form->Command4}, {"export ", &form->Command5}, {"delete ", &form->Command6},
+        {"floppy ", &form->Check1},   {"list ", &form->List1},
+    };
+    std::string states;
+    for (const auto& [name, control] : controls) states += control->Enabled() ? name : "";
+    return states + (form->Image1.Visible() ? "picture" : "");
   }
 
   std::unique_ptr<Form1> form;
 };
 
-inline constexpr char NothingSelected[] = "234kli", GameSelected[] = "123456kli", Busy[] = "li";
+inline constexpr char NothingSelected[] = "saves download import floppy list picture";
+inline constexpr char GameSelected[] = "play saves download import export delete floppy list picture";
+inline constexpr char Busy[] = "list picture";

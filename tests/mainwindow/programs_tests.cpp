@@ -134,7 +134,8 @@ TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBac
   RefuseToStart(Downloader);
   Pick("Sem figura");
   Click(form->Command3);
-  EXPECT_TRUE(form->Enabled() && !form->Timer1.Enabled());
+  EXPECT_TRUE(form->Enabled());
+  EXPECT_FALSE(form->Timer1.Enabled());
   EXPECT_EQ(form->Caption(), "Tolvaris");
   EXPECT_EQ(Selected(), "Sem figura") << "what was selected before";
   EXPECT_EQ(States(), GameSelected);

@@ -9,16 +9,25 @@ struct Startup : Menu {};
 TEST_F(Startup, SavedPositionKeepsPartOfTheWindowOnTheScreen) {
   constexpr std::optional<int> none;
   constexpr int centreLeft = (15360 - 7000) / 2, centreTop = (11520 - 4000) / 2;
-  const std::tuple<const char*, std::optional<int>, std::optional<int>> cases[] = {
-      // what is saved, and what becomes of it as a left and as a top edge
-      {"", centreLeft, centreTop}, {"0", 0, none},         {"1", 1, 1},
-      {"-6744", -6744, none},      {"-6745", none, none},  {"11264", 11264, 11264},
-      {"11265", 11265, none},      {"15104", 15104, none}, {"15105", none, none},
-      {"12.5", none, none},        {" ", none, none},
+  const struct {
+    const char *Name, *Saved;
+    std::optional<int> Left, Top;  // what becomes of it as a left and as a top edge
+  } cases[] = {
+      {"nothing", "", centreLeft, centreTop},
+      {"at the very edge", "0", 0, none},
+      {"right below the edge", "1", 1, 1},
+      {"256 twips of the width are seen", "-6744", -6744, none},
+      {"255 twips of the width", "-6745", none, none},
+      {"256 twips of the height are seen", "11264", 11264, 11264},
+      {"255 twips of the height", "11265", 11265, none},
+      {"256 twips before the right edge", "15104", 15104, none},
+      {"255 twips before the right edge", "15105", none, none},
+      {"no whole number", "12.5", none, none},
+      {"a blank", " ", none, none},
   };
-  for (const auto& [saved, left, top] : cases) {
-    EXPECT_EQ(EsquerdaInicial(saved, 7000, 15360), left) << saved;
-    EXPECT_EQ(TopoInicial(saved, 4000, 11520), top) << saved;
+  for (const auto& [name, saved, left, top] : cases) {
+    EXPECT_EQ(EsquerdaInicial(saved, 7000, 15360), left) << name;
+    EXPECT_EQ(TopoInicial(saved, 4000, 11520), top) << name;
   }
   for (const char* unchecked : {"", "0", "2", "-1", "abc"}) EXPECT_EQ(EstadoDisquete(unchecked), 0) << unchecked;
 }
@@ -28,22 +37,25 @@ TEST_F(Startup, SavedPositionIsRestoredOnAnyMonitorThatIsThere) {
   constexpr int centreLeft = (15360 - 7000) / 2;
   const std::vector<platform::Bounds> monitors = {
       {0, 0, 15360, 11520}, {15360, -2000, 9000, 8000}, {-9000, 0, 9000, 6000}};
-  const std::tuple<const char*, const char*, Canto> cases[] = {
-      {"16000", "-1999", {16000, -1999}},  // the right one, higher than the primary one
-      {"16000", "-2000", {none, none}},    // at its very top
-      {"24104", "100", {24104, 100}},      // 256 twips before its right edge
-      {"24105", "100", {none, 100}},
-      {"-15744", "5744", {-15744, 5744}},  // the left one's corner
-      {"-15745", "5744", {none, 5744}},
-      {"-8000", "5745", {none, 5745}},  // below the left one
-      {"1000", "-500", {1000, none}},   // above the primary one
-      {"16000", "", {none, (11520 - 4000) / 2}},
-      {"", "-500", {centreLeft, none}},
-      {"16000", "x", {none, none}},
-      {"2147483647", "-2147483648", {none, none}},
+  const struct {
+    const char *Name, *Left, *Top;
+    Canto Corner;
+  } cases[] = {
+      {"on the right one, higher than the primary one", "16000", "-1999", {16000, -1999}},
+      {"at the very top of the right one", "16000", "-2000", {none, none}},
+      {"256 twips before its right edge", "24104", "100", {24104, 100}},
+      {"255 twips before its right edge", "24105", "100", {none, 100}},
+      {"the last corner of the left one", "-15744", "5744", {-15744, 5744}},
+      {"a twip left of the left one's", "-15745", "5744", {none, 5744}},
+      {"below the left one", "-8000", "5745", {none, 5745}},
+      {"above the primary one", "1000", "-500", {1000, none}},
+      {"only the left edge is saved", "16000", "", {none, (11520 - 4000) / 2}},
+      {"only the top edge is saved", "", "-500", {centreLeft, none}},
+      {"the top edge is no number", "16000", "x", {none, none}},
+      {"the farthest numbers", "2147483647", "-2147483648", {none, none}},
   };
-  for (const auto& [left, top, corner] : cases) {
-    EXPECT_EQ(CantoInicial(left, top, {.Width = 7000, .Height = 4000}, monitors[0], monitors), corner) << left << top;
+  for (const auto& [name, left, top, corner] : cases) {
+    EXPECT_EQ(CantoInicial(left, top, {.Width = 7000, .Height = 4000}, monitors[0], monitors), corner) << name;
   }
   PutText(Key, "pl", "16000");
   PutText(Key, "pt", "-1000");
@@ -66,7 +78,8 @@ TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   EXPECT_EQ(form->Check1.Value(), 1);
   EXPECT_EQ((Texts{DirPrograma, DirRoms, DirSaves, DirImgs, ArquivoCfgEmulador}),
             (Texts{Home, Home + "Jogos\\", "D:\\Saves\\", Imgs, Home + "Emu\\zsnesw.cfg"}));
-  EXPECT_TRUE(DirectoryStands(DirRoms) && DirectoryStands(DirImgs));
+  EXPECT_TRUE(DirectoryStands(DirRoms));
+  EXPECT_TRUE(DirectoryStands(DirImgs));
 }
 
 TEST_F(Startup, DefaultsInANetworkDirectoryAreWhereTheProgramIs) {
@@ -103,7 +116,8 @@ TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   EXPECT_TRUE(form->IsClosed());
   PutFile(configurator, "MZ");
   EXPECT_FALSE(Start());  // cancelled
-  EXPECT_TRUE(form->IsClosed() && StartedProcesses().empty());
+  EXPECT_TRUE(form->IsClosed());
+  EXPECT_TRUE(StartedProcesses().empty());
 
   // Run once it leaves the settings as they are, run again it writes them.
   int runs = 0;
