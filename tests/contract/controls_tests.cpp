@@ -72,14 +72,16 @@ TEST_F(Controls, HandActsOnWhatTakesInputOnly) {
   };
   for (const auto change : {&Control::Enable, &Control::Show}) {
     for (Control* control : inputs) (control->*change)(false);
-    EXPECT_TRUE(list.Enabled() == (change == &Control::Show) && list.Visible() == (change == &Control::Enable));
+    EXPECT_EQ(list.Enabled(), change == &Control::Show);
+    EXPECT_EQ(list.Visible(), change == &Control::Enable);
     EXPECT_EQ(act(), Untouched);
     for (Control* control : inputs) (control->*change)(true);
   }
   window.Enable(false);
   EXPECT_EQ(act(), Untouched);
   UseCloseBox(window);
-  EXPECT_FALSE(window.IsClosed() || window.Enabled());
+  EXPECT_FALSE(window.IsClosed());
+  EXPECT_FALSE(window.Enabled());
   window.Enable(true);
   EXPECT_EQ(act(), "list button image /1/1/0");
   EXPECT_EQ(act(), "list button image /1/0/0");
@@ -101,7 +103,8 @@ TEST_F(Controls, ClosingRunsUnloadOnceAndLeavesTheLastAnswers) {
   window.OnUnload = [&] {
     clicks += "unload ";
     window.Close();
-    EXPECT_TRUE(!window.IsClosed() && list.Count() == 3);
+    EXPECT_FALSE(window.IsClosed());
+    EXPECT_EQ(list.Count(), 3);
     throw 1;  // dropped at the edge of the handler
   };
   list.Select(1);
@@ -117,7 +120,8 @@ TEST_F(Controls, ClosingRunsUnloadOnceAndLeavesTheLastAnswers) {
     control->SetCaption("Outro");
     control->Enable(false);
     control->Show(false);
-    EXPECT_TRUE(control->Enabled() && control->Visible());
+    EXPECT_TRUE(control->Enabled());
+    EXPECT_TRUE(control->Visible());
   }
   window.Show();
   window.ShowModal();
@@ -137,7 +141,9 @@ TEST_F(Controls, ModalWindowTakesAllInputUntilItIsClosed) {
     UseCloseBox(modal);
   });
   modal.ShowModal();
-  EXPECT_TRUE(modal.IsClosed() && window.Enabled() && !window.IsClosed());
+  EXPECT_TRUE(modal.IsClosed());
+  EXPECT_TRUE(window.Enabled());
+  EXPECT_FALSE(window.IsClosed());
   EXPECT_EQ(Seen(), "inside /-1/0/0");
 }
 

@@ -15,24 +15,36 @@ class Files : public Machine {
 
 TEST_F(Files, OpenAsTheAccessSays) {
   Put(a_, "0123456789");
-  const std::tuple<string, Access, bool, string> cases[] = {{missing_, Access::Read, false, "(none)"},
-                                                            {a_, Access::Read, true, "0123456789"},
-                                                            {a_, Access::ReadWrite, true, "0123456789"},
-                                                            {here_ + "new1", Access::ReadWrite, true, ""},
-                                                            {here_ + "nowhere\\x", Access::ReadWrite, false, "(none)"},
-                                                            {here_, Access::Read, false, "(none)"},
-                                                            {a_ + Zero, Access::ReadWrite, false, "(none)"},
-                                                            {a_, Access::CreateNew, false, "0123456789"},
-                                                            {here_ + "new2", Access::CreateNew, true, ""},
-                                                            {here_, Access::CreateNew, false, "(none)"}};
-  for (const auto& [path, access, opens, after] : cases) {
+  const struct {
+    const char* Name;
+    string Path;
+    Access Wish;
+    bool Opens;
+    string After;
+  } cases[] = {
+      {"a missing one, to read", missing_, Access::Read, false, "(none)"},
+      {"to read", a_, Access::Read, true, "0123456789"},
+      {"to write", a_, Access::ReadWrite, true, "0123456789"},
+      {"a missing one, to write", here_ + "new1", Access::ReadWrite, true, ""},
+      {"in a missing directory", here_ + "nowhere\\x", Access::ReadWrite, false, "(none)"},
+      {"a directory", here_, Access::Read, false, "(none)"},
+      {"a path that names nothing", a_ + Zero, Access::ReadWrite, false, "(none)"},
+      {"a new one where one is", a_, Access::CreateNew, false, "0123456789"},
+      {"a new one", here_ + "new2", Access::CreateNew, true, ""},
+      {"a new one where a directory is", here_, Access::CreateNew, false, "(none)"},
+  };
+  for (const auto& [name, path, access, opens, after] : cases) {
+    SCOPED_TRACE(name);
     File file(path, access), moved = std::move(file);
-    EXPECT_EQ(moved.IsOpen() && moved.Size() >= 0, opens) << path;
+    EXPECT_EQ(moved.IsOpen() && moved.Size() >= 0, opens);
     moved.Close();
     for (File* closed : {&file, &moved}) {
-      EXPECT_FALSE(closed->IsOpen() || closed->Size() >= 0 || closed->Write(0, "x") || closed->Flush()) << path;
+      EXPECT_FALSE(closed->IsOpen());
+      EXPECT_LT(closed->Size(), 0);
+      EXPECT_FALSE(closed->Write(0, "x"));
+      EXPECT_FALSE(closed->Flush());
     }
-    EXPECT_EQ(Content(path), after) << path;
+    EXPECT_EQ(Content(path), after);
   }
   SetAttributes(a_, AttributeReadOnly);
   EXPECT_EQ(File(a_, Access::ReadWrite).IsOpen(), IsWine());
@@ -44,8 +56,10 @@ TEST_F(Files, OpenAsTheAccessSays) {
 
 TEST_F(Files, BytePositionsAndSizesAreExact) {
   File file(a_, Access::ReadWrite), reader(a_, Access::Read), other(a_, Access::ReadWrite);
-  EXPECT_TRUE(file.Write(0, string("\0\r\n\x1A\xFF|=", 7)) && other.Write(other.Size(), "end"));
-  EXPECT_TRUE(file.Write(2, "X") && file.Write(3, ""));
+  EXPECT_TRUE(file.Write(0, string("\0\r\n\x1A\xFF|=", 7)));
+  EXPECT_TRUE(other.Write(other.Size(), "end"));
+  EXPECT_TRUE(file.Write(2, "X"));
+  EXPECT_TRUE(file.Write(3, ""));
   const std::tuple<std::int64_t, std::size_t, string> cases[] = {
       {0, 4, string("\0\rX\x1A", 4)}, {3, 1, "\x1A"}, {6, 9, "=end"}, {10, 5, ""}, {99, 5, ""}};
   for (const auto& [position, length, bytes] : cases) {
@@ -53,37 +67,50 @@ TEST_F(Files, BytePositionsAndSizesAreExact) {
     ASSERT_EQ(reader.Read(position, buffer.data(), length), std::ssize(bytes)) << position;
     EXPECT_EQ(buffer.substr(0, bytes.size()), bytes);
   }
-  EXPECT_FALSE(reader.Write(0, "x") || reader.SetSize(0));
+  EXPECT_FALSE(reader.Write(0, "x"));
+  EXPECT_FALSE(reader.SetSize(0));
   EXPECT_TRUE(file.Write(12, "beyond"));  // the gap is zeros
   EXPECT_EQ(Content(a_).substr(9), string("d\0\0beyond", 9));
-  EXPECT_TRUE(file.SetSize(2) && file.SetSize(4) && file.Flush());
+  EXPECT_TRUE(file.SetSize(2));
+  EXPECT_TRUE(file.SetSize(4));
+  EXPECT_TRUE(file.Flush());
   EXPECT_EQ(Content(a_), string("\0\r\0\0", 4));
   Put(b_, "b");
-  EXPECT_FALSE(DeleteFileA(a_) || DeleteAbandonedFile(a_, 0) || MoveFileExA(a_, missing_, Existing::Keep) ||
-               MoveFileExA(b_, a_, Existing::Replace));  // as it is open
+  EXPECT_FALSE(DeleteFileA(a_)) << "as it is open";
+  EXPECT_FALSE(DeleteAbandonedFile(a_, 0)) << "as it is open";
+  EXPECT_FALSE(MoveFileExA(a_, missing_, Existing::Keep)) << "as it is open";
+  EXPECT_FALSE(MoveFileExA(b_, a_, Existing::Replace)) << "as it is open";
 }
 
 TEST_F(Files, LengthsAndAttributesNeedNoOpenFileAndDecideWhatIsDeleted) {
   const string folder = here_ + "Pasta";
   EXPECT_TRUE(CreateDirectoryA(folder));
-  EXPECT_FALSE(CreateDirectoryA(folder + "\\") || CreateDirectoryA(here_ + "nowhere\\sub"));
+  EXPECT_FALSE(CreateDirectoryA(folder + "\\"));
+  EXPECT_FALSE(CreateDirectoryA(here_ + "nowhere\\sub"));
   Put(a_, "12345");
   Put(b_);
   SetAttributes(a_, AttributeReadOnly | AttributeHidden);
   SetAttributes(b_, AttributeNormal);
-  const std::tuple<string, std::optional<std::uint32_t>, std::optional<std::int64_t>> cases[] = {
-      {a_, AttributeReadOnly | AttributeHidden, 5},
-      {here_ + "A\xC7\xC3O.SMC", AttributeReadOnly | AttributeHidden, 5},  // in other case
-      {b_ + Zero, {}, {}},
-      {b_, 0, 0},
-      {here_ + "PASTA\\", AttributeDirectory, {}},
-      {missing_, {}, {}}};
-  for (const auto& [path, expected, size] : cases) {
+  const struct {
+    const char* Name;
+    string Path;
+    std::optional<std::uint32_t> Attributes;
+    std::optional<std::int64_t> Size;
+  } cases[] = {
+      {"read-only and hidden", a_, AttributeReadOnly | AttributeHidden, 5},
+      {"in another letter case", here_ + "A\xC7\xC3O.SMC", AttributeReadOnly | AttributeHidden, 5},
+      {"a path that names nothing", b_ + Zero, {}, {}},
+      {"an empty one", b_, 0, 0},
+      {"a directory", here_ + "PASTA\\", AttributeDirectory, {}},
+      {"missing", missing_, {}, {}},
+  };
+  for (const auto& [name, path, expected, size] : cases) {
+    SCOPED_TRACE(name);
     std::optional<std::uint32_t> attributes = GetFileAttributesA(path);
     if (attributes && size) *attributes &= AttributeReadOnly | AttributeHidden;  // each disk keeps others
-    EXPECT_EQ(attributes, expected) << path;
-    EXPECT_EQ(FileSize(path), size) << path;
-    EXPECT_EQ(DeleteFileA(path), path == b_) << path;
+    EXPECT_EQ(attributes, expected);
+    EXPECT_EQ(FileSize(path), size);
+    EXPECT_EQ(DeleteFileA(path), path == b_);
   }
   EXPECT_EQ(Content(a_) + Content(b_), "12345(none)");
 }
@@ -142,13 +169,17 @@ TEST_F(Files, AreAbandonedOnceTheyAreOldAndNobodyHasThemOpen) {
 TEST_F(Files, DisksTellTheirSpaceAndTakeADirectoryWhenTheyAreThere) {
   const string drive = here_.substr(0, 2), root = drive + "\\";
   const auto space = GetDiskFreeSpaceA(drive).value_or(DiskFreeSpace{});
-  EXPECT_TRUE(space.SectorsPerCluster > 0 && space.BytesPerSector > 0 && space.TotalClusters > 0);
+  EXPECT_GT(space.SectorsPerCluster, 0U);
+  EXPECT_GT(space.BytesPerSector, 0U);
+  EXPECT_GT(space.TotalClusters, 0U);
   EXPECT_TRUE(SetDriveDirectory(root));
   for (const string& none : {string("q:\\"), here_ + "nowhere\\", root + Zero, string()}) {
-    EXPECT_FALSE(GetDiskFreeSpaceA(none) || SetDriveDirectory(none)) << none;
+    EXPECT_FALSE(GetDiskFreeSpaceA(none)) << none;
+    EXPECT_FALSE(SetDriveDirectory(none)) << none;
   }
   const auto roots = FixedDrives();
-  EXPECT_TRUE(std::count(roots.begin(), roots.end(), root) == 1 && std::is_sorted(roots.begin(), roots.end()));
+  EXPECT_EQ(std::count(roots.begin(), roots.end(), root), 1);
+  EXPECT_TRUE(std::is_sorted(roots.begin(), roots.end()));
 }
 
 }  // namespace

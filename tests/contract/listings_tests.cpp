@@ -31,18 +31,22 @@ class Listings : public Machine {
 };
 
 TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
-  const std::tuple<string, string, Names> cases[] = {
-      {here_, "*.smc", {"A\xE7\xE3o.SmC", "coop.smc", "co-op.smc", "jogo 10.smc", "Jogo 2.smc", "seven.zip.smc"}},
-      {here_, "*.ZIP;*.zip;s*", {"One.zip", "readonly.zip", "seven.zip.smc", "six", "TWO.ZIP"}},  // each file once
-      {here_, ";?ix;;*o*p.*c;?.zip", {"coop.smc", "co-op.smc", "six"}},
-      {here_, "a\xC7*", {"A\xE7\xE3o.SmC"}},
-      {here_, "", {}},
-      {here_ + "nowhere\\", "*", {}},
-      {here_ + Zero, "*", {}}};
-  for (const auto& [directory, patterns, expected] : cases) {
+  const std::tuple<const char*, string, string, Names> cases[] = {
+      {"one pattern",
+       here_,
+       "*.smc",
+       {"A\xE7\xE3o.SmC", "coop.smc", "co-op.smc", "jogo 10.smc", "Jogo 2.smc", "seven.zip.smc"}},
+      {"each file once", here_, "*.ZIP;*.zip;s*", {"One.zip", "readonly.zip", "seven.zip.smc", "six", "TWO.ZIP"}},
+      {"empty patterns among them", here_, ";?ix;;*o*p.*c;?.zip", {"coop.smc", "co-op.smc", "six"}},
+      {"in another letter case", here_, "a\xC7*", {"A\xE7\xE3o.SmC"}},
+      {"no pattern", here_, "", {}},
+      {"no directory", here_ + "nowhere\\", "*", {}},
+      {"a path that names nothing", here_ + Zero, "*", {}},
+  };
+  for (const auto& [name, directory, patterns, expected] : cases) {
     Names names;
     for (const DirectoryEntry& entry : ListDirectory(directory, patterns)) names.push_back(entry.Name);
-    EXPECT_EQ(names, expected) << directory << " " << patterns;
+    EXPECT_EQ(names, expected) << name;
   }
   EXPECT_EQ(ListSubdirectories(here_), (Names{"\xC1gua", "emu 10", "EMU 2.zip", "readonly", "Zebra"}));
   EXPECT_EQ(ListSubdirectories(here_ + "Zebra\\"), Names{"in"});

@@ -27,7 +27,8 @@ class Machine : public testing::Test {
 
 inline void Put(const string& path, std::string_view content = "") {
   File file(path, Access::ReadWrite);
-  ASSERT_TRUE(file.SetSize(0) && file.Write(0, content)) << path;
+  ASSERT_TRUE(file.SetSize(0)) << path;
+  ASSERT_TRUE(file.Write(0, content)) << path;
 }
 
 // What the file holds, or "(none)".

@@ -1,3 +1,5 @@
+#include <tuple>
+
 #include "platform/registry.h"
 #include "tests/contract/machine.h"
 
@@ -29,12 +31,15 @@ class Registry : public Machine {
 };
 
 TEST_F(Registry, ValuesKeepTheirTypeAndBytesAndMustFitTheRoom) {
-  const std::pair<std::uint32_t, string> cases[] = {{RegistryText, string("C:\\A\xE7\xE3o\0", 8)},
-                                                    {RegistryText, "without its zero"},
-                                                    {RegistryNumber, string("\1\0\0\0", 4)},
-                                                    {RegistryBinary, string("\0\xFF\0", 3)},
-                                                    {RegistryBinary, ""}};
-  for (const auto& [type, data] : cases) {  // each over the one before it; what lies behind its data is not taken
+  const std::tuple<const char*, std::uint32_t, string> cases[] = {
+      {"text", RegistryText, string("C:\\A\xE7\xE3o\0", 8)},
+      {"text without its zero", RegistryText, "without its zero"},
+      {"number", RegistryNumber, string("\1\0\0\0", 4)},
+      {"bytes", RegistryBinary, string("\0\xFF\0", 3)},
+      {"no bytes", RegistryBinary, ""},
+  };
+  for (const auto& [name, type, data] : cases) {  // each over the one before; what lies behind its data is not taken
+    SCOPED_TRACE(name);
     ASSERT_EQ(RegSetValueExA(key_, "Valor", type, (data + "+").data(), static_cast<std::uint32_t>(data.size())), 0);
     const string stored = std::to_string(type) + ":" + data;
     EXPECT_EQ(Query("Valor", data.size()), stored);
@@ -54,7 +59,7 @@ TEST_F(Registry, KeysAreMadeOnceAndDeletedWithoutKeysBelow) {
   }
   EXPECT_EQ(Query("Valor", 4), "4:1234");
   EXPECT_NE(RegDeleteKeyA(key_, "Um"), 0);
-  EXPECT_TRUE(Exists("um") && Exists("Um\\Dois") && Exists(""));
+  for (const char* key : {"um", "Um\\Dois", ""}) EXPECT_TRUE(Exists(key)) << key;
   for (const char* subkey : {"UM\\dois", "Um"}) {
     EXPECT_EQ(RegDeleteKeyA(key_, subkey), 0);
     EXPECT_FALSE(Exists(subkey));

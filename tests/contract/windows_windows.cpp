@@ -46,9 +46,11 @@ TEST_F(NativeWindow, IsLaidOutAgainAtAnotherResolutionAndStaysWhereItWasPut) {
     ::GetWindowRect(native, &whole);
     ::GetWindowRect(image.State().Handle, &place);
     ::MapWindowPoints(nullptr, native, reinterpret_cast<POINT*>(&place), 2);
-    EXPECT_TRUE(client.right == 500 * dpi / 96 && client.bottom == 300 * dpi / 96) << dpi;
+    EXPECT_EQ(client.right, 500 * dpi / 96) << dpi;
+    EXPECT_EQ(client.bottom, 300 * dpi / 96) << dpi;
     EXPECT_EQ(window.Left(), 600) << dpi;
-    EXPECT_TRUE(whole.left == 40 && place.left == 310 * dpi / 96) << dpi;
+    EXPECT_EQ(whole.left, 40) << dpi;
+    EXPECT_EQ(place.left, 310 * dpi / 96) << dpi;
     EXPECT_NEAR(place.bottom, (30 + 13) * dpi / 96, 1);
     LOGFONTA font = {};
     ::GetObjectA(reinterpret_cast<HFONT>(::SendMessageA(button.State().Handle, WM_GETFONT, 0, 0)), sizeof font, &font);

@@ -72,7 +72,8 @@ void Installation::Choose(Command command, const std::string& path) const {
 void Installation::ExpectQuietEnd() const {
   EXPECT_SOON(window->Pictures[Import].Enabled());
   EXPECT_FALSE(FindMessage(*program));
-  EXPECT_FALSE(window->Pictures[Export].Enabled() || window->Pictures[Delete].Enabled());
+  EXPECT_FALSE(window->Pictures[Export].Enabled());
+  EXPECT_FALSE(window->Pictures[Delete].Enabled());
 }
 
 void Installation::ExpectPlayed(const std::string& rom) {
