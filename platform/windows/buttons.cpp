@@ -5,52 +5,26 @@ namespace platform {
 namespace {
 
 constexpr int IconSide = 32;
-constexpr BYTE Whole = 255, Faded = 85;  // how strong the icon is; faded on a button that is switched off
-constexpr int FocusInset = 3;
 
-void Blend(HDC context, const RECT& place, const ButtonImage& image, BYTE strength) {
-  const HDC source = ::CreateCompatibleDC(context);
-  const HGDIOBJ before = ::SelectObject(source, image.Bitmap.get());
-  ::GdiAlphaBlend(context, place.left, place.top, place.right - place.left, place.bottom - place.top, source, 0, 0,
-                  image.Side, image.Side, {AC_SRC_OVER, 0, strength, AC_SRC_ALPHA});
-  ::SelectObject(source, before);
-  ::DeleteDC(source);
-}
-
-int SideOf(const ControlState& control) { return Scaled(IconSide, control.Owner->Dpi); }
-
-bool ShowsFocus(const NMCUSTOMDRAW& face) {
-  return (face.uItemState & CDIS_FOCUS) != 0 &&
-         (::SendMessageA(face.hdr.hwndFrom, WM_QUERYUISTATE, 0, 0) & UISF_HIDEFOCUS) == 0;
-}
-
-void DrawFace(const ControlState& control, const NMCUSTOMDRAW& face) {
-  RECT place = face.rc;
-  const int side = SideOf(control);
-  const int left = (place.left + place.right - side) / 2, top = (place.top + place.bottom - side) / 2;
-  Blend(face.hdc, {left, top, left + side, top + side}, control.Image, control.Enabled ? Whole : Faded);
-  if (!ShowsFocus(face)) return;
-  ::InflateRect(&place, -FocusInset, -FocusInset);
-  ::DrawFocusRect(face.hdc, &place);
-}
-
+// The button draws the icon that it is given last, and its owner destroys it after that.
 void ShowIcon(ControlState& control, int id) {
   control.LayOut = [&control, id] {
-    control.Image = LoadButtonImage(id, SideOf(control));
-    if (::IsWindowVisible(control.Handle)) ::InvalidateRect(control.Handle, nullptr, TRUE);
+    IconHandle next = LoadIconFor(id, Scaled(IconSide, control.Owner->Dpi));
+    ::SendMessageA(control.Handle, BM_SETIMAGE, IMAGE_ICON, reinterpret_cast<LPARAM>(next.get()));
+    control.Image.swap(next);
   };
   control.LayOut();
 }
 
-// A button of the style that shows an icon in place of its text, which is the tool tip and serves as its name.
+// A button of the style that shows an icon in place of its text, which is the tool tip and serves as its name: with
+// BS_ICON and an image Windows documents that the icon alone is drawn.
 void CreateIconButton(ControlState& control, const Container& container, const Bounds& bounds, DWORD style, int icon,
                       const std::string& toolTip) {
-  CreateControl(control, container, bounds, {"BUTTON", WS_TABSTOP | style}, toolTip);
+  CreateControl(control, container, bounds, {"BUTTON", WS_TABSTOP | BS_ICON | style}, toolTip);
   control.Caption.clear();
   control.ToolTip = toolTip;
   control.NamedByToolTip = true;
   PressOnEnter(control);
-  control.DrawFace = [&control](const NMCUSTOMDRAW& face) { DrawFace(control, face); };
   if (control.Handle != nullptr) ShowIcon(control, icon);
 }
 

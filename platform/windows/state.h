@@ -1,10 +1,7 @@
 // What stands behind the windows and controls of the program.
 #pragma once
 
-// clang-format off
 #include <windows.h>
-#include <commctrl.h>
-// clang-format on
 
 #include <functional>
 #include <string>
@@ -44,7 +41,7 @@ struct ControlState {
   bool NamedByToolTip = false;  // the native text is the tool tip
   bool WhiteGround = false;
   bool Framed = false;  // something lies around its client area
-  ButtonImage Image;
+  IconHandle Image;
   Picture Shown, Next;      // Next: set, and not drawn yet
   bool EnterIsKey = false;  // Enter goes to OnKey and not to the window
 
@@ -57,8 +54,7 @@ struct ControlState {
   std::function<void(int code)> OnNotification;       // the high word of WM_COMMAND
   std::function<bool(int key, bool repeated)> OnKey;  // WM_KEYDOWN; true: that was all
   std::function<void(const DRAWITEMSTRUCT&)> Draw;
-  std::function<void(const NMCUSTOMDRAW&)> DrawFace;  // what a button shows in place of its text
-  std::function<void()> Remember;                     // keeps what is asked for after the window is closed
+  std::function<void()> Remember;  // keeps what is asked for after the window is closed
 };
 
 struct TimerState {

@@ -75,16 +75,6 @@ void Command(const WindowState& window, WPARAM wParam, HWND sender) {
   }
 }
 
-// A button asks before it draws its ground, and again before it draws its text.
-std::pair<bool, LRESULT> AnswerNotification(const WindowState& window, const NMHDR& notification) {
-  if (notification.code != NM_CUSTOMDRAW) return {false, 0};
-  const ControlState* control = FindControl(window, notification.hwndFrom);
-  const auto& face = reinterpret_cast<const NMCUSTOMDRAW&>(notification);
-  if (control == nullptr || !control->DrawFace || face.dwDrawStage != CDDS_PREPAINT) return {false, 0};
-  control->DrawFace(face);
-  return {true, CDRF_SKIPDEFAULT};
-}
-
 // The brush for the ground of a text, or null for the usual one.
 HBRUSH TextGround(const WindowState& window, HDC context, HWND sender) {
   const ControlState* control = FindControl(window, sender);
@@ -106,8 +96,7 @@ bool MouseAsksForToolTip(const WindowState& window) {
 
 // Any program can send any message: these, which come with a pointer, without one.
 bool LacksItsPointer(UINT message, LPARAM lParam) {
-  const bool hasOne =
-      message == WM_DRAWITEM || message == WM_NOTIFY || message == WM_DPICHANGED || message == WM_NCCREATE;
+  const bool hasOne = message == WM_DRAWITEM || message == WM_DPICHANGED || message == WM_NCCREATE;
   return hasOne && lParam == 0;
 }
 
@@ -124,8 +113,6 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
       control->Draw(item);
       return {true, TRUE};
     }
-    case WM_NOTIFY:
-      return AnswerNotification(window, *reinterpret_cast<const NMHDR*>(lParam));
     case WM_CTLCOLORSTATIC: {
       const HBRUSH ground = TextGround(window, reinterpret_cast<HDC>(wParam), reinterpret_cast<HWND>(lParam));
       return {ground != nullptr, reinterpret_cast<LRESULT>(ground)};

@@ -58,6 +58,26 @@ TEST_F(NativeWindow, IsLaidOutAgainAtAnotherResolutionAndStaysWhereItWasPut) {
   }
 }
 
+TEST_F(NativeWindow, PictureButtonGivesWindowsItsIconInTheWindowsResolutionAndKeepsItsName) {
+  const HWND box = check.State().Handle;
+  for (const int dpi : {144, 192, 96}) {
+    const RECT suggested = {};
+    ::SendMessageA(window.State().Handle, WM_DPICHANGED, static_cast<WPARAM>(MAKELONG(dpi, dpi)),
+                   reinterpret_cast<LPARAM>(&suggested));
+    ICONINFO icon = {};
+    BITMAP bitmap = {};
+    EXPECT_TRUE(::GetIconInfo(reinterpret_cast<HICON>(::SendMessageA(box, BM_GETIMAGE, IMAGE_ICON, 0)), &icon)) << dpi;
+    ::GetObjectA(icon.hbmColor, sizeof bitmap, &bitmap);
+    EXPECT_EQ(bitmap.bmWidth, 32 * dpi / 96);
+    ::DeleteObject(icon.hbmColor);
+    ::DeleteObject(icon.hbmMask);
+  }
+  EXPECT_TRUE((::GetWindowLongA(box, GWL_STYLE) & BS_ICON) != 0) << "else it would show both";
+  char name[64] = "";
+  ::GetWindowTextA(box, name, sizeof name);
+  EXPECT_STREQ(name, "Usar disquete");
+}
+
 // The frame lies over the image.
 TEST_F(NativeWindow, HasToolTipsOnceTheMouseComesToAControlWithOne) {
   const auto tips = [this](const Control& control) {
