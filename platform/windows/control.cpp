@@ -39,12 +39,6 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
     case WM_KILLFOCUS:
       EndDefault(handle);
       break;
-    case WM_ENABLE:
-      if (!control.Framed && !::IsWindowVisible(handle)) return 0;  // nothing but a reason to draw it anew
-      break;
-    case WM_NCPAINT:
-      if (!control.Framed) return 0;  // what is not there takes as long to draw as a frame
-      break;
     case WM_ERASEBKGND:
       if (control.Draw) return TRUE;  // it draws all of itself
       break;
@@ -80,9 +74,15 @@ void KeepFocus(const ControlState& control) {
   const HWND window = control.Owner->Handle;
   if (control.Owner->Focus != control.Handle || ::GetActiveWindow() != window) return;
   const HWND focus = ::GetFocus();
-  const bool usable = control.Enabled && control.Visible;
+  const bool usable = IsEnabled(control) && IsVisible(control);
   if (usable && focus == window) ::SetFocus(control.Handle);
   if (!usable && (focus == nullptr || focus == control.Handle)) ::SetFocus(window);
+}
+
+// What goes with whether the user can use the control.
+void Follow(const ControlState& control) {
+  KeepFocus(control);
+  UpdateToolTip(control);
 }
 
 Bounds PixelsOf(const ControlState& control) {
@@ -108,7 +108,6 @@ void CreateControl(ControlState& control, const Container& container, const Boun
   control.Place.Top += container.Top;
   control.Face = font;
   control.Caption = text;
-  control.Framed = native.ExtendedStyle != 0 || (native.Style & (WS_BORDER | WS_VSCROLL)) != 0;
   const DWORD group = GroupStyle(window, native.Class);
   const auto id = static_cast<std::uintptr_t>(FirstId) + window.Controls.size();
   window.Controls.push_back(&control);
@@ -131,15 +130,20 @@ void LayOutControl(ControlState& control) {
   UpdateToolTip(control);
 }
 
-void ApplyState(const ControlState& control) {
-  if (control.Handle == nullptr) return;
-  const bool enabled = ::IsWindowEnabled(control.Handle) != FALSE;
-  const bool visible = (::GetWindowLongPtrA(control.Handle, GWL_STYLE) & WS_VISIBLE) != 0;
-  if (enabled == control.Enabled && visible == control.Visible) return;
-  if (enabled != control.Enabled) ::EnableWindow(control.Handle, control.Enabled);
-  if (visible != control.Visible) ::ShowWindow(control.Handle, control.Visible ? SW_SHOWNA : SW_HIDE);
-  KeepFocus(control);
-  UpdateToolTip(control);
+bool IsEnabled(const ControlState& control) {
+  return control.Handle != nullptr ? ::IsWindowEnabled(control.Handle) != FALSE : control.LastEnabled;
+}
+
+// IsWindowVisible would ask its window, too.
+bool IsVisible(const ControlState& control) {
+  if (control.Handle == nullptr) return control.LastVisible;
+  return (::GetWindowLongPtrA(control.Handle, GWL_STYLE) & WS_VISIBLE) != 0;
+}
+
+void RememberControl(ControlState& control) {
+  control.LastEnabled = IsEnabled(control);
+  control.LastVisible = IsVisible(control);
+  if (control.Remember) control.Remember();
 }
 
 void SetNativeText(const ControlState& control, const std::string& text) {
@@ -157,24 +161,24 @@ Control::~Control() {
   if (state_->Handle != nullptr) ::DestroyWindow(state_->Handle);
 }
 
-bool Control::Enabled() const { return state_->Enabled; }
+bool Control::Enabled() const { return IsEnabled(*state_); }
 
 void Control::Enable(bool enabled) {
-  if (state_->Handle == nullptr || enabled == state_->Enabled) return;
-  state_->Enabled = enabled;
-  if (::IsWindowVisible(state_->Owner->Handle)) ApplyState(*state_);
+  if (state_->Handle == nullptr || enabled == Enabled()) return;
+  ::EnableWindow(state_->Handle, enabled);
+  Follow(*state_);
 }
 
-bool Control::Visible() const { return state_->Visible; }
+bool Control::Visible() const { return IsVisible(*state_); }
 
 void Control::Show(bool visible) {
-  if (state_->Handle == nullptr || visible == state_->Visible) return;
-  state_->Visible = visible;
-  if (::IsWindowVisible(state_->Owner->Handle)) ApplyState(*state_);
+  if (state_->Handle == nullptr || visible == Visible()) return;
+  ::ShowWindow(state_->Handle, visible ? SW_SHOWNA : SW_HIDE);
+  Follow(*state_);
 }
 
 void Control::SetFocus() {
-  if (state_->Handle == nullptr || !state_->Enabled || !state_->Visible) return;
+  if (state_->Handle == nullptr || !Enabled() || !Visible()) return;
   state_->Owner->Focus = state_->Handle;
   if (::GetActiveWindow() == state_->Owner->Handle) ::SetFocus(state_->Handle);  // else once the window is active
 }

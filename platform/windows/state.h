@@ -37,15 +37,14 @@ struct ControlState {
   Bounds Place = {};             // in the window's client area, twips
   Font Face;
   std::string Caption, ToolTip;
-  bool Enabled = true, Visible = true;
   bool NamedByToolTip = false;  // the native text is the tool tip
   bool WhiteGround = false;
-  bool Framed = false;  // something lies around its client area
   IconHandle Image;
   Picture Shown, Next;      // Next: set, and not drawn yet
   bool EnterIsKey = false;  // Enter goes to OnKey and not to the window
 
   // Once the window is closed.
+  bool LastEnabled = true, LastVisible = true;
   std::vector<std::string> LastTexts;
   int LastValue = -1;  // the selection, or the check mark
 
@@ -111,9 +110,13 @@ void CreateControl(ControlState& control, const Container& container, const Boun
 // Puts the control where its bounds say at the window's resolution, in its font.
 void LayOutControl(ControlState& control);
 
-// Makes the native control enabled and visible as its state says. Until its window is shown that can wait: each change
-// has its price, even unseen.
-void ApplyState(const ControlState& control);
+// What the native control is, and after its window is closed was: the control's own state, whether or not its window is
+// enabled and shown.
+bool IsEnabled(const ControlState& control);
+bool IsVisible(const ControlState& control);
+
+// Keeps the control's last answers, before its window is destroyed.
+void RememberControl(ControlState& control);
 
 void SetNativeText(const ControlState& control, const std::string& text);
 

@@ -54,7 +54,7 @@ void UpdateToolTip(const ControlState& control) {
   if (tips == nullptr) return;
   const bool wanted = !control.ToolTip.empty();
   Replace(tips, ControlTool(control), wanted);
-  Replace(tips, PlaceTool(control), wanted && control.Visible && !control.Enabled);
+  Replace(tips, PlaceTool(control), wanted && IsVisible(control) && !IsEnabled(control));
 }
 
 void StartToolTips(WindowState& window) {

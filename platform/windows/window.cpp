@@ -81,7 +81,6 @@ Window::~Window() {
 }
 
 void Window::Show() {
-  for (const ControlState* control : state_->Controls) ApplyState(*control);
   SetNativeCaption(*state_);
   ::ShowWindow(state_->Handle, SW_SHOWNORMAL);
   ::UpdateWindow(state_->Handle);

@@ -213,9 +213,7 @@ void PrepareToClose(WindowState& window, bool unload) {
   for (const HWND other : window.Disabled) ::EnableWindow(other, TRUE);
   ::GetWindowRect(window.Handle, &window.LastPlace);
   window.LastEnabled = ::IsWindowEnabled(window.Handle) != FALSE;
-  for (const ControlState* control : window.Controls) {
-    if (control->Remember) control->Remember();
-  }
+  for (ControlState* control : window.Controls) RememberControl(*control);
 }
 
 }  // namespace platform
