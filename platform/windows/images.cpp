@@ -1,5 +1,5 @@
 #include "platform/controls.h"
-#include "platform/windows/drawing.h"
+#include "platform/windows/pictures.h"
 #include "platform/windows/state.h"
 
 namespace platform {

@@ -1,7 +1,7 @@
 #include <algorithm>
 #include <utility>
 
-#include "platform/windows/drawing.h"
+#include "platform/windows/pictures.h"
 #include "platform/windows/state.h"
 #include "resources/ids.h"
 

@@ -1,7 +1,7 @@
 // The pixels of decoded pictures.
 #include <vector>
 
-#include "platform/windows/drawing.h"
+#include "platform/windows/pictures.h"
 #include "tests/contract/machine.h"
 #include "tests/contract/small_pictures.h"
 

@@ -1,4 +1,4 @@
-// Drawing of pictures.
+// What stands behind a picture, and drawing it.
 #pragma once
 
 #include <windows.h>
