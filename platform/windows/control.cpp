@@ -1,6 +1,9 @@
-#include <windows.h>
+#include "platform/windows/control.h"
 
-#include "platform/windows/state.h"
+#include <algorithm>
+
+#include "platform/windows/fonts.h"
+#include "platform/windows/tooltips.h"
 
 namespace platform {
 namespace {
@@ -27,7 +30,7 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
       if (!control.EnterIsKey || !IsEnter(lParam)) break;
       return ::CallWindowProcW(native, handle, message, wParam, lParam) | DLGC_WANTMESSAGE;
     case WM_KEYDOWN:
-      if (control.OnKey && control.OnKey(static_cast<int>(wParam), (HIWORD(lParam) & KF_REPEAT) != 0)) return 0;
+      if (control.OnKey(static_cast<int>(wParam), (HIWORD(lParam) & KF_REPEAT) != 0)) return 0;
       if (control.Handle == nullptr) return 0;  // the key has closed the window
       break;
     case WM_CHAR:
@@ -40,7 +43,7 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
       EndDefault(handle);
       break;
     case WM_ERASEBKGND:
-      if (control.Draw) return TRUE;  // it draws all of itself
+      if (control.DrawsItself) return TRUE;
       break;
     case WM_NCDESTROY:
       control.Handle = nullptr;
@@ -91,10 +94,9 @@ Bounds PixelsOf(const ControlState& control) {
   return {ToPixels(place.Left, dpi), ToPixels(place.Top, dpi), ToPixels(place.Width, dpi), ToPixels(place.Height, dpi)};
 }
 
-void Dress(const ControlState& control, bool redraw) {
+void SetFont(const ControlState& control, bool redraw) {
   const HFONT font = FontFor(control.Face, control.Owner->Dpi);
   ::SendMessageA(control.Handle, WM_SETFONT, reinterpret_cast<WPARAM>(font), redraw);
-  if (control.LayOut) control.LayOut();
 }
 
 }  // namespace
@@ -118,7 +120,13 @@ void CreateControl(ControlState& control, const Container& container, const Boun
                         place.Left, place.Top, place.Width, place.Height, window.Handle, reinterpret_cast<HMENU>(id),
                         ::GetModuleHandleA(nullptr), nullptr);
   TakeMessages(control);
-  Dress(control, false);
+  SetFont(control, false);
+}
+
+ControlState* FindControl(const WindowState& window, HWND handle) {
+  const auto found = std::find_if(window.Controls.begin(), window.Controls.end(),
+                                  [&](const ControlState* control) { return control->Handle == handle; });
+  return handle != nullptr && found != window.Controls.end() ? *found : nullptr;
 }
 
 void LayOutControl(ControlState& control) {
@@ -126,7 +134,8 @@ void LayOutControl(ControlState& control) {
   const Bounds place = PixelsOf(control);
   ::SetWindowPos(control.Handle, nullptr, place.Left, place.Top, place.Width, place.Height,
                  SWP_NOZORDER | SWP_NOACTIVATE);
-  Dress(control, true);
+  SetFont(control, true);
+  control.LayOut();
   UpdateToolTip(control);
 }
 
@@ -143,19 +152,13 @@ bool IsVisible(const ControlState& control) {
 void RememberControl(ControlState& control) {
   control.LastEnabled = IsEnabled(control);
   control.LastVisible = IsVisible(control);
-  if (control.Remember) control.Remember();
+  control.Remember();
 }
 
-void SetNativeText(const ControlState& control, const std::string& text) {
-  ::SetWindowTextA(control.Handle, text.c_str());
-}
-
-Control::Control() : state_(std::make_unique<ControlState>()) {}
+Control::Control() = default;  // each kind makes its own state
 
 Control::~Control() {
-  if (state_->Owner == nullptr) return;
-  state_->OnNotification = nullptr;
-  state_->Remember = nullptr;
+  if (state_ == nullptr || state_->Owner == nullptr) return;
   if (state_->Owner->Focus == state_->Handle) state_->Owner->Focus = nullptr;
   std::erase(state_->Owner->Controls, state_.get());
   if (state_->Handle != nullptr) ::DestroyWindow(state_->Handle);
@@ -188,8 +191,8 @@ std::string Control::Caption() const { return state_->Caption; }
 void Control::SetCaption(const std::string& caption) {
   if (state_->Handle == nullptr || caption == state_->Caption) return;
   state_->Caption = caption;
-  if (!state_->NamedByToolTip) SetNativeText(*state_, caption);
-  if (state_->LayOut) state_->LayOut();
+  if (!state_->NamedByToolTip) ::SetWindowTextA(state_->Handle, caption.c_str());
+  state_->LayOut();
 }
 
 std::string Control::ToolTip() const { return state_->ToolTip; }
@@ -197,7 +200,7 @@ std::string Control::ToolTip() const { return state_->ToolTip; }
 void Control::SetToolTip(const std::string& text) {
   if (state_->Handle == nullptr || text == state_->ToolTip) return;
   state_->ToolTip = text;
-  if (state_->NamedByToolTip) SetNativeText(*state_, text);
+  if (state_->NamedByToolTip) ::SetWindowTextA(state_->Handle, text.c_str());
   UpdateToolTip(*state_);
 }
 

@@ -6,8 +6,9 @@
 #include <algorithm>
 
 #include "platform/messages.h"
-#include "platform/windows/state.h"
+#include "platform/windows/events.h"
 #include "platform/windows/system_library.h"
+#include "platform/windows/window.h"
 
 namespace platform {
 namespace {

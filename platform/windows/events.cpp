@@ -1,9 +1,9 @@
 #include "platform/events.h"
 
-#include <algorithm>
 #include <utility>
 
-#include "platform/windows/state.h"
+#include "platform/windows/events.h"
+#include "platform/windows/window.h"
 
 namespace platform {
 namespace {
@@ -23,27 +23,6 @@ void DrawWindows() {
 bool MainWindowIsOpen() { return !AllWindows().empty() && AllWindows().front()->Handle != nullptr; }
 
 }  // namespace
-
-std::vector<WindowState*>& AllWindows() {
-  static std::vector<WindowState*> windows;
-  return windows;
-}
-
-WindowState* FindWindowState(HWND handle) {
-  const auto found = std::find_if(AllWindows().begin(), AllWindows().end(),
-                                  [&](const WindowState* window) { return window->Handle == handle; });
-  return handle != nullptr && found != AllWindows().end() ? *found : nullptr;
-}
-
-HWND OwnerForModal() {
-  const HWND active = ::GetActiveWindow();
-  if (FindWindowState(active) != nullptr && ::IsWindowVisible(active)) return active;
-  HWND owner = nullptr;
-  for (const WindowState* window : AllWindows()) {
-    if (::IsWindowVisible(window->Handle) && ::IsWindowEnabled(window->Handle)) owner = window->Handle;
-  }
-  return owner;
-}
 
 void HandleEvent(MSG& event) {
   const HWND root = event.hwnd != nullptr ? ::GetAncestor(event.hwnd, GA_ROOT) : nullptr;
@@ -78,23 +57,6 @@ void RunEventLoop() {
   const OwnEventLoop loop;
   MSG event;
   while (MainWindowIsOpen() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);
-}
-
-void Window::ShowModal() {
-  if (state_->Handle == nullptr) return;
-  const HWND owner = OwnerForModal();
-  ::SetWindowLongPtrA(state_->Handle, GWLP_HWNDPARENT, reinterpret_cast<LONG_PTR>(owner));
-  for (const WindowState* other : AllWindows()) {
-    if (other == state_.get() || !::IsWindowVisible(other->Handle) || !::IsWindowEnabled(other->Handle)) continue;
-    ::EnableWindow(other->Handle, FALSE);
-    state_->Disabled.push_back(other->Handle);
-  }
-  const OwnEventLoop loop;
-  Show();
-  MSG event;
-  while (!IsClosed() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);
-  Close();
-  if (::IsWindowEnabled(owner)) ::SetActiveWindow(owner);
 }
 
 void Sleep(std::uint32_t milliseconds) { ::Sleep(milliseconds); }

@@ -1,9 +1,11 @@
+#include <windows.h>
+
 #include <algorithm>
 #include <vector>
 
-#include "platform/controls.h"
+#include "platform/windows/control.h"
+#include "platform/windows/events.h"
 #include "platform/windows/order.h"
-#include "platform/windows/state.h"
 #include "platform/windows/wide.h"
 
 namespace platform {
@@ -49,25 +51,37 @@ std::vector<const std::string*> AsListed(const std::vector<std::string>& texts, 
   return ordered;
 }
 
+struct ListBoxState : ControlState {
+  explicit ListBoxState(const ListBox& object) : Object(object) { EnterIsKey = true; }
+
+  void OnNotification(int code) override {
+    if (code == LBN_SELCHANGE) Raise(Object.OnClick);
+    if (code == LBN_DBLCLK) Raise(Object.OnDoubleClick);
+  }
+
+  bool OnKey(int key, bool repeated) override {
+    if (!repeated) Raise(Object.OnKeyDown, key);
+    return false;
+  }
+
+  void Remember() override {
+    LastSelected = Object.Selected();
+    for (int i = 0, count = Object.Count(); i < count; ++i) LastTexts.push_back(Object.Text(i));
+  }
+
+  const ListBox& Object;
+  std::vector<std::string> LastTexts;  // once the window is closed
+  int LastSelected = -1;
+};
+
+const ListBoxState& StateOf(const ListBox& list) { return static_cast<const ListBoxState&>(list.State()); }
+
 }  // namespace
 
 ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) {
   const DWORD sorted = order == Order::Sorted ? LBS_SORT : 0;
-  CreateControl(*state_, container, bounds,
+  CreateControl(MakeState<ListBoxState>(state_, *this), container, bounds,
                 {"LISTBOX", WS_TABSTOP | WS_VSCROLL | LBS_NOTIFY | LBS_NOINTEGRALHEIGHT | sorted, WS_EX_CLIENTEDGE});
-  state_->EnterIsKey = true;
-  state_->OnNotification = [this](int code) {
-    if (code == LBN_SELCHANGE) Raise(OnClick);
-    if (code == LBN_DBLCLK) Raise(OnDoubleClick);
-  };
-  state_->OnKey = [this](int key, bool repeated) {
-    if (!repeated) Raise(OnKeyDown, key);
-    return false;
-  };
-  state_->Remember = [this] {
-    state_->LastValue = Selected();
-    for (int i = 0, count = Count(); i < count; ++i) state_->LastTexts.push_back(Text(i));
-  };
 }
 
 void ListBox::Add(const std::string& text) {
@@ -94,24 +108,24 @@ void ListBox::Fill(const std::vector<std::string>& texts) {
 void ListBox::Clear() { ::SendMessageA(state_->Handle, LB_RESETCONTENT, 0, 0); }
 
 int ListBox::Count() const {
-  if (state_->Handle == nullptr) return static_cast<int>(state_->LastTexts.size());
+  if (state_->Handle == nullptr) return static_cast<int>(StateOf(*this).LastTexts.size());
   return static_cast<int>(::SendMessageA(state_->Handle, LB_GETCOUNT, 0, 0));
 }
 
 std::string ListBox::Text(int index) const {
   if (state_->Handle != nullptr) return TextOf(state_->Handle, index);
-  return index >= 0 && index < Count() ? state_->LastTexts[static_cast<std::size_t>(index)] : std::string();
+  return index >= 0 && index < Count() ? StateOf(*this).LastTexts[static_cast<std::size_t>(index)] : std::string();
 }
 
 int ListBox::Selected() const {
-  if (state_->Handle == nullptr) return state_->LastValue;
+  if (state_->Handle == nullptr) return StateOf(*this).LastSelected;
   return static_cast<int>(::SendMessageA(state_->Handle, LB_GETCURSEL, 0, 0));
 }
 
 void ListBox::Select(int index) { ::SendMessageA(state_->Handle, LB_SETCURSEL, static_cast<WPARAM>(index), 0); }
 
 int ListBox::FindExact(const std::string& text) const {
-  if (state_->Handle == nullptr) return FindExactIn(state_->LastTexts, text);
+  if (state_->Handle == nullptr) return FindExactIn(StateOf(*this).LastTexts, text);
   return static_cast<int>(::SendMessageW(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
                                          reinterpret_cast<LPARAM>(ToWide(text).c_str())));
 }

@@ -1,6 +1,7 @@
 #include "platform/messages.h"
 
-#include "platform/windows/state.h"
+#include "platform/windows/events.h"
+#include "platform/windows/window.h"
 
 namespace platform {
 namespace {

@@ -1,9 +1,7 @@
-// What depends on the screen's resolution: lengths and fonts.
+// Resolutions, and what lengths are at them.
 #pragma once
 
 #include <windows.h>
-
-#include "platform/controls.h"
 
 namespace platform {
 
@@ -19,13 +17,5 @@ inline int ToTwips(int pixels, int dpi) { return ::MulDiv(pixels, TwipsPerInch, 
 
 // What so many pixels at UsualDpi are at another resolution.
 inline int Scaled(int pixels, int dpi) { return ::MulDiv(pixels, dpi, UsualDpi); }
-
-DWORD NativeStyle(const WindowStyle& style);
-
-// Size in pixels of the whole window when its client area is as large as the style asks.
-SIZE WindowSize(const WindowStyle& style, int dpi);
-
-// The font that the controls use; it lives as long as the program.
-HFONT FontFor(const Font& font, int dpi);
 
 }  // namespace platform

@@ -1,5 +1,6 @@
-#include "platform/controls.h"
-#include "platform/windows/state.h"
+#include "platform/windows/timer.h"
+
+#include "platform/windows/events.h"
 
 namespace platform {
 namespace {
@@ -9,6 +10,14 @@ UINT_PTR IdOf(const TimerState& timer) { return reinterpret_cast<UINT_PTR>(&time
 HWND WindowOf(const TimerState& timer) { return timer.Owner != nullptr ? timer.Owner->Handle : nullptr; }
 
 }  // namespace
+
+void Tick(const WindowState& window, UINT_PTR id) {
+  for (const TimerState* timer : window.Timers) {
+    if (IdOf(*timer) != id) continue;
+    if (timer->Enabled) Raise(timer->Object.OnTick);
+    return;
+  }
+}
 
 Timer::Timer(Window& window, std::uint32_t intervalMilliseconds)
     : state_(std::make_unique<TimerState>(*this, &window.State(), intervalMilliseconds)) {

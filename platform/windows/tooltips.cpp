@@ -3,7 +3,9 @@
 #include <commctrl.h>
 // clang-format on
 
-#include "platform/windows/state.h"
+#include "platform/windows/tooltips.h"
+
+#include <algorithm>
 
 namespace platform {
 namespace {
@@ -46,6 +48,16 @@ void Replace(HWND tips, TTTOOLINFOA tool, bool wanted) {
   if (wanted) ::SendMessageA(tips, TTM_ADDTOOLA, 0, reinterpret_cast<LPARAM>(&tool));
 }
 
+// The mouse's own messages go past a control that is disabled, and a frame lies over the controls in it.
+bool MouseAsksForToolTip(const WindowState& window) {
+  POINT mouse = {};
+  ::GetCursorPos(&mouse);
+  return std::any_of(window.Controls.begin(), window.Controls.end(), [&](const ControlState* control) {
+    RECT place = {};
+    return !control->ToolTip.empty() && ::GetWindowRect(control->Handle, &place) && ::PtInRect(&place, mouse);
+  });
+}
+
 }  // namespace
 
 void UpdateToolTip(const ControlState& control) {
@@ -57,8 +69,8 @@ void UpdateToolTip(const ControlState& control) {
   Replace(tips, PlaceTool(control), wanted && IsVisible(control) && !IsEnabled(control));
 }
 
-void StartToolTips(WindowState& window) {
-  if (window.ToolTips != nullptr) return;
+void OfferToolTips(WindowState& window) {
+  if (window.ToolTips != nullptr || !MouseAsksForToolTip(window)) return;
   window.ToolTips = CreateToolTips(window.Handle);
   for (const ControlState* control : window.Controls) UpdateToolTip(*control);
 }

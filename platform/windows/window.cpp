@@ -1,18 +1,19 @@
-#include "platform/controls.h"
-#include "platform/windows/state.h"
+#include "platform/windows/window.h"
+
+#include <algorithm>
+
+#include "platform/windows/control.h"
+#include "platform/windows/events.h"
+#include "platform/windows/placement.h"
+#include "platform/windows/timer.h"
 
 namespace platform {
 namespace {
 
-// In the middle of the primary monitor.
-POINT CornerFor(const SIZE& size) {
-  return {(::GetSystemMetrics(SM_CXSCREEN) - size.cx) / 2, (::GetSystemMetrics(SM_CYSCREEN) - size.cy) / 2};
-}
-
 void Create(WindowState& window) {
   window.Dpi = DpiOfScreen();
   const SIZE size = WindowSize(window.Style, window.Dpi);
-  const POINT corner = CornerFor(size);
+  const POINT corner = CentredCorner(size);
   ::CreateWindowExA(0, WindowClass, window.Style.Caption.c_str(), NativeStyle(window.Style), corner.x, corner.y,
                     size.cx, size.cy, nullptr, nullptr, ::GetModuleHandleA(nullptr), &window);
 }
@@ -20,27 +21,8 @@ void Create(WindowState& window) {
 // The monitor may have another resolution than the screen as a whole.
 void FitToMonitor(WindowState& window) {
   window.Dpi = DpiOfWindow(window.Handle);
-  const POINT corner = CornerFor(WindowSize(window.Style, window.Dpi));
+  const POINT corner = CentredCorner(WindowSize(window.Style, window.Dpi));
   PlaceWindow(window, corner.x, corner.y);
-}
-
-// Where the window is in screen pixels; of a minimized window, where it will be again.
-RECT PlaceOf(const WindowState& window) {
-  if (window.Handle == nullptr) return window.LastPlace;
-  RECT place = {};
-  if (!::IsIconic(window.Handle)) {
-    ::GetWindowRect(window.Handle, &place);
-    return place;
-  }
-  WINDOWPLACEMENT placement{};
-  placement.length = sizeof placement;
-  ::GetWindowPlacement(window.Handle, &placement);
-  place = placement.rcNormalPosition;  // relative to the work area
-  MONITORINFO monitor{};
-  monitor.cbSize = sizeof monitor;
-  ::GetMonitorInfoA(::MonitorFromRect(&place, MONITOR_DEFAULTTONEAREST), &monitor);
-  ::OffsetRect(&place, monitor.rcWork.left - monitor.rcMonitor.left, monitor.rcWork.top - monitor.rcMonitor.top);
-  return place;
 }
 
 // Nothing when it is that already: it would be drawn anew.
@@ -51,13 +33,51 @@ void SetNativeCaption(const WindowState& window) {
   if (shown != caption) ::SetWindowTextA(window.Handle, caption.c_str());
 }
 
-void MoveTo(const WindowState& window, int left, int top) {
-  const RECT place = PlaceOf(window);
-  if (place.left == left && place.top == top) return;
-  ::SetWindowPos(window.Handle, nullptr, left, top, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
+void ChangeIcon(IconHandle& icon, const WindowState& window, WPARAM size, int side) {
+  IconHandle next = LoadProgramIcon(side, window.Dpi);
+  ::SendMessageA(window.Handle, WM_SETICON, size, reinterpret_cast<LPARAM>(next.get()));
+  icon.swap(next);
 }
 
 }  // namespace
+
+std::vector<WindowState*>& AllWindows() {
+  static std::vector<WindowState*> windows;
+  return windows;
+}
+
+WindowState* FindWindowState(HWND handle) {
+  const auto found = std::find_if(AllWindows().begin(), AllWindows().end(),
+                                  [&](const WindowState* window) { return window->Handle == handle; });
+  return handle != nullptr && found != AllWindows().end() ? *found : nullptr;
+}
+
+HWND OwnerForModal() {
+  const HWND active = ::GetActiveWindow();
+  if (FindWindowState(active) != nullptr && ::IsWindowVisible(active)) return active;
+  HWND owner = nullptr;
+  for (const WindowState* window : AllWindows()) {
+    if (::IsWindowVisible(window->Handle) && ::IsWindowEnabled(window->Handle)) owner = window->Handle;
+  }
+  return owner;
+}
+
+void LayOutWindow(WindowState& window) {
+  ChangeIcon(window.LargeIcon, window, ICON_BIG, LargeIconSide);
+  ChangeIcon(window.SmallIcon, window, ICON_SMALL, SmallIconSide);
+  for (ControlState* control : window.Controls) LayOutControl(*control);
+  ::InvalidateRect(window.Handle, nullptr, TRUE);
+}
+
+void PrepareToClose(WindowState& window, bool unload) {
+  if (window.Closing) return;
+  window.Closing = true;
+  if (unload) Raise(window.Object.OnUnload);
+  for (const HWND other : window.Disabled) ::EnableWindow(other, TRUE);
+  ::GetWindowRect(window.Handle, &window.LastPlace);
+  window.LastEnabled = ::IsWindowEnabled(window.Handle) != FALSE;
+  for (ControlState* control : window.Controls) RememberControl(*control);
+}
 
 Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(*this, style)) {
   RegisterWindowClass();
@@ -84,6 +104,23 @@ void Window::Show() {
   SetNativeCaption(*state_);
   ::ShowWindow(state_->Handle, SW_SHOWNORMAL);
   ::UpdateWindow(state_->Handle);
+}
+
+void Window::ShowModal() {
+  if (state_->Handle == nullptr) return;
+  const HWND owner = OwnerForModal();
+  ::SetWindowLongPtrA(state_->Handle, GWLP_HWNDPARENT, reinterpret_cast<LONG_PTR>(owner));
+  for (const WindowState* other : AllWindows()) {
+    if (other == state_.get() || !::IsWindowVisible(other->Handle) || !::IsWindowEnabled(other->Handle)) continue;
+    ::EnableWindow(other->Handle, FALSE);
+    state_->Disabled.push_back(other->Handle);
+  }
+  const OwnEventLoop loop;
+  Show();
+  MSG event;
+  while (!IsClosed() && ::GetMessageA(&event, nullptr, 0, 0) > 0) HandleEvent(event);
+  Close();
+  if (::IsWindowEnabled(owner)) ::SetActiveWindow(owner);
 }
 
 void Window::Close() {
@@ -116,9 +153,9 @@ int Window::Height() const {
   return ToTwips(place.bottom - place.top, DpiOfScreen());
 }
 
-void Window::SetLeft(int left) { MoveTo(*state_, ToPixels(left, DpiOfScreen()), PlaceOf(*state_).top); }
+void Window::SetLeft(int left) { MoveWindowTo(*state_, ToPixels(left, DpiOfScreen()), PlaceOf(*state_).top); }
 
-void Window::SetTop(int top) { MoveTo(*state_, PlaceOf(*state_).left, ToPixels(top, DpiOfScreen())); }
+void Window::SetTop(int top) { MoveWindowTo(*state_, PlaceOf(*state_).left, ToPixels(top, DpiOfScreen())); }
 
 bool Window::Enabled() const {
   return state_->Handle != nullptr ? ::IsWindowEnabled(state_->Handle) != FALSE : state_->LastEnabled;

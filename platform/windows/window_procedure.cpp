@@ -1,20 +1,14 @@
-#include <algorithm>
 #include <utility>
 
+#include "platform/windows/control.h"
 #include "platform/windows/pictures.h"
-#include "platform/windows/state.h"
-#include "resources/ids.h"
+#include "platform/windows/placement.h"
+#include "platform/windows/timer.h"
+#include "platform/windows/tooltips.h"
+#include "platform/windows/window.h"
 
 namespace platform {
 namespace {
-
-constexpr int LargeIconSide = 32, SmallIconSide = 16;
-
-ControlState* FindControl(const WindowState& window, HWND handle) {
-  const auto found = std::find_if(window.Controls.begin(), window.Controls.end(),
-                                  [&](const ControlState* control) { return control->Handle == handle; });
-  return handle != nullptr && found != window.Controls.end() ? *found : nullptr;
-}
 
 // Also draws what lies behind a control, on the control's own context, which is left as it was.
 void EraseBackground(const WindowState& window, HDC context) {
@@ -43,14 +37,6 @@ bool PassFocusOn(const WindowState& window) {
 // Whether the window has become the active one, and stands on the screen.
 bool Activated(WPARAM wParam) { return LOWORD(wParam) != WA_INACTIVE && HIWORD(wParam) == 0; }
 
-IconHandle ProgramIcon(int side, int dpi) { return LoadIconFor(ICONE_PROGRAMA, Scaled(side, dpi)); }
-
-void ChangeIcon(IconHandle& icon, const WindowState& window, WPARAM size, int side) {
-  IconHandle next = ProgramIcon(side, window.Dpi);
-  ::SendMessageA(window.Handle, WM_SETICON, size, reinterpret_cast<LPARAM>(next.get()));
-  icon.swap(next);
-}
-
 void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
   if (dpi == 0) return;
   window.Dpi = dpi;
@@ -58,40 +44,12 @@ void ChangeDpi(WindowState& window, int dpi, const RECT& suggested) {
   LayOutWindow(window);
 }
 
-void Tick(const WindowState& window, UINT_PTR id) {
-  for (const TimerState* timer : window.Timers) {
-    if (reinterpret_cast<UINT_PTR>(timer) != id) continue;
-    if (timer->Enabled) Raise(timer->Object.OnTick);
-    return;
-  }
-}
-
 void Command(const WindowState& window, WPARAM wParam, HWND sender) {
-  const ControlState* control = FindControl(window, sender);
-  if (control != nullptr && control->OnNotification) {
+  if (ControlState* const control = FindControl(window, sender)) {
     control->OnNotification(HIWORD(wParam));
   } else if (LOWORD(wParam) == IDCANCEL && window.Style.CloseOnEscape) {
     ::SendMessageA(window.Handle, WM_CLOSE, 0, 0);
   }
-}
-
-// The brush for the ground of a text, or null for the usual one.
-HBRUSH TextGround(const WindowState& window, HDC context, HWND sender) {
-  const ControlState* control = FindControl(window, sender);
-  if (control == nullptr || !control->WhiteGround) return nullptr;
-  ::SetBkColor(context, RGB(255, 255, 255));
-  ::SetTextColor(context, RGB(0, 0, 0));
-  return static_cast<HBRUSH>(::GetStockObject(WHITE_BRUSH));
-}
-
-// The mouse's own messages go past a control that is disabled, and a frame lies over the controls in it.
-bool MouseAsksForToolTip(const WindowState& window) {
-  POINT mouse = {};
-  ::GetCursorPos(&mouse);
-  return std::any_of(window.Controls.begin(), window.Controls.end(), [&](const ControlState* control) {
-    RECT place = {};
-    return !control->ToolTip.empty() && ::GetWindowRect(control->Handle, &place) && ::PtInRect(&place, mouse);
-  });
 }
 
 // Any program can send any message: these, which come with a pointer, without one.
@@ -108,20 +66,20 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
       return {true, 0};
     case WM_DRAWITEM: {
       const auto& item = *reinterpret_cast<const DRAWITEMSTRUCT*>(lParam);
-      const ControlState* control = FindControl(window, item.hwndItem);
-      if (control == nullptr || !control->Draw) return {false, 0};
-      control->Draw(item);
-      return {true, TRUE};
+      ControlState* const control = FindControl(window, item.hwndItem);
+      if (control != nullptr) control->Draw(item);
+      return {control != nullptr, TRUE};
     }
     case WM_CTLCOLORSTATIC: {
-      const HBRUSH ground = TextGround(window, reinterpret_cast<HDC>(wParam), reinterpret_cast<HWND>(lParam));
+      ControlState* const control = FindControl(window, reinterpret_cast<HWND>(lParam));
+      const HBRUSH ground = control != nullptr ? control->TextGround(reinterpret_cast<HDC>(wParam)) : nullptr;
       return {ground != nullptr, reinterpret_cast<LRESULT>(ground)};
     }
     case WM_ERASEBKGND:
       EraseBackground(window, reinterpret_cast<HDC>(wParam));
       return {true, TRUE};
     case WM_SETCURSOR:  // also for its controls
-      if (window.ToolTips == nullptr && MouseAsksForToolTip(window)) StartToolTips(window);
+      OfferToolTips(window);
       return {false, 0};
     case WM_TIMER:
       Tick(window, wParam);
@@ -172,48 +130,13 @@ void RegisterWindowClass() {
     description.cbSize = sizeof description;
     description.lpfnWndProc = WindowProcedure;
     description.hInstance = ::GetModuleHandleA(nullptr);
-    description.hCursor = ::LoadCursorA(nullptr, MAKEINTRESOURCEA(32512));    // the arrow
-    description.hIcon = ProgramIcon(LargeIconSide, DpiOfScreen()).release();  // for as long as the program runs
-    description.hIconSm = ProgramIcon(SmallIconSide, DpiOfScreen()).release();
+    description.hCursor = ::LoadCursorA(nullptr, MAKEINTRESOURCEA(32512));        // the arrow
+    description.hIcon = LoadProgramIcon(LargeIconSide, DpiOfScreen()).release();  // for as long as the program runs
+    description.hIconSm = LoadProgramIcon(SmallIconSide, DpiOfScreen()).release();
     description.lpszClassName = WindowClass;
     return ::RegisterClassExA(&description);
   }();
   static_cast<void>(registered);
-}
-
-void PlaceWindow(WindowState& window, int left, int top) {
-  const SIZE size = WindowSize(window.Style, window.Dpi);
-  const RECT wanted = {left, top, left + size.cx, top + size.cy};
-  RECT place = {};
-  ::GetWindowRect(window.Handle, &place);
-  if (!::EqualRect(&place, &wanted)) {
-    ::SetWindowPos(window.Handle, nullptr, left, top, size.cx, size.cy, SWP_NOZORDER | SWP_NOACTIVATE);
-  }
-  // Not every version of Windows draws the frame in the window's own resolution.
-  RECT client = {};
-  ::GetClientRect(window.Handle, &client);
-  const int wider = ToPixels(window.Style.ClientWidth, window.Dpi) - client.right;
-  const int higher = ToPixels(window.Style.ClientHeight, window.Dpi) - client.bottom;
-  if (wider == 0 && higher == 0) return;
-  ::SetWindowPos(window.Handle, nullptr, 0, 0, size.cx + wider, size.cy + higher,
-                 SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
-}
-
-void LayOutWindow(WindowState& window) {
-  ChangeIcon(window.LargeIcon, window, ICON_BIG, LargeIconSide);
-  ChangeIcon(window.SmallIcon, window, ICON_SMALL, SmallIconSide);
-  for (ControlState* control : window.Controls) LayOutControl(*control);
-  ::InvalidateRect(window.Handle, nullptr, TRUE);
-}
-
-void PrepareToClose(WindowState& window, bool unload) {
-  if (window.Closing) return;
-  window.Closing = true;
-  if (unload) Raise(window.Object.OnUnload);
-  for (const HWND other : window.Disabled) ::EnableWindow(other, TRUE);
-  ::GetWindowRect(window.Handle, &window.LastPlace);
-  window.LastEnabled = ::IsWindowEnabled(window.Handle) != FALSE;
-  for (ControlState* control : window.Controls) RememberControl(*control);
 }
 
 }  // namespace platform

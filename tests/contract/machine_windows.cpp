@@ -3,7 +3,7 @@
 #include <cstdlib>
 #include <deque>
 
-#include "platform/windows/state.h"
+#include "platform/windows/control.h"
 #include "tests/contract/hand.h"
 
 namespace contract {

@@ -3,7 +3,7 @@
 
 #include "platform/messages.h"
 #include "platform/screen.h"
-#include "platform/windows/state.h"
+#include "platform/windows/control.h"
 #include "tests/contract/hand.h"
 #include "tests/contract/small_pictures.h"
 
