@@ -48,11 +48,11 @@ platform::WindowStyle Janela() {
 
 // A path for the screen: of a long one the middle is left out.
 std::string Abreviado(const std::string& Caminho, std::size_t Largura) {
-  constexpr std::string_view Reticencias = "...";
-  constexpr std::size_t Inicio = 20;
+  constexpr std::string_view reticencias = "...";
+  constexpr std::size_t inicio = 20;
   if (Caminho.size() <= Largura) return Caminho;
-  return Caminho.substr(0, Inicio).append(Reticencias) +
-         Caminho.substr(Caminho.size() - (Largura - Inicio - Reticencias.size()));
+  return Caminho.substr(0, inicio).append(reticencias) +
+         Caminho.substr(Caminho.size() - (Largura - inicio - reticencias.size()));
 }
 
 // Equal for two paths that lead to the same file through long and short names.
@@ -77,12 +77,12 @@ FormCfg::FormCfg()
       Command1(*this, LugarCommand1, "&Gravar"),
       Command2(*this, LugarCommand2, "&Cancelar"),
       Timer1(*this, IntervaloTimer1) {
-  int Topo = PrimeiraLinha;
-  for (const Linha& Cada : Linhas) {
-    Label3.emplace_back(Frame1, ColunaDosNomes, Topo, platform::Font{}, Label::Ground::Window);
-    Label3.back().SetCaption(platform::FromUtf8(Cada.Nome));
-    Label4.emplace_back(Frame1, ColunaDosCaminhos, Topo, platform::Font{}, Label::Ground::Window);
-    Topo += AlturaDaLinha;
+  int topo = PrimeiraLinha;
+  for (const Linha& cada : Linhas) {
+    Label3.emplace_back(Frame1, ColunaDosNomes, topo, platform::Font{}, Label::Ground::Window);
+    Label3.back().SetCaption(platform::FromUtf8(cada.Nome));
+    Label4.emplace_back(Frame1, ColunaDosCaminhos, topo, platform::Font{}, Label::Ground::Window);
+    topo += AlturaDaLinha;
   }
   Label1.SetCaption("Emuladores encontrados:");
   List1.OnClick = [this] { List1_Click(); };
@@ -97,8 +97,8 @@ FormCfg::FormCfg()
 void FormCfg::Form_Load() {
   DefinirDirPrograma();
   EscolherIdioma();
-  LerCaminhos(Registro);
-  Atuais = LerAjustes(Registro);
+  LerCaminhos(registro_);
+  atuais_ = LerAjustes(registro_);
   TraduzirControles();
   if (!ArquivoEmulador.empty()) Propor(ArquivoEmulador);
   MostrarEscolha();
@@ -106,14 +106,14 @@ void FormCfg::Form_Load() {
 }
 
 void FormCfg::TraduzirControles() {
-  const auto TraduzirTexto = [](auto& Controle) { Controle.SetCaption(Traduzir(Controle.Caption())); };
-  TraduzirTexto(static_cast<Window&>(*this));
-  TraduzirTexto(Label1);
-  TraduzirTexto(Command3);
-  TraduzirTexto(Frame1);
-  for (Label& Cada : Label3) TraduzirTexto(Cada);
-  TraduzirTexto(Command1);
-  TraduzirTexto(Command2);
+  const auto traduzirTexto = [](auto& Controle) { Controle.SetCaption(Traduzir(Controle.Caption())); };
+  traduzirTexto(static_cast<Window&>(*this));
+  traduzirTexto(Label1);
+  traduzirTexto(Command3);
+  traduzirTexto(Frame1);
+  for (Label& cada : Label3) traduzirTexto(cada);
+  traduzirTexto(Command1);
+  traduzirTexto(Command2);
 }
 
 void FormCfg::Timer1_Tick() {
@@ -125,28 +125,28 @@ void FormCfg::Timer1_Tick() {
 void FormCfg::Procurar() {
   Label2.SetCaption(Traduzir(Texto::Procurando));
   platform::RunPendingEvents();
-  Procura Busca(LugaresUsuais());
-  while (!IsClosed() && !Busca.Terminou()) {
-    for (const std::string& Emulador : Busca.Passo()) Propor(Emulador);
+  Procura busca(LugaresUsuais());
+  while (!IsClosed() && !busca.Terminou()) {
+    for (const std::string& emulador : busca.Passo()) Propor(emulador);
     platform::RunPendingEvents();
   }
-  Label2.SetCaption(Traduzir(Emuladores.empty() ? Texto::NenhumEmulador : Texto::BuscaConcluida));
+  Label2.SetCaption(Traduzir(emuladores_.empty() ? Texto::NenhumEmulador : Texto::BuscaConcluida));
 }
 
 int FormCfg::Acrescentar(const std::string& Emulador) {
-  const auto Igual = std::find_if(Emuladores.begin(), Emuladores.end(),
+  const auto igual = std::find_if(emuladores_.begin(), emuladores_.end(),
                                   [&](const std::string& Outro) { return Identidade(Outro) == Identidade(Emulador); });
-  if (Igual != Emuladores.end()) return static_cast<int>(Igual - Emuladores.begin());
-  Emuladores.push_back(Emulador);
+  if (igual != emuladores_.end()) return static_cast<int>(igual - emuladores_.begin());
+  emuladores_.push_back(Emulador);
   List1.Add(Abreviado(Emulador, LarguraNaLista));
-  return static_cast<int>(std::ssize(Emuladores)) - 1;
+  return static_cast<int>(std::ssize(emuladores_)) - 1;
 }
 
 void FormCfg::Propor(const std::string& Emulador) {
-  const int Indice = Acrescentar(Emulador);
+  const int indice = Acrescentar(Emulador);
   if (List1.Selected() != -1) return;
-  Proposto = Emulador;
-  Selecionar(Indice);
+  proposto_ = Emulador;
+  Selecionar(indice);
 }
 
 void FormCfg::Selecionar(int Indice) {
@@ -155,17 +155,17 @@ void FormCfg::Selecionar(int Indice) {
 }
 
 std::string FormCfg::Selecionado() const {
-  const int Indice = List1.Selected();
-  return Indice >= 0 && Indice < std::ssize(Emuladores) ? Emuladores[static_cast<std::size_t>(Indice)] : "";
+  const int indice = List1.Selected();
+  return indice >= 0 && indice < std::ssize(emuladores_) ? emuladores_[static_cast<std::size_t>(indice)] : "";
 }
 
-Ajustes FormCfg::AjustesEscolhidos() const { return AjustesPara(Selecionado(), Atuais, Selecionado() != Proposto); }
+Ajustes FormCfg::AjustesEscolhidos() const { return AjustesPara(Selecionado(), atuais_, Selecionado() != proposto_); }
 
 // Without an emulator there is nothing to save yet.
 void FormCfg::MostrarEscolha() {
-  const Ajustes Novos = AjustesEscolhidos();
+  const Ajustes novos = AjustesEscolhidos();
   for (std::size_t i = 0; i < Linhas.size(); ++i) {
-    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(Novos.*Linhas[i].Texto, ""), LarguraNoQuadro));
+    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(novos.*Linhas[i].Texto, ""), LarguraNoQuadro));
   }
   Command1.Enable(!Selecionado().empty());
 }
@@ -179,10 +179,10 @@ void FormCfg::List1_KeyDown(int KeyCode) {
 void FormCfg::Command2_Click() { Close(); }
 
 void FormCfg::Command3_Click() {
-  std::string Filtro = FiltroDeEmuladores();
-  const std::string Atual = Selecionado();
-  const std::string Caminho =
-      AbrirArquivo(*this, DiretorioDe(Atual), Traduzir(Texto::ProcurarEmulador), "", Filtro, platform::HideReadOnly);
-  if (Caminho.empty()) return;
-  Selecionar(Acrescentar(Caminho));
+  std::string filtro = FiltroDeEmuladores();
+  const std::string atual = Selecionado();
+  const std::string caminho =
+      AbrirArquivo(*this, DiretorioDe(atual), Traduzir(Texto::ProcurarEmulador), "", filtro, platform::HideReadOnly);
+  if (caminho.empty()) return;
+  Selecionar(Acrescentar(caminho));
 }

@@ -55,8 +55,8 @@ class FormCfg : public platform::Window {
 
   Ajustes AjustesEscolhidos() const;
 
-  cls_REG Registro;
-  Ajustes Atuais;                       // as the settings were at the start
-  std::vector<std::string> Emuladores;  // full paths, in the order of List1
-  std::string Proposto;                 // the emulator that was selected without the person
+  cls_REG registro_;
+  Ajustes atuais_;                       // as the settings were at the start
+  std::vector<std::string> emuladores_;  // full paths, in the order of List1
+  std::string proposto_;                 // the emulator that was selected without the person
 };

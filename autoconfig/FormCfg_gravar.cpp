@@ -10,9 +10,9 @@ using platform::Answer;
 // The settings come last, and of them the emulator: as long as it is not set, the program asks for this window again.
 void FormCfg::Command1_Click() {
   if (Selecionado().empty()) return;
-  const Ajustes Novos = AjustesEscolhidos();
-  if (!Conferir(Novos) || !ConfigurarFormaNova(Novos)) return;
-  if (!GravarAjustes(Registro, Novos)) {
+  const Ajustes novos = AjustesEscolhidos();
+  if (!Conferir(novos) || !ConfigurarFormaNova(novos)) return;
+  if (!GravarAjustes(registro_, novos)) {
     MostrarMensagem(Mensagem::ErroAoGravarAjustes);
     return;
   }
@@ -21,32 +21,32 @@ void FormCfg::Command1_Click() {
 
 // What is set already is taken as it is.
 bool FormCfg::Conferir(const Ajustes& Novos) const {
-  for (const NomeDeAjuste& Cada : NomesDosAjustes) {
-    const std::string& Novo = Novos.*Cada.Texto;
-    const auto Motivo = Novo == Atuais.*Cada.Texto ? std::nullopt : Impedimento(Novo);
-    if (!Motivo) continue;
-    MostrarMensagem(*Motivo, Novo);
+  for (const NomeDeAjuste& cada : NomesDosAjustes) {
+    const std::string& novo = Novos.*cada.Texto;
+    const auto motivo = novo == atuais_.*cada.Texto ? std::nullopt : Impedimento(novo);
+    if (!motivo) continue;
+    MostrarMensagem(*motivo, novo);
     return false;
   }
-  if (Novos.EmuExe == Atuais.EmuExe) return true;
+  if (Novos.EmuExe == atuais_.EmuExe) return true;
   if (!ArquivoExiste(Selecionado())) {
     MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
     return false;
   }
-  const std::string Emulador = CaminhoConfigurado(Novos.EmuExe, "");
-  if (TemBranco(Emulador)) MostrarMensagem(Mensagem::EmuladorComEspacos, Emulador);
+  const std::string emulador = CaminhoConfigurado(Novos.EmuExe, "");
+  if (TemBranco(emulador)) MostrarMensagem(Mensagem::EmuladorComEspacos, emulador);
   return true;
 }
 
 bool FormCfg::ConfigurarFormaNova(const Ajustes& Novos) const {
-  const std::string Arquivo = CaminhoConfigurado(Novos.EmuCFG, "");
-  const std::string Texto = LerArquivo(Arquivo);
-  if (!FormaNova(Texto)) return true;
-  const auto Novo = ComDiretorios(Texto, CaminhoConfigurado(Novos.RomDir, ""), CaminhoConfigurado(Novos.SaveDir, ""));
-  if (!Novo) return true;
-  const Answer Resposta = MostrarMensagem(Mensagem::ConfiguracaoMaisNova);
-  if (Resposta != Answer::Yes) return Resposta == Answer::No;
-  if (GravarArquivo(Arquivo, *Novo, 1, true) == 1) return true;
-  MostrarMensagem(Mensagem::ErroAoGravarConfiguracao, Arquivo);
+  const std::string arquivo = CaminhoConfigurado(Novos.EmuCFG, "");
+  const std::string texto = LerArquivo(arquivo);
+  if (!FormaNova(texto)) return true;
+  const auto novo = ComDiretorios(texto, CaminhoConfigurado(Novos.RomDir, ""), CaminhoConfigurado(Novos.SaveDir, ""));
+  if (!novo) return true;
+  const Answer resposta = MostrarMensagem(Mensagem::ConfiguracaoMaisNova);
+  if (resposta != Answer::Yes) return resposta == Answer::No;
+  if (GravarArquivo(arquivo, *novo, 1, true) == 1) return true;
+  MostrarMensagem(Mensagem::ErroAoGravarConfiguracao, arquivo);
   return false;
 }

@@ -17,8 +17,8 @@ constexpr std::size_t MaiorCaminho = 32768;  // of any path, its closing NUL inc
 
 // The path behind the directory, with a leading backslash; the whole path when it lies elsewhere.
 std::string RelativoA(const std::string& Diretorio, const std::string& Caminho) {
-  const std::string Inicio = Caminho.substr(0, Diretorio.size());
-  if (platform::CharUpperBuffA(Inicio) != platform::CharUpperBuffA(Diretorio)) return Caminho;
+  const std::string inicio = Caminho.substr(0, Diretorio.size());
+  if (platform::CharUpperBuffA(inicio) != platform::CharUpperBuffA(Diretorio)) return Caminho;
   return Caminho.substr(Diretorio.size() - 1);
 }
 
@@ -29,32 +29,32 @@ std::string LerTexto(const cls_REG& Registro, const char* Nome) {
 }  // namespace
 
 Ajustes LerAjustes(const cls_REG& Registro) {
-  Ajustes Lidos;
-  for (const NomeDeAjuste& Cada : NomesDosAjustes) Lidos.*Cada.Texto = LerTexto(Registro, Cada.Nome);
-  return Lidos;
+  Ajustes lidos;
+  for (const NomeDeAjuste& cada : NomesDosAjustes) lidos.*cada.Texto = LerTexto(Registro, cada.Nome);
+  return lidos;
 }
 
 bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos) {
   return std::all_of(NomesDosAjustes.begin(), NomesDosAjustes.end(), [&](const NomeDeAjuste& Cada) {
-    const std::string& Novo = Novos.*Cada.Texto;
-    if (LerTexto(Registro, Cada.Nome) == Novo) return true;
-    Registro.SetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Nome, Novo);
-    return LerTexto(Registro, Cada.Nome) == Novo;
+    const std::string& novo = Novos.*Cada.Texto;
+    if (LerTexto(Registro, Cada.Nome) == novo) return true;
+    Registro.SetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Nome, novo);
+    return LerTexto(Registro, Cada.Nome) == novo;
   });
 }
 
 Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Outro) {
-  Ajustes Novos = Atuais;
-  const auto Preencher = [](std::string& Ajuste, bool Mudar, const std::string& Texto) {
+  Ajustes novos = Atuais;
+  const auto preencher = [](std::string& Ajuste, bool Mudar, const std::string& Texto) {
     if (Mudar || Ajuste.empty()) Ajuste = Texto;
   };
-  Preencher(Novos.RomDir, false, CaminhoRelativo(DirPrograma + "Roms\\"));
-  Preencher(Novos.SaveDir, false, CaminhoRelativo(DirPrograma + "Saves\\"));
-  Preencher(Novos.ImgDir, false, CaminhoRelativo(DirPrograma + "Imgs\\"));
-  if (Emulador.empty()) return Novos;
-  Preencher(Novos.EmuExe, Outro, AjusteDoEmulador(Emulador));
-  Preencher(Novos.EmuCFG, Outro, CaminhoRelativo(ConfiguracaoDoEmulador(Emulador)));
-  return Novos;
+  preencher(novos.RomDir, false, CaminhoRelativo(DirPrograma + "Roms\\"));
+  preencher(novos.SaveDir, false, CaminhoRelativo(DirPrograma + "Saves\\"));
+  preencher(novos.ImgDir, false, CaminhoRelativo(DirPrograma + "Imgs\\"));
+  if (Emulador.empty()) return novos;
+  preencher(novos.EmuExe, Outro, AjusteDoEmulador(Emulador));
+  preencher(novos.EmuCFG, Outro, CaminhoRelativo(ConfiguracaoDoEmulador(Emulador)));
+  return novos;
 }
 
 std::string CaminhoRelativo(const std::string& Caminho) { return RelativoA(DirPrograma, Caminho); }
@@ -62,21 +62,21 @@ std::string CaminhoRelativo(const std::string& Caminho) { return RelativoA(DirPr
 // Written relative to the program's directory it would still have the blanks of that directory.
 std::string AjusteDoEmulador(const std::string& Emulador) {
   if (!TemBranco(Emulador)) return CaminhoRelativo(Emulador);
-  const auto Curto = platform::GetShortPathNameA(Emulador, MaiorCaminho);
-  if (!Curto || TemBranco(*Curto)) return CaminhoRelativo(Emulador);
-  if (TemBranco(DirPrograma)) return *Curto;
-  return RelativoA(platform::GetShortPathNameA(DirPrograma, MaiorCaminho).value_or(DirPrograma), *Curto);
+  const auto curto = platform::GetShortPathNameA(Emulador, MaiorCaminho);
+  if (!curto || TemBranco(*curto)) return CaminhoRelativo(Emulador);
+  if (TemBranco(DirPrograma)) return *curto;
+  return RelativoA(platform::GetShortPathNameA(DirPrograma, MaiorCaminho).value_or(DirPrograma), *curto);
 }
 
 bool TemBranco(const std::string& Caminho) { return Caminho.find(' ') != std::string::npos; }
 
 std::string ConfiguracaoDoEmulador(const std::string& Emulador) {
-  const std::string Diretorio = DiretorioDe(Emulador);
-  std::string ParaWindows = Diretorio + "zsnesw.cfg", ParaDos = Diretorio + "zsnes.cfg";
-  const std::string Executavel = platform::CharUpperBuffA(UltimaParte(Emulador));
-  if (Executavel.starts_with("ZSNESW")) return ParaWindows;
-  if (Executavel.starts_with("ZSNES")) return ParaDos;
-  return ArquivoExiste(ParaDos) && !ArquivoExiste(ParaWindows) ? ParaDos : ParaWindows;
+  const std::string diretorio = DiretorioDe(Emulador);
+  std::string paraWindows = diretorio + "zsnesw.cfg", paraDos = diretorio + "zsnes.cfg";
+  const std::string executavel = platform::CharUpperBuffA(UltimaParte(Emulador));
+  if (executavel.starts_with("ZSNESW")) return paraWindows;
+  if (executavel.starts_with("ZSNES")) return paraDos;
+  return ArquivoExiste(paraDos) && !ArquivoExiste(paraWindows) ? paraDos : paraWindows;
 }
 
 std::optional<Mensagem> Impedimento(const std::string& Texto) {

@@ -27,16 +27,16 @@ std::string ComBarra(std::string Diretorio) {
 
 // What stands between semicolons, without quotes and blanks around it.
 std::vector<std::string> Partes(const std::string& Texto) {
-  std::vector<std::string> Achadas;
-  for (std::size_t Inicio = 0; Inicio < Texto.size();) {
-    const std::size_t Fim = std::min(Texto.find(';', Inicio), Texto.size());
-    const auto Primeiro = Texto.find_first_not_of(" \"", Inicio);
-    if (Primeiro < Fim) {
-      Achadas.push_back(Texto.substr(Primeiro, Texto.find_last_not_of(" \"", Fim - 1) - Primeiro + 1));
+  std::vector<std::string> achadas;
+  for (std::size_t inicio = 0; inicio < Texto.size();) {
+    const std::size_t fim = std::min(Texto.find(';', inicio), Texto.size());
+    const auto primeiro = Texto.find_first_not_of(" \"", inicio);
+    if (primeiro < fim) {
+      achadas.push_back(Texto.substr(primeiro, Texto.find_last_not_of(" \"", fim - 1) - primeiro + 1));
     }
-    Inicio = Fim + 1;
+    inicio = fim + 1;
   }
-  return Achadas;
+  return achadas;
 }
 
 bool TemUm(const std::string& Nome, const std::string& Padroes) {
@@ -44,70 +44,70 @@ bool TemUm(const std::string& Nome, const std::string& Padroes) {
 }
 
 bool ComecaComUm(const std::string& Caminho, const std::vector<std::string>& Raizes) {
-  const std::string Raiz = platform::CharUpperBuffA(Caminho.substr(0, 3));
-  return std::find(Raizes.begin(), Raizes.end(), Raiz) != Raizes.end();
+  const std::string raiz = platform::CharUpperBuffA(Caminho.substr(0, 3));
+  return std::find(Raizes.begin(), Raizes.end(), raiz) != Raizes.end();
 }
 
 // Behind the root, the directories in which programs are installed.
 std::vector<std::string> PastasDeProgramas() {
-  std::vector<std::string> Pastas;
-  for (const char* Variavel : VariaveisDeProgramas) {
-    const std::string Caminho = platform::GetEnvironmentVariableA(Variavel);
-    if (Caminho.size() > 3 && Caminho.compare(1, 2, ":\\") == 0) Pastas.push_back(ComBarra(Caminho.substr(3)));
+  std::vector<std::string> pastas;
+  for (const char* variavel : VariaveisDeProgramas) {
+    const std::string caminho = platform::GetEnvironmentVariableA(variavel);
+    if (caminho.size() > 3 && caminho.compare(1, 2, ":\\") == 0) pastas.push_back(ComBarra(caminho.substr(3)));
   }
-  return Pastas;
+  return pastas;
 }
 
 }  // namespace
 
 // A directory of the PATH in a network is left out: it can take very long to answer.
 std::vector<Lugar> LugaresUsuais() {
-  std::vector<Lugar> Lugares = {{DirPrograma, NiveisDoPrograma}};
-  const std::vector<std::string> Raizes = platform::FixedDrives();
-  const std::vector<std::string> Pastas = PastasDeProgramas();
-  for (const std::string& Raiz : Raizes) {
-    for (const std::string& Pasta : Pastas) Lugares.push_back({Raiz + Pasta, NiveisDeProgramas});
-    Lugares.push_back({Raiz, NiveisDaRaiz, NomesDeEmuladores});
+  std::vector<Lugar> lugares = {{DirPrograma, NiveisDoPrograma}};
+  const std::vector<std::string> raizes = platform::FixedDrives();
+  const std::vector<std::string> pastas = PastasDeProgramas();
+  for (const std::string& raiz : raizes) {
+    for (const std::string& pasta : pastas) lugares.push_back({raiz + pasta, NiveisDeProgramas});
+    lugares.push_back({raiz, NiveisDaRaiz, NomesDeEmuladores});
   }
-  for (const std::string& Parte : Partes(platform::GetEnvironmentVariableA("PATH"))) {
-    if (ComecaComUm(Parte, Raizes)) Lugares.push_back({ComBarra(Parte), 0});
+  for (const std::string& parte : Partes(platform::GetEnvironmentVariableA("PATH"))) {
+    if (ComecaComUm(parte, raizes)) lugares.push_back({ComBarra(parte), 0});
   }
-  return Lugares;
+  return lugares;
 }
 
 Procura::Procura(std::vector<Lugar> Lugares)
-    : Faltam(std::make_move_iterator(Lugares.begin()), std::make_move_iterator(Lugares.end())) {}
+    : faltam_(std::make_move_iterator(Lugares.begin()), std::make_move_iterator(Lugares.end())) {}
 
 std::vector<std::string> Procura::Passo() {
-  if (Fila.empty()) {
-    if (Faltam.empty()) return {};
-    Fila.push_back(std::move(Faltam.front()));
-    Faltam.pop_front();
-    Resto = MaisDiretorios;
+  if (fila_.empty()) {
+    if (faltam_.empty()) return {};
+    fila_.push_back(std::move(faltam_.front()));
+    faltam_.pop_front();
+    resto_ = MaisDiretorios;
   }
-  const Lugar Atual = std::move(Fila.front());
-  Fila.pop_front();
-  const auto [Visto, Novo] = Vistos.try_emplace(platform::CharUpperBuffA(Atual.Diretorio), Atual.Niveis);
-  if (!Novo && Visto->second >= Atual.Niveis) return {};
-  Visto->second = Atual.Niveis;
-  Descer(Atual);
-  if (!Novo) return {};
-  std::vector<std::string> Achados;
-  for (const char* Executavel : Executaveis) {
-    if (ArquivoExiste(Atual.Diretorio + Executavel)) Achados.push_back(Atual.Diretorio + Executavel);
+  const Lugar atual = std::move(fila_.front());
+  fila_.pop_front();
+  const auto [visto, novo] = vistos_.try_emplace(platform::CharUpperBuffA(atual.Diretorio), atual.Niveis);
+  if (!novo && visto->second >= atual.Niveis) return {};
+  visto->second = atual.Niveis;
+  Descer(atual);
+  if (!novo) return {};
+  std::vector<std::string> achados;
+  for (const char* executavel : Executaveis) {
+    if (ArquivoExiste(atual.Diretorio + executavel)) achados.push_back(atual.Diretorio + executavel);
   }
-  return Achados;
+  return achados;
 }
 
 // The likeliest names first: where there are very many directories the last ones are not looked into.
 void Procura::Descer(const Lugar& Atual) {
   if (Atual.Niveis == 0) return;
-  std::vector<std::string> Nomes = platform::ListSubdirectories(Atual.Diretorio);
-  std::stable_partition(Nomes.begin(), Nomes.end(),
+  std::vector<std::string> nomes = platform::ListSubdirectories(Atual.Diretorio);
+  std::stable_partition(nomes.begin(), nomes.end(),
                         [](const std::string& Nome) { return TemUm(Nome, NomesDeEmuladores); });
-  for (const std::string& Nome : Nomes) {
-    if (!TemUm(Nome, Atual.Nomes)) continue;
-    if (Resto-- <= 0) return;
-    Fila.push_back({Atual.Diretorio + Nome + '\\', Atual.Niveis - 1});
+  for (const std::string& nome : nomes) {
+    if (!TemUm(nome, Atual.Nomes)) continue;
+    if (resto_-- <= 0) return;
+    fila_.push_back({Atual.Diretorio + nome + '\\', Atual.Niveis - 1});
   }
 }

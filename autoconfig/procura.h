@@ -24,7 +24,7 @@ class Procura {
  public:
   explicit Procura(std::vector<Lugar> Lugares);
 
-  bool Terminou() const { return Fila.empty() && Faltam.empty(); }
+  bool Terminou() const { return fila_.empty() && faltam_.empty(); }
 
   // Looks into one more directory. The full paths of the emulators in it, the one made for Windows first.
   std::vector<std::string> Passo();
@@ -32,8 +32,8 @@ class Procura {
  private:
   void Descer(const Lugar& Atual);
 
-  std::deque<Lugar> Faltam;           // places not begun
-  std::deque<Lugar> Fila;             // of the present place: directories not looked into
-  int Resto = 0;                      // how many directories the present place may still take
-  std::map<std::string, int> Vistos;  // in upper case: so many levels of it have been, or will be, looked into
+  std::deque<Lugar> faltam_;           // places not begun
+  std::deque<Lugar> fila_;             // of the present place: directories not looked into
+  int resto_ = 0;                      // how many directories the present place may still take
+  std::map<std::string, int> vistos_;  // in upper case: so many levels of it have been, or will be, looked into
 };

@@ -14,13 +14,13 @@ std::optional<std::string_view> BuscarChave(std::string_view Dados, std::string_
   return ChaveAntesDe(Dados, igual);
 }
 
-std::string_view NomeEm(std::string_view Dados, std::size_t inicio) {
-  const std::string_view resto = Dados.substr(inicio);
+std::string_view NomeEm(std::string_view Dados, std::size_t Inicio) {
+  const std::string_view resto = Dados.substr(Inicio);
   return resto.substr(0, resto.find('|'));
 }
 
-std::string_view ChaveAntesDe(std::string_view Dados, std::size_t igual) {
-  const std::size_t barra = Dados.substr(0, igual).rfind('|');
+std::string_view ChaveAntesDe(std::string_view Dados, std::size_t Igual) {
+  const std::size_t barra = Dados.substr(0, Igual).rfind('|');
   const std::size_t inicio = barra == std::string_view::npos ? 0 : barra + 1;
-  return Dados.substr(inicio, igual - inicio);
+  return Dados.substr(inicio, Igual - inicio);
 }

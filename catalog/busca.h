@@ -13,5 +13,5 @@ std::optional<std::string_view> BuscarNome(std::string_view Dados, std::string_v
 std::optional<std::string_view> BuscarChave(std::string_view Dados, std::string_view Nome);
 
 // The name that begins at a position, and the key that ends before the "=" at a position.
-std::string_view NomeEm(std::string_view Dados, std::size_t inicio);
-std::string_view ChaveAntesDe(std::string_view Dados, std::size_t igual);
+std::string_view NomeEm(std::string_view Dados, std::size_t Inicio);
+std::string_view ChaveAntesDe(std::string_view Dados, std::size_t Igual);

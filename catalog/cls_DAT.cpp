@@ -10,52 +10,52 @@ std::string CaminhoCatalogo() { return DirPrograma + "tolvaris.dat"; }
 }  // namespace
 
 void cls_DAT::AbrirLeitura(const std::string& Caminho) {
-  NumArquivo = platform::File(Caminho, platform::Access::Read);
-  Aberto = true;
+  numArquivo_ = platform::File(Caminho, platform::Access::Read);
+  aberto_ = true;
 }
 
 void cls_DAT::AbrirLeituraGravacao(const std::string& Caminho) {
-  NumArquivo = platform::File(Caminho, platform::Access::ReadWrite);
-  Aberto = true;
+  numArquivo_ = platform::File(Caminho, platform::Access::ReadWrite);
+  aberto_ = true;
 }
 
 void cls_DAT::Carregar() {
-  if (!Aberto) AbrirLeituraGravacao(CaminhoCatalogo());
+  if (!aberto_) AbrirLeituraGravacao(CaminhoCatalogo());
   Esquecer();
   Ler();
 }
 
 void cls_DAT::Carregar2() {
-  if (!Aberto) AbrirLeitura(CaminhoCatalogo());
+  if (!aberto_) AbrirLeitura(CaminhoCatalogo());
   Esquecer();
   Ler();
 }
 
 void cls_DAT::Atualizar() {
-  if (!Aberto) return Carregar();
+  if (!aberto_) return Carregar();
   Ler();
 }
 
 void cls_DAT::Fechar() {
-  Aberto = false;
+  aberto_ = false;
   Esquecer();
-  NumArquivo.Close();
+  numArquivo_.Close();
 }
 
 void cls_DAT::Esquecer() {
   indice_.reset();
-  Dados.clear();
+  dados_.clear();
 }
 
 void cls_DAT::Ler() {
-  auto lido = LerInteiro(NumArquivo);
+  auto lido = LerInteiro(numArquivo_);
   if (!lido || lido->empty()) return;
   indice_.reset();
-  Dados = std::move(*lido);
+  dados_ = std::move(*lido);
 }
 
 const Indice& cls_DAT::IndiceDosDados() const {
-  if (!indice_) indice_.emplace(Dados);
+  if (!indice_) indice_.emplace(dados_);
   return *indice_;
 }
 
@@ -72,13 +72,13 @@ std::string cls_DAT::DefineDOSName(const std::string& Nome) const {
 
 void cls_DAT::RegistrarRom(const std::string& Nome, const std::string& DOSName) {
   const std::string entrada = "|" + platform::CharUpperBuffA(DOSName) + "=" + Nome + "|";
-  if (Dados.find(entrada) != std::string::npos) return;
-  const std::int64_t fim = NumArquivo.Size();
+  if (dados_.find(entrada) != std::string::npos) return;
+  const std::int64_t fim = numArquivo_.Size();
   if (fim < 0) return;
-  if (NumArquivo.Write(fim, entrada)) {
-    NumArquivo.Flush();
+  if (numArquivo_.Write(fim, entrada)) {
+    numArquivo_.Flush();
   } else {
-    NumArquivo.SetSize(fim);  // half an entry would change the lookups of the ones that follow it
+    numArquivo_.SetSize(fim);  // half an entry would change the lookups of the ones that follow it
   }
 }
 

@@ -46,10 +46,10 @@ class cls_DAT {
   void Esquecer();
   const Indice& IndiceDosDados() const;
 
-  platform::File NumArquivo;
-  std::string Dados;                      // the file as it was last read
-  bool Aberto = false;                    // an open has been tried, whether or not it succeeded
-  mutable std::optional<Indice> indice_;  // of Dados, made at the first lookup after a load
+  platform::File numArquivo_;
+  std::string dados_;                     // the file as it was last read
+  bool aberto_ = false;                   // an open has been tried, whether or not it succeeded
+  mutable std::optional<Indice> indice_;  // of dados_, made at the first lookup after a load
 };
 
 // The program's catalogue, created on first use.

@@ -12,61 +12,61 @@ namespace {
 // beginning that builds the index has the hash of every run that it needs, however long the runs are.
 constexpr std::uint64_t Fator = 0x100000001B3;
 
-std::uint64_t Juntar(std::uint64_t hash, char caractere) {
-  return (hash + static_cast<unsigned char>(caractere) + 1) * Fator;
+std::uint64_t Juntar(std::uint64_t Hash, char Caractere) {
+  return (Hash + static_cast<unsigned char>(Caractere) + 1) * Fator;
 }
 
-std::uint64_t HashDe(std::string_view texto) {
+std::uint64_t HashDe(std::string_view Texto) {
   std::uint64_t hash = 0;
-  for (std::size_t i = texto.size(); i-- > 0;) hash = Juntar(hash, texto[i]);
+  for (std::size_t i = Texto.size(); i-- > 0;) hash = Juntar(hash, Texto[i]);
   return hash;
 }
 
 // Whether "texto" and the character "fim" stand at the position.
-bool EstaEm(std::string_view dados, std::size_t posicao, std::string_view texto, char fim) {
-  return dados.size() - posicao > texto.size() && dados[posicao + texto.size()] == fim &&
-         dados.compare(posicao, texto.size(), texto) == 0;
+bool EstaEm(std::string_view Dados, std::size_t Posicao, std::string_view Texto, char Fim) {
+  return Dados.size() - Posicao > Texto.size() && Dados[Posicao + Texto.size()] == Fim &&
+         Dados.compare(Posicao, Texto.size(), Texto) == 0;
 }
 
 // The position behind the first mark of a chain that is followed by the text and by "fim".
-std::optional<std::size_t> Achar(const CadeiasDePosicoes& cadeias, std::uint64_t hash, std::string_view dados,
-                                 std::string_view texto, char fim) {
-  for (auto elo = cadeias.Primeiro(hash); elo != CadeiasDePosicoes::Fim; elo = cadeias.Proximo(elo, hash)) {
-    const std::size_t inicio = cadeias.Posicao(elo) + 1;
-    if (EstaEm(dados, inicio, texto, fim)) return inicio;
+std::optional<std::size_t> Achar(const CadeiasDePosicoes& Cadeias, std::uint64_t Hash, std::string_view Dados,
+                                 std::string_view Texto, char Fim) {
+  for (auto elo = Cadeias.Primeiro(Hash); elo != CadeiasDePosicoes::Fim; elo = Cadeias.Proximo(elo, Hash)) {
+    const std::size_t inicio = Cadeias.Posicao(elo) + 1;
+    if (EstaEm(Dados, inicio, Texto, Fim)) return inicio;
   }
   return std::nullopt;
 }
 
-std::size_t Contar(std::string_view dados, char caractere) {
+std::size_t Contar(std::string_view Dados, char Caractere) {
   std::size_t quantos = 0;
-  for (auto i = dados.find(caractere); i != std::string_view::npos; i = dados.find(caractere, i + 1)) ++quantos;
+  for (auto i = Dados.find(Caractere); i != std::string_view::npos; i = Dados.find(Caractere, i + 1)) ++quantos;
   return quantos;
 }
 
 }  // namespace
 
-void CadeiasDePosicoes::Reservar(std::size_t capacidade) {
-  const std::size_t baldes = std::bit_ceil(std::max<std::size_t>(capacidade, 2));
+void CadeiasDePosicoes::Reservar(std::size_t Capacidade) {
+  const std::size_t baldes = std::bit_ceil(std::max<std::size_t>(Capacidade, 2));
   primeiros_.assign(baldes, Fim);
-  elos_.reserve(capacidade);
+  elos_.reserve(Capacidade);
   deslocamento_ = 64 - std::countr_zero(baldes);
 }
 
 // The upper bits of a product depend on all bits of the hash.
-std::size_t CadeiasDePosicoes::Balde(std::uint64_t hash) const {
-  return static_cast<std::size_t>((hash * 0x9E3779B97F4A7C15) >> deslocamento_);
+std::size_t CadeiasDePosicoes::Balde(std::uint64_t Hash) const {
+  return static_cast<std::size_t>((Hash * 0x9E3779B97F4A7C15) >> deslocamento_);
 }
 
-void CadeiasDePosicoes::PorNaFrente(std::uint64_t hash, std::size_t posicao) {
-  std::uint32_t& primeiro = primeiros_[Balde(hash)];
-  elos_.push_back({static_cast<std::uint32_t>(posicao), primeiro, static_cast<std::uint32_t>(hash)});
+void CadeiasDePosicoes::PorNaFrente(std::uint64_t Hash, std::size_t Posicao) {
+  std::uint32_t& primeiro = primeiros_[Balde(Hash)];
+  elos_.push_back({static_cast<std::uint32_t>(Posicao), primeiro, static_cast<std::uint32_t>(Hash)});
   primeiro = static_cast<std::uint32_t>(elos_.size() - 1);
 }
 
-std::uint32_t CadeiasDePosicoes::Avancar(std::uint32_t elo, std::uint64_t hash) const {
-  while (elo != Fim && elos_[elo].Hash != static_cast<std::uint32_t>(hash)) elo = elos_[elo].Proximo;
-  return elo;
+std::uint32_t CadeiasDePosicoes::Avancar(std::uint32_t Atual, std::uint64_t Hash) const {
+  while (Atual != Fim && elos_[Atual].Hash != static_cast<std::uint32_t>(Hash)) Atual = elos_[Atual].Proximo;
+  return Atual;
 }
 
 Indice::Indice(std::string_view Dados) : dados_(Dados) {

@@ -12,13 +12,13 @@
 // that each chain is in ascending order.
 class CadeiasDePosicoes {
  public:
-  void Reservar(std::size_t capacidade);
-  void PorNaFrente(std::uint64_t hash, std::size_t posicao);
+  void Reservar(std::size_t Capacidade);
+  void PorNaFrente(std::uint64_t Hash, std::size_t Posicao);
 
   // The first link of the hash, and the next one of the same hash behind a link; Fim: there is none.
-  std::uint32_t Primeiro(std::uint64_t hash) const { return Avancar(primeiros_[Balde(hash)], hash); }
-  std::uint32_t Proximo(std::uint32_t elo, std::uint64_t hash) const { return Avancar(elos_[elo].Proximo, hash); }
-  std::size_t Posicao(std::uint32_t elo) const { return elos_[elo].Posicao; }
+  std::uint32_t Primeiro(std::uint64_t Hash) const { return Avancar(primeiros_[Balde(Hash)], Hash); }
+  std::uint32_t Proximo(std::uint32_t Atual, std::uint64_t Hash) const { return Avancar(elos_[Atual].Proximo, Hash); }
+  std::size_t Posicao(std::uint32_t Atual) const { return elos_[Atual].Posicao; }
   static constexpr std::uint32_t Fim = 0xFFFFFFFF;
 
  private:
@@ -26,8 +26,8 @@ class CadeiasDePosicoes {
     std::uint32_t Posicao, Proximo;
     std::uint32_t Hash;  // its lower bits: links of other hashes are passed without a look at the text far away
   };
-  std::size_t Balde(std::uint64_t hash) const;
-  std::uint32_t Avancar(std::uint32_t elo, std::uint64_t hash) const;
+  std::size_t Balde(std::uint64_t Hash) const;
+  std::uint32_t Avancar(std::uint32_t Atual, std::uint64_t Hash) const;
 
   std::vector<std::uint32_t> primeiros_;
   std::vector<Elo> elos_;

@@ -21,13 +21,13 @@ platform::WindowStyle Janela() {
           .Background = FIGURA_CONTROLE};
 }
 
-Form3* aberta = nullptr;  // the window, while it is shown
+Form3* Aberta = nullptr;  // the window, while it is shown
 
 // For as long as the window itself lives, closed or never made by the platform.
 class Lembrada {
  public:
-  explicit Lembrada(Form3& janela) { aberta = &janela; }
-  ~Lembrada() { aberta = nullptr; }
+  explicit Lembrada(Form3& Janela) { Aberta = &Janela; }
+  ~Lembrada() { Aberta = nullptr; }
   Lembrada(const Lembrada&) = delete;
   Lembrada& operator=(const Lembrada&) = delete;
 };
@@ -46,7 +46,7 @@ Form3::Form3()
 }
 
 void Form3::ABRIR() {
-  if (aberta) return;
+  if (Aberta) return;
   Form3 janela;
   janela.Preparar();
   const Lembrada lembrada(janela);
@@ -54,7 +54,7 @@ void Form3::ABRIR() {
 }
 
 void Form3::Descarregar() {
-  if (aberta) aberta->Close();
+  if (Aberta) Aberta->Close();
 }
 
 void Form3::Preparar() {

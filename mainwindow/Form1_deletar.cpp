@@ -4,23 +4,23 @@
 #include "support/mod_Arquivos.h"
 
 void Form1::Command6_Click() {
-  const auto Escolhido = JogoSelecionado();
-  if (!Escolhido) return;
+  const auto escolhido = JogoSelecionado();
+  if (!escolhido) return;
   if (MostrarMensagem(Mensagem::DeletarJogo, NomeSelecionado()) != platform::Answer::Yes) {
     Ativar(true);
     return;
   }
   Desativar(false);
-  ApagarArquivo(Escolhido->Arquivo);
-  const int IndiceAntigo = List1.Selected();
+  ApagarArquivo(escolhido->Arquivo);
+  const int indiceAntigo = List1.Selected();
   CarregarLista(true);
-  SelecionarVizinho(IndiceAntigo);
+  SelecionarVizinho(indiceAntigo);
 }
 
 // The game that followed the deleted one, or the new last one; none in an empty list.
 void Form1::SelecionarVizinho(int IndiceAntigo) {
-  const int Quantos = List1.Count();
-  const int Indice = IndiceAntigo < Quantos ? IndiceAntigo : IndiceAntigo - 1 < Quantos ? IndiceAntigo - 1 : -1;
-  List1.Select(Indice);
-  if (Indice >= 0) List1_Click();
+  const int quantos = List1.Count();
+  const int indice = IndiceAntigo < quantos ? IndiceAntigo : IndiceAntigo - 1 < quantos ? IndiceAntigo - 1 : -1;
+  List1.Select(indice);
+  if (indice >= 0) List1_Click();
 }

@@ -19,15 +19,15 @@ namespace {
 
 // What an earlier run of the program has left half written.
 void ApagarRestosDeAntes() {
-  for (const std::string& Diretorio : {DirRoms, DirSaves, DirImgs, DiretorioDe(ArquivoCfgEmulador)}) {
-    ApagarRestos(Diretorio);
+  for (const std::string& diretorio : {DirRoms, DirSaves, DirImgs, DiretorioDe(ArquivoCfgEmulador)}) {
+    ApagarRestos(diretorio);
   }
 }
 
 }  // namespace
 
 bool Form1::Form_Load() {
-  for (Configuracao Estado = Configuracao::Repetir; Estado == Configuracao::Repetir;) {
+  for (Configuracao estado = Configuracao::Repetir; estado == Configuracao::Repetir;) {
     if (JogoIniciado) {
       Close();
       return false;
@@ -37,8 +37,8 @@ bool Form1::Form_Load() {
     EscolherIdioma();
     RestaurarJanela();
     LerCaminhos(Registro);
-    Estado = VerificarConfiguracao();
-    if (Estado == Configuracao::Desistir) {
+    estado = VerificarConfiguracao();
+    if (estado == Configuracao::Desistir) {
       Close();
       return false;
     }
@@ -54,11 +54,11 @@ bool Form1::Form_Load() {
 
 void Form1::RestaurarJanela() {
   Check1.SetValue(EstadoDisquete(LerTexto("Disquete")));
-  const platform::Bounds Janela = {.Width = Width(), .Height = Height()};
-  const platform::Bounds Tela = {.Width = platform::ScreenWidth(), .Height = platform::ScreenHeight()};
-  const auto [Esquerda, Topo] = CantoInicial(LerTexto("pl"), LerTexto("pt"), Janela, Tela, platform::Monitors());
-  if (Esquerda) SetLeft(*Esquerda);
-  if (Topo) SetTop(*Topo);
+  const platform::Bounds janela = {.Width = Width(), .Height = Height()};
+  const platform::Bounds tela = {.Width = platform::ScreenWidth(), .Height = platform::ScreenHeight()};
+  const auto [esquerda, topo] = CantoInicial(LerTexto("pl"), LerTexto("pt"), janela, tela, platform::Monitors());
+  if (esquerda) SetLeft(*esquerda);
+  if (topo) SetTop(*topo);
 }
 
 Form1::Configuracao Form1::VerificarConfiguracao() {
@@ -77,17 +77,17 @@ Form1::Configuracao Form1::VerificarConfiguracao() {
 
 void Form1::TraduzirControles() {
   Command1.SetCaption(Traduzir(Command1.Caption()));
-  for (platform::Control* Cada :
+  for (platform::Control* cada :
        {static_cast<platform::Control*>(&Check1), static_cast<platform::Control*>(&Command2),
         static_cast<platform::Control*>(&Command3), static_cast<platform::Control*>(&Command4),
         static_cast<platform::Control*>(&Command5), static_cast<platform::Control*>(&Command6)}) {
-    Cada->SetToolTip(Traduzir(Cada->ToolTip()));
+    cada->SetToolTip(Traduzir(cada->ToolTip()));
   }
 }
 
 void Form1::MostrarControleNaPrimeiraVez() {
-  const std::string Mostrado = LerTexto("AvisoControle");
-  if (Mostrado == "1" || Mostrado == "2") return;
+  const std::string mostrado = LerTexto("AvisoControle");
+  if (mostrado == "1" || mostrado == "2") return;
   Form3::ABRIR();
   GravarAjuste("AvisoControle", "1");
 }

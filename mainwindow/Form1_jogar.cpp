@@ -16,14 +16,14 @@ using platform::Existing;
 // Points the emulator at the program's directories. When that fails the game starts all the same, with the emulator's
 // old settings. What is there but cannot be read is left alone: only a file that is missing is made.
 void ConfigurarEmulador(const std::string& DirSavesDoJogo) {
-  platform::File Arquivo(ArquivoCfgEmulador, platform::Access::Read);
-  const auto Texto = Arquivo.IsOpen() ? LerInteiro(Arquivo) : std::nullopt;
-  const bool Existe = Arquivo.IsOpen();
-  Arquivo.Close();
-  if (Existe && !Texto) return;
-  const auto Nova = !Texto || Texto->empty() ? ConfiguracaoNova(DirSavesDoJogo, DirRoms)
-                                             : ConfiguracaoAtualizada(*Texto, DirSavesDoJogo, DirRoms);
-  if (Nova) Substituicao(ArquivoCfgEmulador, *Nova, Existe ? Existing::Replace : Existing::Keep).Concluir();
+  platform::File arquivo(ArquivoCfgEmulador, platform::Access::Read);
+  const auto texto = arquivo.IsOpen() ? LerInteiro(arquivo) : std::nullopt;
+  const bool existe = arquivo.IsOpen();
+  arquivo.Close();
+  if (existe && !texto) return;
+  const auto nova = !texto || texto->empty() ? ConfiguracaoNova(DirSavesDoJogo, DirRoms)
+                                             : ConfiguracaoAtualizada(*texto, DirSavesDoJogo, DirRoms);
+  if (nova) Substituicao(ArquivoCfgEmulador, *nova, existe ? Existing::Replace : Existing::Keep).Concluir();
 }
 
 }  // namespace
@@ -33,36 +33,36 @@ void Form1::Command1_Click() {
     List1.SetFocus();
     return;
   }
-  const std::string Nome = NomeSelecionado();
-  const auto Escolhido = JogoSelecionado();
-  if (!Escolhido) return;
+  const std::string nome = NomeSelecionado();
+  const auto escolhido = JogoSelecionado();
+  if (!escolhido) return;
   if (!ArquivoExiste(ArquivoEmulador)) {
     MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
     return;
   }
   platform::RunPendingEvents();
-  const auto DirSavesEscolhido = DirSavesDoJogo();
-  if (!DirSavesEscolhido) return;
+  const auto dirSavesEscolhido = DirSavesDoJogo();
+  if (!dirSavesEscolhido) return;
   AvisarALTF4();
-  ConfigurarEmulador(*DirSavesEscolhido);
-  GravarAjustes(Nome);
+  ConfigurarEmulador(*dirSavesEscolhido);
+  GravarAjustes(nome);
   platform::RunPendingEvents();
-  IniciarEmulador(*Escolhido);
+  IniciarEmulador(*escolhido);
   JogoIniciado = true;
 }
 
 std::optional<Jogo> Form1::JogoSelecionado() const {
-  const int Linha = List1.Selected() == -1 ? -1 : IndiceJogo(NomeSelecionado());
-  if (Linha == -1) {
+  const int linha = List1.Selected() == -1 ? -1 : IndiceJogo(NomeSelecionado());
+  if (linha == -1) {
     MostrarMensagem(Mensagem::JogoDesconhecido);
     return std::nullopt;
   }
-  const Jogo& Selecionado = Jogos[static_cast<std::size_t>(Linha)];
-  if (!ArquivoExiste(Selecionado.Arquivo)) {
+  const Jogo& selecionado = Jogos[static_cast<std::size_t>(linha)];
+  if (!ArquivoExiste(selecionado.Arquivo)) {
     MostrarMensagem(Mensagem::JogoNaoEncontrado);
     return std::nullopt;
   }
-  return Selecionado;
+  return selecionado;
 }
 
 // Where the emulator keeps the saves of this launch. Nothing when the user wanted the floppy and gave up waiting for
@@ -98,8 +98,8 @@ void Form1::GravarAjustes(const std::string& UltimoJogo) {
 
 // The command line has no quotes: the short form of the ROM's path needs none.
 void Form1::IniciarEmulador(const Jogo& Escolhido) {
-  const auto Barra = ArquivoEmulador.rfind('\\');
-  if (Barra == std::string::npos) return;
-  std::string Diretorio = ArquivoEmulador.substr(0, Barra);
-  ExecutarPrograma(ArquivoEmulador + " " + Escolhido.ArquivoCurto, 100, false, 2, Diretorio);
+  const auto barra = ArquivoEmulador.rfind('\\');
+  if (barra == std::string::npos) return;
+  std::string diretorio = ArquivoEmulador.substr(0, barra);
+  ExecutarPrograma(ArquivoEmulador + " " + Escolhido.ArquivoCurto, 100, false, 2, diretorio);
 }

@@ -18,14 +18,14 @@ constexpr char PadraoRoms[] = "*.zip;*.smc";
 constexpr int TeclaEnter = 13;
 
 void CriarDiretoriosQueFaltam() {
-  for (const std::string* Diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
-    if (!DiretorioExiste(*Diretorio)) CriarCaminho(*Diretorio);
+  for (const std::string* diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
+    if (!DiretorioExiste(*diretorio)) CriarCaminho(*diretorio);
   }
 }
 
 void Habilitar(std::initializer_list<platform::Control*> Controles, bool Habilitado) {
-  for (platform::Control* Controle : Controles) {
-    if (Controle->Enabled() != Habilitado) Controle->Enable(Habilitado);
+  for (platform::Control* controle : Controles) {
+    if (controle->Enabled() != Habilitado) controle->Enable(Habilitado);
   }
 }
 
@@ -39,14 +39,14 @@ void Form1::CarregarLista(bool IgnorarUltimo) {
   platform::RunPendingEvents();
   CriarDiretoriosQueFaltam();
   Catalogo().Atualizar();  // also for an empty list: after the downloader the catalogue is closed until here
-  const auto Arquivos = platform::ListDirectory(DirRoms, PadraoRoms);
-  if (Arquivos.empty()) {
+  const auto arquivos = platform::ListDirectory(DirRoms, PadraoRoms);
+  if (arquivos.empty()) {
     SetCaption(TituloPrograma());
     Image1.SetPicture(Picture1);
     Ativar(true);
     return;
   }
-  EncherLista(Arquivos);
+  EncherLista(arquivos);
   if (IgnorarUltimo) {
     Ativar(true);
   } else {
@@ -58,33 +58,33 @@ void Form1::CarregarLista(bool IgnorarUltimo) {
 
 // The table and the list change together: an event in between may fill both anew.
 void Form1::EncherLista(const std::vector<platform::DirectoryEntry>& Arquivos) {
-  const std::string DirCurto = CaminhoCurto(DirRoms);
-  std::vector<Jogo> Novos(Arquivos.size());
-  std::vector<std::string> Nomes;
-  Nomes.reserve(Arquivos.size());
+  const std::string dirCurto = CaminhoCurto(DirRoms);
+  std::vector<Jogo> novos(Arquivos.size());
+  std::vector<std::string> nomes;
+  nomes.reserve(Arquivos.size());
   for (std::size_t i = 0; i < Arquivos.size(); ++i) {
-    Novos[i] = LerJogo(Arquivos[i], DirCurto);
+    novos[i] = LerJogo(Arquivos[i], dirCurto);
     if (i % 10 == 0) platform::RunPendingEventsAtIntervals();
-    if (!Novos[i].Arquivo.empty()) Nomes.push_back(Novos[i].Nome);
+    if (!novos[i].Arquivo.empty()) nomes.push_back(novos[i].Nome);
   }
-  Jogos = std::move(Novos);
-  List1.Fill(Nomes);
+  Jogos = std::move(novos);
+  List1.Fill(nomes);
 }
 
 void Form1::SelecionarUltimo() {
-  const std::string Ultimo = LerTexto("LRom");
-  if (Ultimo.empty()) {
+  const std::string ultimo = LerTexto("LRom");
+  if (ultimo.empty()) {
     Ativar(true);
     return;
   }
-  SelecionarNome(Ultimo);
+  SelecionarNome(ultimo);
   Ativar(false);
 }
 
 void Form1::SelecionarNome(const std::string& Nome) {
-  const int Indice = List1.FindExact(Nome);
-  List1.Select(Indice);
-  if (Indice >= 0) List1_Click();
+  const int indice = List1.FindExact(Nome);
+  List1.Select(indice);
+  if (indice >= 0) List1_Click();
 }
 
 void Form1::Desativar(bool Total) {

@@ -5,13 +5,13 @@
 #include "support/mod_Arquivos.h"
 
 void Form1::MostrarImagem() {
-  const std::string Caminho = List1.Selected() == -1 ? std::string{} : ImagemDoJogo(NomeSelecionado());
-  if (Caminho.empty()) {
+  const std::string caminho = List1.Selected() == -1 ? std::string{} : ImagemDoJogo(NomeSelecionado());
+  if (caminho.empty()) {
     Image1.SetPicture(Picture1);
     return;
   }
   // A damaged picture leaves the one that is shown.
-  if (const platform::Picture Imagem = platform::LoadPicture(LerArquivo(Caminho, 1, -1))) Image1.SetPicture(Imagem);
+  if (const platform::Picture imagem = platform::LoadPicture(LerArquivo(caminho, 1, -1))) Image1.SetPicture(imagem);
 }
 
 std::string Form1::CaminhoImagem(int Linha) const {
@@ -20,9 +20,9 @@ std::string Form1::CaminhoImagem(int Linha) const {
 }
 
 int Form1::IndiceJogo(const std::string& Nome) const {
-  const std::string Procurado = platform::CharUpperBuffA(Nome);
+  const std::string procurado = platform::CharUpperBuffA(Nome);
   for (std::size_t i = 0; i < Jogos.size(); ++i) {
-    if (Jogos[i].Nome.size() == Procurado.size() && platform::CharUpperBuffA(Jogos[i].Nome) == Procurado) {
+    if (Jogos[i].Nome.size() == procurado.size() && platform::CharUpperBuffA(Jogos[i].Nome) == procurado) {
       return static_cast<int>(i);
     }
   }
@@ -30,8 +30,8 @@ int Form1::IndiceJogo(const std::string& Nome) const {
 }
 
 std::string Form1::CaminhoCurto(const std::string& Caminho) {
-  for (const std::size_t Tamanho : {std::size_t{4096}, std::size_t{1023}}) {
-    if (auto Curto = platform::GetShortPathNameA(Caminho, Tamanho); Curto && !Curto->empty()) return *Curto;
+  for (const std::size_t tamanho : {std::size_t{4096}, std::size_t{1023}}) {
+    if (auto curto = platform::GetShortPathNameA(Caminho, tamanho); curto && !curto->empty()) return *curto;
   }
   return Caminho;
 }

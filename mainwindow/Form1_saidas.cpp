@@ -9,26 +9,26 @@
 
 // The window stays inactive, and the catalogue closed, until the downloader enables the window by its handle.
 void Form1::Command3_Click() {
-  const std::string Downloader = DirPrograma + "tolvarisdownload.exe";
-  if (!ArquivoExiste(Downloader)) {
+  const std::string downloader = DirPrograma + "tolvarisdownload.exe";
+  if (!ArquivoExiste(downloader)) {
     MostrarMensagem(Mensagem::SemDownloader);
     return;
   }
-  const std::string Selecionado = NomeSelecionado();
+  const std::string selecionado = NomeSelecionado();
   Desativar(false);
   Enable(false);
   SetCaption("...");
   List1.Select(-1);
   Catalogo().Fechar();
-  const std::string Identificadores = std::to_string(Handle()) + "@" + std::to_string(List1.Handle());
-  std::string Diretorio = DirPrograma;
-  if (ExecutarPrograma(Downloader + " " + Identificadores, 100, false, 2, Diretorio)) {
+  const std::string identificadores = std::to_string(Handle()) + "@" + std::to_string(List1.Handle());
+  std::string diretorio = DirPrograma;
+  if (ExecutarPrograma(downloader + " " + identificadores, 100, false, 2, diretorio)) {
     Timer1.Enable(true);
     return;
   }
   Enable(true);
   CarregarLista(true);
-  SelecionarNome(Selecionado);
+  SelecionarNome(selecionado);
 }
 
 void Form1::Command2_Click() {

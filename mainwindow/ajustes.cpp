@@ -24,26 +24,26 @@ int EstadoDisquete(const std::string& Texto) { return InteiroDe(Texto) == 1 ? 1 
 
 std::optional<int> EsquerdaInicial(const std::string& Texto, int LarguraJanela, int LarguraTela) {
   if (Texto.empty()) return (LarguraTela - LarguraJanela) / 2;
-  const auto Esquerda = InteiroDe(Texto);
-  if (Esquerda && CabeNaLargura(*Esquerda, LarguraJanela, {.Width = LarguraTela})) return Esquerda;
+  const auto esquerda = InteiroDe(Texto);
+  if (esquerda && CabeNaLargura(*esquerda, LarguraJanela, {.Width = LarguraTela})) return esquerda;
   return std::nullopt;
 }
 
 std::optional<int> TopoInicial(const std::string& Texto, int AlturaJanela, int AlturaTela) {
   if (Texto.empty()) return (AlturaTela - AlturaJanela) / 2;
-  const auto Topo = InteiroDe(Texto);
-  if (Topo && CabeNaAltura(*Topo, {.Height = AlturaTela})) return Topo;
+  const auto topo = InteiroDe(Texto);
+  if (topo && CabeNaAltura(*topo, {.Height = AlturaTela})) return topo;
   return std::nullopt;
 }
 
 Canto CantoInicial(const std::string& Esquerda, const std::string& Topo, const Bounds& Janela, const Bounds& Tela,
                    const std::vector<Bounds>& Monitores) {
-  const Canto NaTela = {EsquerdaInicial(Esquerda, Janela.Width, Tela.Width),
+  const Canto naTela = {EsquerdaInicial(Esquerda, Janela.Width, Tela.Width),
                         TopoInicial(Topo, Janela.Height, Tela.Height)};
-  const Canto Salvo = {InteiroDe(Esquerda), InteiroDe(Topo)};
-  if ((NaTela.Esquerda && NaTela.Topo) || !Salvo.Esquerda || !Salvo.Topo) return NaTela;
-  const bool HaOutro = std::any_of(Monitores.begin(), Monitores.end(), [&](const Bounds& Monitor) {
-    return CabeNaLargura(*Salvo.Esquerda, Janela.Width, Monitor) && CabeNaAltura(*Salvo.Topo, Monitor);
+  const Canto salvo = {InteiroDe(Esquerda), InteiroDe(Topo)};
+  if ((naTela.Esquerda && naTela.Topo) || !salvo.Esquerda || !salvo.Topo) return naTela;
+  const bool haOutro = std::any_of(Monitores.begin(), Monitores.end(), [&](const Bounds& Monitor) {
+    return CabeNaLargura(*salvo.Esquerda, Janela.Width, Monitor) && CabeNaAltura(*salvo.Topo, Monitor);
   });
-  return HaOutro ? Salvo : NaTela;
+  return haOutro ? salvo : naTela;
 }

@@ -20,36 +20,36 @@ Entrada NovaEntrada(std::string_view Chave, std::string_view Diretorio) {
 Entrada EntradaSaves(const std::string& DirSaves) { return NovaEntrada("SaveDirectory = ", DirSaves); }
 Entrada EntradaRoms(const std::string& DirRoms) { return NovaEntrada("GameDirectory = ", DirRoms); }
 
-// Where the line that holds `posicao` ends. Files edited elsewhere may have a lone LF.
+// Where the line that holds `Posicao` ends. Files edited elsewhere may have a lone LF.
 std::size_t FimDaLinha(const std::string& Texto, std::size_t Posicao) {
-  const auto Fim = Texto.find('\n', Posicao);
-  if (Fim == std::string::npos) return Texto.size();
-  return Fim > Posicao && Texto[Fim - 1] == '\r' ? Fim - 1 : Fim;
+  const auto fim = Texto.find('\n', Posicao);
+  if (fim == std::string::npos) return Texto.size();
+  return fim > Posicao && Texto[fim - 1] == '\r' ? fim - 1 : fim;
 }
 
 // Every occurrence, from the start; in one pass, since a hostile file can hold very many.
 std::string Substituir(const std::string& Texto, const std::string& Antigo, const std::string& Novo) {
-  std::string Resultado;
-  std::size_t Posicao = 0;
-  for (auto Achado = Texto.find(Antigo); Achado != std::string::npos; Achado = Texto.find(Antigo, Posicao)) {
-    Resultado.append(Texto, Posicao, Achado - Posicao).append(Novo);
-    Posicao = Achado + Antigo.size();
+  std::string resultado;
+  std::size_t posicao = 0;
+  for (auto achado = Texto.find(Antigo); achado != std::string::npos; achado = Texto.find(Antigo, posicao)) {
+    resultado.append(Texto, posicao, achado - posicao).append(Novo);
+    posicao = achado + Antigo.size();
   }
-  return Resultado.append(Texto, Posicao);
+  return resultado.append(Texto, posicao);
 }
 
 // True when the text had to change. The last occurrence of the key is the one that the emulator reads; the blank
 // after the "=" is no part of the search.
 bool AtualizarEntrada(std::string& Texto, const Entrada& Nova) {
-  const std::string Chave = platform::CharUpperBuffA(std::string(Nova.Chave.substr(0, Nova.Chave.size() - 1)));
-  const auto Inicio = platform::CharUpperBuffA(Texto).rfind(Chave);
-  if (Inicio == std::string::npos) {
+  const std::string chave = platform::CharUpperBuffA(std::string(Nova.Chave.substr(0, Nova.Chave.size() - 1)));
+  const auto inicio = platform::CharUpperBuffA(Texto).rfind(chave);
+  if (inicio == std::string::npos) {
     Texto.append(FimDeLinha).append(Nova.Linha).append(FimDeLinha);
     return true;
   }
-  const std::string Antiga = Texto.substr(Inicio, FimDaLinha(Texto, Inicio) - Inicio);
-  if (platform::CharUpperBuffA(Antiga) == platform::CharUpperBuffA(Nova.Linha)) return false;
-  Texto = Substituir(Texto, Antiga, Nova.Linha);
+  const std::string antiga = Texto.substr(inicio, FimDaLinha(Texto, inicio) - inicio);
+  if (platform::CharUpperBuffA(antiga) == platform::CharUpperBuffA(Nova.Linha)) return false;
+  Texto = Substituir(Texto, antiga, Nova.Linha);
   return true;
 }
 
@@ -65,8 +65,8 @@ std::string ConfiguracaoNova(const std::string& DirSaves, const std::string& Dir
 
 std::optional<std::string> ConfiguracaoAtualizada(std::string Texto, const std::string& DirSaves,
                                                   const std::string& DirRoms) {
-  const bool MudouSaves = AtualizarEntrada(Texto, EntradaSaves(DirSaves));
-  const bool MudouRoms = AtualizarEntrada(Texto, EntradaRoms(DirRoms));
-  if (!MudouSaves && !MudouRoms) return std::nullopt;
+  const bool mudouSaves = AtualizarEntrada(Texto, EntradaSaves(DirSaves));
+  const bool mudouRoms = AtualizarEntrada(Texto, EntradaRoms(DirRoms));
+  if (!mudouSaves && !mudouRoms) return std::nullopt;
   return Texto;
 }

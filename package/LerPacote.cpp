@@ -21,32 +21,32 @@ struct Cabecalho {
   std::string Maiusculas;     // the same in upper case
 };
 
-std::optional<Cabecalho> AcharCabecalho(std::string_view conteudo) {
-  std::string maiusculas = platform::CharUpperBuffA(std::string(conteudo.substr(0, MaiorCabecalho)));
+std::optional<Cabecalho> AcharCabecalho(std::string_view Conteudo) {
+  std::string maiusculas = platform::CharUpperBuffA(std::string(Conteudo.substr(0, MaiorCabecalho)));
   if (!maiusculas.starts_with(Assinatura)) return std::nullopt;
   const std::size_t marcador = maiusculas.find(Marcador);
   if (marcador == std::string::npos) return std::nullopt;
   maiusculas.resize(marcador + Marcador.size());
-  return Cabecalho{conteudo.substr(0, maiusculas.size()), std::move(maiusculas)};
+  return Cabecalho{Conteudo.substr(0, maiusculas.size()), std::move(maiusculas)};
 }
 
 // From the first place where the key stands, wherever that is, to the end of its line.
-std::optional<std::string_view> AcharValor(const Cabecalho& cabecalho, std::string_view chave) {
-  const std::size_t inicio = cabecalho.Maiusculas.find(chave);
+std::optional<std::string_view> AcharValor(const Cabecalho& Onde, std::string_view Chave) {
+  const std::size_t inicio = Onde.Maiusculas.find(Chave);
   if (inicio == std::string::npos) return std::nullopt;
-  const std::size_t fim = cabecalho.Maiusculas.find("\r\n", inicio);
+  const std::size_t fim = Onde.Maiusculas.find("\r\n", inicio);
   if (fim == std::string::npos) return std::nullopt;
-  return cabecalho.Original.substr(inicio + chave.size(), fim - inicio - chave.size());
+  return Onde.Original.substr(inicio + Chave.size(), fim - inicio - Chave.size());
 }
 
 // Plain digits with blanks around them, from 1 to the largest signed 32-bit number.
-std::optional<std::int64_t> LerNumero(std::string_view texto) {
+std::optional<std::int64_t> LerNumero(std::string_view Texto) {
   constexpr std::string_view brancos = " \t";
-  const std::size_t inicio = texto.find_first_not_of(brancos);
+  const std::size_t inicio = Texto.find_first_not_of(brancos);
   if (inicio == std::string_view::npos) return std::nullopt;
-  texto = texto.substr(inicio, texto.find_last_not_of(brancos) + 1 - inicio);
+  Texto = Texto.substr(inicio, Texto.find_last_not_of(brancos) + 1 - inicio);
   std::int64_t numero = 0;
-  for (const char digito : texto) {
+  for (const char digito : Texto) {
     if (digito < '0' || digito > '9') return std::nullopt;
     numero = numero * 10 + (digito - '0');
     if (numero > std::numeric_limits<std::int32_t>::max()) return std::nullopt;
@@ -55,11 +55,11 @@ std::optional<std::int64_t> LerNumero(std::string_view texto) {
 }
 
 // The block that starts so many bytes after the end of the header (1: right after it), as far as the content goes.
-std::string_view Bloco(std::string_view conteudo, std::size_t cabecalho, std::int64_t deslocamento,
-                       std::int64_t tamanho) {
-  const std::int64_t inicio = static_cast<std::int64_t>(cabecalho) + deslocamento - 1;
-  if (inicio >= static_cast<std::int64_t>(conteudo.size())) return {};
-  return conteudo.substr(static_cast<std::size_t>(inicio), static_cast<std::size_t>(tamanho));
+std::string_view Bloco(std::string_view Conteudo, std::size_t FimCabecalho, std::int64_t Deslocamento,
+                       std::int64_t Tamanho) {
+  const std::int64_t inicio = static_cast<std::int64_t>(FimCabecalho) + Deslocamento - 1;
+  if (inicio >= static_cast<std::int64_t>(Conteudo.size())) return {};
+  return Conteudo.substr(static_cast<std::size_t>(inicio), static_cast<std::size_t>(Tamanho));
 }
 
 }  // namespace

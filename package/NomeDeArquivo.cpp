@@ -13,13 +13,13 @@ constexpr std::array<std::string_view, 8> Dispositivos = {"CON",    "PRN",     "
 // A superscript 1, 2 or 3 of the code page (B9, B2, B3) numbers a port as well.
 constexpr std::string_view NumerosDePorta = "0123456789\xB9\xB2\xB3";
 
-char Maiuscula(char letra) { return letra >= 'a' && letra <= 'z' ? static_cast<char>(letra - 'a' + 'A') : letra; }
+char Maiuscula(char Letra) { return Letra >= 'a' && Letra <= 'z' ? static_cast<char>(Letra - 'a' + 'A') : Letra; }
 
 // The part before the first dot decides, without the blanks at its end.
-bool NomeiaDispositivo(std::string_view nome) {
-  nome = nome.substr(0, nome.find('.'));
-  nome = nome.substr(0, nome.find_last_not_of(' ') + 1);
-  std::string base(nome);
+bool NomeiaDispositivo(std::string_view Nome) {
+  Nome = Nome.substr(0, Nome.find('.'));
+  Nome = Nome.substr(0, Nome.find_last_not_of(' ') + 1);
+  std::string base(Nome);
   std::ranges::transform(base, base.begin(), Maiuscula);
   if (base.size() == 4 && NumerosDePorta.find(base[3]) != std::string_view::npos) base[3] = '1';
   return std::ranges::find(Dispositivos, base) != Dispositivos.end();
@@ -28,8 +28,8 @@ bool NomeiaDispositivo(std::string_view nome) {
 }  // namespace
 
 bool NomeDeArquivo(std::string_view Nome) {
-  const auto levaFora = [](char letra) {
-    return static_cast<unsigned char>(letra) < ' ' || letra == '\\' || letra == '/' || letra == ':';
+  const auto levaFora = [](char Letra) {
+    return static_cast<unsigned char>(Letra) < ' ' || Letra == '\\' || Letra == '/' || Letra == ':';
   };
   return std::ranges::none_of(Nome, levaFora) && !NomeiaDispositivo(Nome);
 }

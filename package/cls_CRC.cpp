@@ -24,7 +24,7 @@ std::optional<std::int64_t> cls_CRC::CRC(platform::File& Filenr) {
   if (tamanho < 0 || tamanho % Cheio == 0) return std::nullopt;
   const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
   std::int64_t soma = 0;
-  Registro = CRC32::Inicial;
+  registro_ = CRC32::Inicial;
   for (std::int64_t posicao = 0; posicao < tamanho;) {
     const std::int64_t parte = std::min<std::int64_t>(sizeof pedaco->Bytes, tamanho - posicao);
     const auto quantos = static_cast<std::size_t>(parte);
@@ -39,7 +39,7 @@ std::optional<std::int64_t> cls_CRC::CRC(platform::File& Filenr) {
 std::optional<std::int64_t> cls_CRC::CRC(std::string_view Conteudo) {
   if (Conteudo.size() % Cheio == 0) return std::nullopt;
   std::int64_t soma = 0;
-  Registro = CRC32::Inicial;
+  registro_ = CRC32::Inicial;
   for (std::size_t posicao = 0; posicao < Conteudo.size(); posicao += Cheio) {
     soma += Acrescentar(Conteudo.substr(posicao, Cheio));
   }
@@ -48,8 +48,8 @@ std::optional<std::int64_t> cls_CRC::CRC(std::string_view Conteudo) {
 
 // The register's value after the next bytes.
 std::int32_t cls_CRC::Acrescentar(std::string_view Bytes) {
-  Registro = CRC32::Atualizar(Registro, Bytes);
-  return static_cast<std::int32_t>(~Registro);
+  registro_ = CRC32::Atualizar(registro_, Bytes);
+  return static_cast<std::int32_t>(~registro_);
 }
 
 std::string TextoCRC(std::int64_t Valor) { return std::to_string(Valor); }

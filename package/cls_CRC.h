@@ -21,7 +21,7 @@ class cls_CRC {
  private:
   std::int32_t Acrescentar(std::string_view Bytes);
 
-  std::uint32_t Registro = 0;  // carried from chunk to chunk
+  std::uint32_t registro_ = 0;  // carried from chunk to chunk
 };
 
 // The checksum as a package holds it: decimal digits, after a "-" when it is negative.

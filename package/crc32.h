@@ -13,21 +13,21 @@ inline constexpr std::uint32_t Inicial = 0xFFFFFFFF;
 inline constexpr std::uint32_t Polinomio = 0xEDB88320;
 
 // The register times x, modulo the polynomial.
-constexpr std::uint32_t VezesX(std::uint32_t registro) {
-  return (registro >> 1) ^ ((registro & 1) != 0 ? Polinomio : 0);
+constexpr std::uint32_t VezesX(std::uint32_t Registro) {
+  return (Registro >> 1) ^ ((Registro & 1) != 0 ? Polinomio : 0);
 }
 
 // The register after these bytes, by the fastest way that this processor knows.
-std::uint32_t Atualizar(std::uint32_t registro, std::string_view bytes);
+std::uint32_t Atualizar(std::uint32_t Registro, std::string_view Bytes);
 
 // One look-up in a table for each byte. All other ways are held against this one.
-std::uint32_t AtualizarPorByte(std::uint32_t registro, std::string_view bytes);
+std::uint32_t AtualizarPorByte(std::uint32_t Registro, std::string_view Bytes);
 
 // Eight bytes at a time, with eight tables: for every processor.
-std::uint32_t AtualizarPorFatias(std::uint32_t registro, std::string_view bytes);
+std::uint32_t AtualizarPorFatias(std::uint32_t Registro, std::string_view Bytes);
 
 // Sixty-four bytes at a time, by carry-less multiplication: only where TemMultiplicacao() says that it can run.
-std::uint32_t AtualizarPorDobras(std::uint32_t registro, std::string_view bytes);
+std::uint32_t AtualizarPorDobras(std::uint32_t Registro, std::string_view Bytes);
 bool TemMultiplicacao();
 
 }  // namespace CRC32

@@ -29,39 +29,39 @@ constexpr std::size_t Bloco = sizeof(__m128i);  // bytes
 constexpr std::size_t Volta = 4 * Bloco;        // four blocks are folded side by side, so that none waits for another
 
 // x^n modulo P as a half of a block.
-constexpr std::uint64_t Potencia(int n) {
+constexpr std::uint64_t Potencia(int N) {
   std::uint32_t resto = 0x80000000;  // x^0
-  for (; n > 0; --n) resto = VezesX(resto);
+  for (; N > 0; --N) resto = VezesX(resto);
   return std::uint64_t{resto} << 32;
 }
 
-inline __m128i Ler(const char* bytes) { return _mm_loadu_si128(reinterpret_cast<const __m128i*>(bytes)); }
+inline __m128i Ler(const char* Bytes) { return _mm_loadu_si128(reinterpret_cast<const __m128i*>(Bytes)); }
 
-// The block `seguinte` with `bloco`, which stands `Distancia` bits before it, folded into it.
+// The block `Seguinte` with `Anterior`, which stands `Distancia` bits before it, folded into it.
 template <int Distancia>
-[[gnu::target("pclmul"), gnu::always_inline]] inline __m128i Dobrar(__m128i bloco, __m128i seguinte) {
+[[gnu::target("pclmul"), gnu::always_inline]] inline __m128i Dobrar(__m128i Anterior, __m128i Seguinte) {
   constexpr auto paraPrimeira = static_cast<long long>(Potencia(Distancia + 64 - 1));
   constexpr auto paraSegunda = static_cast<long long>(Potencia(Distancia - 1));
   const __m128i fatores = _mm_set_epi64x(paraSegunda, paraPrimeira);
-  const __m128i primeira = _mm_clmulepi64_si128(bloco, fatores, 0x00);
-  const __m128i segunda = _mm_clmulepi64_si128(bloco, fatores, 0x11);
-  return _mm_xor_si128(seguinte, _mm_xor_si128(primeira, segunda));
+  const __m128i primeira = _mm_clmulepi64_si128(Anterior, fatores, 0x00);
+  const __m128i segunda = _mm_clmulepi64_si128(Anterior, fatores, 0x11);
+  return _mm_xor_si128(Seguinte, _mm_xor_si128(primeira, segunda));
 }
 
-// Folds all whole blocks into one; at least four of them. What is left in `bytes` is shorter than a block.
-[[gnu::target("pclmul")]] __m128i DobrarTudo(std::uint32_t registro, std::string_view& bytes) {
-  __m128i a = _mm_xor_si128(Ler(bytes.data()), _mm_cvtsi32_si128(static_cast<int>(registro)));
-  __m128i b = Ler(bytes.data() + Bloco);
-  __m128i c = Ler(bytes.data() + 2 * Bloco);
-  __m128i d = Ler(bytes.data() + 3 * Bloco);
-  for (bytes.remove_prefix(Volta); bytes.size() >= Volta; bytes.remove_prefix(Volta)) {
-    a = Dobrar<512>(a, Ler(bytes.data()));
-    b = Dobrar<512>(b, Ler(bytes.data() + Bloco));
-    c = Dobrar<512>(c, Ler(bytes.data() + 2 * Bloco));
-    d = Dobrar<512>(d, Ler(bytes.data() + 3 * Bloco));
+// Folds all whole blocks into one; at least four of them. What is left in `Bytes` is shorter than a block.
+[[gnu::target("pclmul")]] __m128i DobrarTudo(std::uint32_t Registro, std::string_view& Bytes) {
+  __m128i a = _mm_xor_si128(Ler(Bytes.data()), _mm_cvtsi32_si128(static_cast<int>(Registro)));
+  __m128i b = Ler(Bytes.data() + Bloco);
+  __m128i c = Ler(Bytes.data() + 2 * Bloco);
+  __m128i d = Ler(Bytes.data() + 3 * Bloco);
+  for (Bytes.remove_prefix(Volta); Bytes.size() >= Volta; Bytes.remove_prefix(Volta)) {
+    a = Dobrar<512>(a, Ler(Bytes.data()));
+    b = Dobrar<512>(b, Ler(Bytes.data() + Bloco));
+    c = Dobrar<512>(c, Ler(Bytes.data() + 2 * Bloco));
+    d = Dobrar<512>(d, Ler(Bytes.data() + 3 * Bloco));
   }
   __m128i bloco = Dobrar<128>(Dobrar<128>(Dobrar<128>(a, b), c), d);
-  for (; bytes.size() >= Bloco; bytes.remove_prefix(Bloco)) bloco = Dobrar<128>(bloco, Ler(bytes.data()));
+  for (; Bytes.size() >= Bloco; Bytes.remove_prefix(Bloco)) bloco = Dobrar<128>(bloco, Ler(Bytes.data()));
   return bloco;
 }
 
@@ -70,11 +70,11 @@ template <int Distancia>
 bool TemMultiplicacao() { return __builtin_cpu_supports("pclmul") != 0; }
 
 // The register is folded in with the first four bytes, so the block that remains goes through a register of zero.
-std::uint32_t AtualizarPorDobras(std::uint32_t registro, std::string_view bytes) {
-  if (bytes.size() < Volta) return AtualizarPorFatias(registro, bytes);
+std::uint32_t AtualizarPorDobras(std::uint32_t Registro, std::string_view Bytes) {
+  if (Bytes.size() < Volta) return AtualizarPorFatias(Registro, Bytes);
   std::array<char, Bloco> bloco{};
-  _mm_storeu_si128(reinterpret_cast<__m128i*>(bloco.data()), DobrarTudo(registro, bytes));
-  return AtualizarPorFatias(AtualizarPorFatias(0, {bloco.data(), Bloco}), bytes);
+  _mm_storeu_si128(reinterpret_cast<__m128i*>(bloco.data()), DobrarTudo(Registro, Bytes));
+  return AtualizarPorFatias(AtualizarPorFatias(0, {bloco.data(), Bloco}), Bytes);
 }
 
 }  // namespace CRC32

@@ -29,39 +29,39 @@ constexpr std::array<Tabela, Fatia> MontarTabelas() {
 constexpr std::array<Tabela, Fatia> Tabelas = MontarTabelas();
 static_assert(Tabelas[0][1] == 0x77073096 && Tabelas[0][128] == 0xEDB88320 && Tabelas[0][255] == 0x2D02EF8D);
 
-std::uint32_t ComByte(std::uint32_t registro, char byte) {
-  return (registro >> 8) ^ Tabelas[0][(registro ^ static_cast<unsigned char>(byte)) & 0xFF];
+std::uint32_t ComByte(std::uint32_t Registro, char Byte) {
+  return (Registro >> 8) ^ Tabelas[0][(Registro ^ static_cast<unsigned char>(Byte)) & 0xFF];
 }
 
-std::uint32_t QuatroBytes(const char* bytes) {
+std::uint32_t QuatroBytes(const char* Bytes) {
   std::uint32_t numero = 0;
-  for (int i = 3; i >= 0; --i) numero = numero << 8 | static_cast<unsigned char>(bytes[i]);
+  for (int i = 3; i >= 0; --i) numero = numero << 8 | static_cast<unsigned char>(Bytes[i]);
   return numero;
 }
 
-std::uint32_t QuatroTabelas(std::uint32_t numero, std::size_t ultima) {
-  return Tabelas[ultima][numero & 0xFF] ^ Tabelas[ultima - 1][numero >> 8 & 0xFF] ^
-         Tabelas[ultima - 2][numero >> 16 & 0xFF] ^ Tabelas[ultima - 3][numero >> 24];
+std::uint32_t QuatroTabelas(std::uint32_t Numero, std::size_t Ultima) {
+  return Tabelas[Ultima][Numero & 0xFF] ^ Tabelas[Ultima - 1][Numero >> 8 & 0xFF] ^
+         Tabelas[Ultima - 2][Numero >> 16 & 0xFF] ^ Tabelas[Ultima - 3][Numero >> 24];
 }
 
 }  // namespace
 
-std::uint32_t AtualizarPorByte(std::uint32_t registro, std::string_view bytes) {
-  for (const char byte : bytes) registro = ComByte(registro, byte);
-  return registro;
+std::uint32_t AtualizarPorByte(std::uint32_t Registro, std::string_view Bytes) {
+  for (const char byte : Bytes) Registro = ComByte(Registro, byte);
+  return Registro;
 }
 
-std::uint32_t AtualizarPorFatias(std::uint32_t registro, std::string_view bytes) {
-  for (; bytes.size() >= Fatia; bytes.remove_prefix(Fatia)) {
-    const std::uint32_t primeiros = registro ^ QuatroBytes(bytes.data());
-    const std::uint32_t ultimos = QuatroBytes(bytes.data() + 4);
-    registro = QuatroTabelas(primeiros, 7) ^ QuatroTabelas(ultimos, 3);
+std::uint32_t AtualizarPorFatias(std::uint32_t Registro, std::string_view Bytes) {
+  for (; Bytes.size() >= Fatia; Bytes.remove_prefix(Fatia)) {
+    const std::uint32_t primeiros = Registro ^ QuatroBytes(Bytes.data());
+    const std::uint32_t ultimos = QuatroBytes(Bytes.data() + 4);
+    Registro = QuatroTabelas(primeiros, 7) ^ QuatroTabelas(ultimos, 3);
   }
-  return AtualizarPorByte(registro, bytes);
+  return AtualizarPorByte(Registro, Bytes);
 }
 
-std::uint32_t Atualizar(std::uint32_t registro, std::string_view bytes) {
-  return TemMultiplicacao() ? AtualizarPorDobras(registro, bytes) : AtualizarPorFatias(registro, bytes);
+std::uint32_t Atualizar(std::uint32_t Registro, std::string_view Bytes) {
+  return TemMultiplicacao() ? AtualizarPorDobras(Registro, Bytes) : AtualizarPorFatias(Registro, Bytes);
 }
 
 }  // namespace CRC32

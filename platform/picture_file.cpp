@@ -83,7 +83,7 @@ std::optional<Frame> ReadGifImage(Reader& reader) {
 }
 
 std::optional<Frame> ReadGif(Reader& reader) {
-  constexpr std::uint32_t Image = 0x2C, Extension = 0x21;
+  constexpr std::uint32_t image = 0x2C, extension = 0x21;
   const std::string_view version = reader.Take(6);
   if (version != "GIF87a" && version != "GIF89a") return std::nullopt;
   Frame screen;  // some programs leave it empty
@@ -95,8 +95,8 @@ std::optional<Frame> ReadGif(Reader& reader) {
   SkipColours(reader, flags);
   while (!reader.Failed()) {
     const std::uint32_t block = reader.Byte();
-    if (block == Image) return ReadGifImage(reader);
-    if (block != Extension) break;
+    if (block == image) return ReadGifImage(reader);
+    if (block != extension) break;
     reader.Take(1);
     SkipPieces(reader);
   }
@@ -106,19 +106,19 @@ std::optional<Frame> ReadGif(Reader& reader) {
 std::int64_t Signed(std::uint32_t value) { return static_cast<std::int32_t>(value); }
 
 std::optional<Frame> ReadBmp(Reader& reader) {
-  constexpr std::uint32_t OldHeader = 12, RunLengths8 = 1, RunLengths4 = 2, MostBits = 64;
+  constexpr std::uint32_t oldHeader = 12, runLengths8 = 1, runLengths4 = 2, mostBits = 64;
   reader.Take(10);
   const std::uint32_t start = reader.Low(4);
-  const bool old = reader.Low(4) == OldHeader;
+  const bool old = reader.Low(4) == oldHeader;
   Frame frame;
   frame.Width = old ? reader.Low(2) : Signed(reader.Low(4));
   frame.Height = old ? reader.Low(2) : std::llabs(Signed(reader.Low(4)));  // below zero: rows from the top
   reader.Take(2);
   const std::uint32_t bits = reader.Low(2);
   const std::uint32_t compression = old ? 0 : reader.Low(4), stated = old ? 0 : reader.Low(4);
-  if (reader.Failed() || bits == 0 || bits > MostBits || !IsSane(frame)) return std::nullopt;
+  if (reader.Failed() || bits == 0 || bits > mostBits || !IsSane(frame)) return std::nullopt;
 
-  const bool runs = compression == RunLengths8 || compression == RunLengths4;
+  const bool runs = compression == runLengths8 || compression == runLengths4;
   const std::int64_t row = (frame.Width * bits + 7) / 8, filled = (row + 3) / 4 * 4;
   const std::int64_t length = runs ? stated : filled * frame.Height, needed = runs ? stated : length - (filled - row);
   const auto header = static_cast<std::int64_t>(reader.Position());
@@ -141,11 +141,11 @@ std::uint32_t Marker(Reader& reader) { return reader.Byte() == 0xFF ? MarkerBehi
 
 // In a scan's data an FF is part of the data before a zero, and before the markers between their pieces.
 std::uint32_t MarkerBehindScan(Reader& reader) {
-  constexpr std::uint32_t FirstRestart = 0xD0, LastRestart = 0xD7;
+  constexpr std::uint32_t firstRestart = 0xD0, lastRestart = 0xD7;
   while (!reader.Failed()) {
     reader.SkipPast('\xFF');
     const std::uint32_t marker = MarkerBehindFF(reader);
-    if (marker != 0 && (marker < FirstRestart || marker > LastRestart)) return marker;
+    if (marker != 0 && (marker < firstRestart || marker > lastRestart)) return marker;
   }
   return 0;
 }
@@ -160,18 +160,18 @@ Frame ReadFrameHeader(Reader segment) {
 
 // A decoder goes over all pixels once a scan, and a scan can be a few bytes long.
 bool ScansArePlausible(const Frame& frame, std::int64_t scans) {
-  constexpr std::int64_t MostScansOfLargest = 16;  // progressive pictures usually have about ten
-  return scans > 0 && scans * frame.Width * frame.Height <= MostScansOfLargest * MostPixels;
+  constexpr std::int64_t mostScansOfLargest = 16;  // progressive pictures usually have about ten
+  return scans > 0 && scans * frame.Width * frame.Height <= mostScansOfLargest * MostPixels;
 }
 
 // From marker to marker up to the one that ends the picture. A small picture in a segment's data is passed over.
 std::optional<Frame> ReadJpeg(Reader& reader) {
-  constexpr std::uint32_t EndOfImage = 0xD9, StartOfScan = 0xDA;
+  constexpr std::uint32_t endOfImage = 0xD9, startOfScan = 0xDA;
   Frame first;
   std::int64_t scans = 0;
   reader.Take(2);
   std::uint32_t marker = Marker(reader);
-  while (marker != 0 && marker != EndOfImage) {
+  while (marker != 0 && marker != endOfImage) {
     const std::uint32_t length = reader.High(2);
     const Reader segment(reader.Take(length < 2 ? std::string_view::npos : length - 2));
     if (IsFrameHeader(marker)) {
@@ -179,23 +179,23 @@ std::optional<Frame> ReadJpeg(Reader& reader) {
       if (!IsSane(frame)) return std::nullopt;
       if (first.Width == 0) first = frame;
     }
-    if (marker == StartOfScan) ++scans;
-    marker = marker == StartOfScan ? MarkerBehindScan(reader) : Marker(reader);
+    if (marker == startOfScan) ++scans;
+    marker = marker == startOfScan ? MarkerBehindScan(reader) : Marker(reader);
   }
-  if (marker != EndOfImage || !ScansArePlausible(first, scans)) return std::nullopt;
+  if (marker != endOfImage || !ScansArePlausible(first, scans)) return std::nullopt;
   first.Length = reader.Position();
   return first;
 }
 
 std::optional<Frame> ReadPng(Reader& reader) {
-  constexpr std::size_t Signature = 8, Checksum = 4;
+  constexpr std::size_t signature = 8, checksum = 4;
   Frame frame;
-  reader.Take(Signature);
+  reader.Take(signature);
   while (!reader.Failed()) {
     const std::uint32_t length = reader.High(4);
     const std::string_view kind = reader.Take(4);
     Reader data(reader.Take(length));
-    reader.Take(Checksum);
+    reader.Take(checksum);
     if (kind == "IHDR") {
       frame.Width = data.High(4);
       frame.Height = data.High(4);

@@ -18,9 +18,9 @@ platform::WindowStyle Janela() {
   return {.Caption = "Salvamentos dos jogos", .ClientWidth = 7680, .ClientHeight = 3825, .CloseOnEscape = true};
 }
 
-void TraduzirTitulo(auto& controle) { controle.SetCaption(Traduzir(controle.Caption())); }
+void TraduzirTitulo(auto& Controle) { Controle.SetCaption(Traduzir(Controle.Caption())); }
 
-void TraduzirDica(platform::Control& controle) { controle.SetToolTip(Traduzir(controle.ToolTip())); }
+void TraduzirDica(platform::Control& Controle) { Controle.SetToolTip(Traduzir(Controle.ToolTip())); }
 
 }  // namespace
 
@@ -34,26 +34,26 @@ Form4::Form4()
       List2(Frame2, LugarLista, platform::ListBox::Order::Sorted),
       Image2(Frame2, LugarLixeira, FIGURA_EXCLUIR, "Excluir"),
       Command2(*this, LugarCommand2, "&Fechar"),
-      Disquete{.Lado = Origem::Disquete,
-               .Diretorio = Diretorios[0],
-               .Lista = List1,
-               .Lixeira = Image1,
-               .Seta = ICONE_SETA_DIREITA,
-               .Copiar = Texto::CopiarParaComputador,
-               .JaExiste = Mensagem::SalvamentoNoDisquete,
-               .Deletar = Mensagem::DeletarDoDisquete},
-      Computador{.Lado = Origem::Computador,
-                 .Diretorio = Diretorios[1],
-                 .Lista = List2,
-                 .Lixeira = Image2,
-                 .Seta = ICONE_SETA_ESQUERDA,
-                 .Copiar = Texto::CopiarParaDisquete,
-                 .JaExiste = Mensagem::SalvamentoNoComputador,
-                 .Deletar = Mensagem::DeletarDoComputador} {
+      disquete_{.Lado = Origem::Disquete,
+                .Diretorio = Diretorios[0],
+                .Lista = List1,
+                .Lixeira = Image1,
+                .Seta = ICONE_SETA_DIREITA,
+                .Copiar = Texto::CopiarParaComputador,
+                .JaExiste = Mensagem::SalvamentoNoDisquete,
+                .Deletar = Mensagem::DeletarDoDisquete},
+      computador_{.Lado = Origem::Computador,
+                  .Diretorio = Diretorios[1],
+                  .Lista = List2,
+                  .Lixeira = Image2,
+                  .Seta = ICONE_SETA_ESQUERDA,
+                  .Copiar = Texto::CopiarParaDisquete,
+                  .JaExiste = Mensagem::SalvamentoNoComputador,
+                  .Deletar = Mensagem::DeletarDoComputador} {
   List1.OnClick = [this] { List1_Click(); };
   List2.OnClick = [this] { List2_Click(); };
-  List1.OnKeyDown = [this](int tecla) { List1_KeyDown(tecla); };
-  List2.OnKeyDown = [this](int tecla) { List2_KeyDown(tecla); };
+  List1.OnKeyDown = [this](int KeyCode) { List1_KeyDown(KeyCode); };
+  List2.OnKeyDown = [this](int KeyCode) { List2_KeyDown(KeyCode); };
   Image1.OnClick = [this] { Image1_Click(); };
   Image2.OnClick = [this] { Image2_Click(); };
   Command1.OnClick = [this] { Command1_Click(); };

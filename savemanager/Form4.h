@@ -25,8 +25,8 @@ class Form4 : public platform::Window {
   void Form_Load();
   void List1_Click();
   void List2_Click();
-  void List1_KeyDown(int tecla);
-  void List2_KeyDown(int tecla);
+  void List1_KeyDown(int KeyCode);
+  void List2_KeyDown(int KeyCode);
   void Image1_Click();
   void Image2_Click();
   void Command1_Click();
@@ -59,17 +59,17 @@ class Form4 : public platform::Window {
   };
 
   Form4();
-  const Painel& Outro(const Painel& painel) const { return painel.Lado == Origem::Disquete ? Computador : Disquete; }
-  std::string CaminhoAtual(const Painel& painel) const;
+  const Painel& Outro(const Painel& Este) const { return Este.Lado == Origem::Disquete ? computador_ : disquete_; }
+  std::string CaminhoAtual(const Painel& Este) const;
 
-  void Listar(const Painel& painel);
-  void Preencher(const Painel& painel);
-  void Escolher(const Painel& painel);
-  void Copiar(const Painel& origem, const Painel& destino);
-  void MostrarAndamento(const std::string& andamento);  // behind the title of a copy
+  void Listar(const Painel& Este);
+  void Preencher(const Painel& Este);
+  void Escolher(const Painel& Este);
+  void Copiar(const Painel& De, const Painel& Para);
+  void MostrarAndamento(const std::string& Quanto);  // behind the title of a copy
   void RecolherEscolha();
-  void Deletar(const Painel& painel);
+  void Deletar(const Painel& Este);
 
-  const Painel Disquete;
-  const Painel Computador;
+  const Painel disquete_;
+  const Painel computador_;
 };

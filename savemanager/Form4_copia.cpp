@@ -10,51 +10,51 @@
 namespace {
 
 // A missing file has length 0: its copy is tried, and fails.
-bool Cabe(const std::string& arquivo, const std::string& destino) {
-  return TamanhoArquivo(arquivo) <= EspacoLivre(destino);
+bool Cabe(const std::string& Arquivo, const std::string& Destino) {
+  return TamanhoArquivo(Arquivo) <= EspacoLivre(Destino);
 }
 
 }  // namespace
 
 void Form4::Command1_Click() {
   if (Direcao == Origem::Disquete)
-    Copiar(Disquete, Computador);
+    Copiar(disquete_, computador_);
   else if (Direcao == Origem::Computador)
-    Copiar(Computador, Disquete);
+    Copiar(computador_, disquete_);
 }
 
 // The empty text when the pane has no directory.
-std::string Form4::CaminhoAtual(const Painel& painel) const {
-  return painel.Diretorio.empty() ? "" : painel.Diretorio + ArquivoAtual;
+std::string Form4::CaminhoAtual(const Painel& Este) const {
+  return Este.Diretorio.empty() ? "" : Este.Diretorio + ArquivoAtual;
 }
 
 // The old file stays until the new one is complete, so there must be room for both. Events run meanwhile, so that the
 // window stays painted and alive; it takes no input.
-void Form4::Copiar(const Painel& origem, const Painel& destino) {
-  const std::string de = CaminhoAtual(origem);
-  const std::string para = CaminhoAtual(destino);
-  if (de.empty() || para.empty()) return;
-  ApagarRestos(destino.Diretorio);
-  if (!Cabe(de, para)) {
+void Form4::Copiar(const Painel& De, const Painel& Para) {
+  const std::string origem = CaminhoAtual(De);
+  const std::string destino = CaminhoAtual(Para);
+  if (origem.empty() || destino.empty()) return;
+  ApagarRestos(Para.Diretorio);
+  if (!Cabe(origem, destino)) {
     MostrarMensagem(Mensagem::DiscoCheio);
     return;
   }
-  if (ArquivoExiste(para) && MostrarMensagem(destino.JaExiste) != platform::Answer::Yes) return;
+  if (ArquivoExiste(destino) && MostrarMensagem(Para.JaExiste) != platform::Answer::Yes) return;
   RecolherEscolha();
   Enable(false);
   const std::string titulo = Caption();
   MostrarAndamento("");
   const Copia copia =
-      CopiarArquivo(de, para, [this](int porCento) { MostrarAndamento(" " + std::to_string(porCento) + "%"); });
+      CopiarArquivo(origem, destino, [this](int PorCento) { MostrarAndamento(" " + std::to_string(PorCento) + "%"); });
   Enable(true);
-  origem.Lista.SetFocus();  // the copy button, which may have had the keyboard, is hidden now
+  De.Lista.SetFocus();  // the copy button, which may have had the keyboard, is hidden now
   if (copia != Copia::Feita) MostrarMensagem(copia == Copia::NaoLida ? Mensagem::ErroAoLer : Mensagem::ErroAoGravar);
-  Listar(destino);
+  Listar(Para);
   SetCaption(titulo);
 }
 
-void Form4::MostrarAndamento(const std::string& andamento) {
-  SetCaption(Traduzir(Texto::Copiando) + andamento);
+void Form4::MostrarAndamento(const std::string& Quanto) {
+  SetCaption(Traduzir(Texto::Copiando) + Quanto);
   platform::RunPendingEvents();
 }
 

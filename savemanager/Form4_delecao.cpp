@@ -9,23 +9,23 @@ constexpr int TeclaDelete = 46;
 
 }  // namespace
 
-void Form4::Image1_Click() { Deletar(Disquete); }
+void Form4::Image1_Click() { Deletar(disquete_); }
 
-void Form4::Image2_Click() { Deletar(Computador); }
+void Form4::Image2_Click() { Deletar(computador_); }
 
-void Form4::List1_KeyDown(int tecla) {
-  if (tecla == TeclaDelete) Image1_Click();
+void Form4::List1_KeyDown(int KeyCode) {
+  if (KeyCode == TeclaDelete) Image1_Click();
 }
 
-void Form4::List2_KeyDown(int tecla) {
-  if (tecla == TeclaDelete) Image2_Click();
+void Form4::List2_KeyDown(int KeyCode) {
+  if (KeyCode == TeclaDelete) Image2_Click();
 }
 
-void Form4::Deletar(const Painel& painel) {
-  if (Direcao != painel.Lado) return;
-  const std::string arquivo = painel.Diretorio + ArquivoAtual;
-  if (MostrarMensagem(painel.Deletar, painel.Lista.Text(painel.Lista.Selected())) != platform::Answer::Yes) return;
+void Form4::Deletar(const Painel& Este) {
+  if (Direcao != Este.Lado) return;
+  const std::string arquivo = Este.Diretorio + ArquivoAtual;
+  if (MostrarMensagem(Este.Deletar, Este.Lista.Text(Este.Lista.Selected())) != platform::Answer::Yes) return;
   ApagarArquivo(arquivo);
-  Listar(painel);
-  painel.Lista.SetFocus();  // the picture that may have had the keyboard is hidden now
+  Listar(Este);
+  Este.Lista.SetFocus();  // the picture that may have had the keyboard is hidden now
 }

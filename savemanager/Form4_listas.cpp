@@ -5,43 +5,43 @@
 #include "savemanager/nomes.h"
 #include "support/mod_Traducao.h"
 
-void Form4::ListarDisquete() { Listar(Disquete); }
+void Form4::ListarDisquete() { Listar(disquete_); }
 
-void Form4::ListarComputador() { Listar(Computador); }
+void Form4::ListarComputador() { Listar(computador_); }
 
-void Form4::Listar(const Painel& painel) {
-  painel.Lista.Enable(false);
+void Form4::Listar(const Painel& Este) {
+  Este.Lista.Enable(false);
   Direcao = Origem::Nenhuma;
-  painel.Lixeira.Show(false);
+  Este.Lixeira.Show(false);
   Command1.Show(false);
-  Preencher(painel);
-  painel.Lista.Enable(true);
+  Preencher(Este);
+  Este.Lista.Enable(true);
 }
 
-void Form4::Preencher(const Painel& painel) {
+void Form4::Preencher(const Painel& Este) {
   std::vector<std::string> textos;
-  if (!painel.Diretorio.empty()) {
-    for (const platform::DirectoryEntry& arquivo : platform::ListDirectory(painel.Diretorio, PadraoSalvamentos)) {
+  if (!Este.Diretorio.empty()) {
+    for (const platform::DirectoryEntry& arquivo : platform::ListDirectory(Este.Diretorio, PadraoSalvamentos)) {
       textos.push_back(NomeExibido(arquivo.Name, Catalogo()));
     }
   }
-  painel.Lista.Fill(textos);
+  Este.Lista.Fill(textos);
 }
 
-void Form4::List1_Click() { Escolher(Disquete); }
+void Form4::List1_Click() { Escolher(disquete_); }
 
-void Form4::List2_Click() { Escolher(Computador); }
+void Form4::List2_Click() { Escolher(computador_); }
 
-void Form4::Escolher(const Painel& painel) {
-  if (painel.Lista.Selected() < 0) return;
-  Outro(painel).Lista.Select(-1);
-  Outro(painel).Lixeira.Show(false);
-  painel.Lixeira.Show(true);
-  if (Direcao != painel.Lado) {
-    Command1.SetIcon(painel.Seta);
-    Command1.SetToolTip(Traduzir(painel.Copiar));
+void Form4::Escolher(const Painel& Este) {
+  if (Este.Lista.Selected() < 0) return;
+  Outro(Este).Lista.Select(-1);
+  Outro(Este).Lixeira.Show(false);
+  Este.Lixeira.Show(true);
+  if (Direcao != Este.Lado) {
+    Command1.SetIcon(Este.Seta);
+    Command1.SetToolTip(Traduzir(Este.Copiar));
     Command1.Show(true);
-    Direcao = painel.Lado;
+    Direcao = Este.Lado;
   }
-  ArquivoAtual = NomeArquivo(painel.Lista.Text(painel.Lista.Selected()), Catalogo());
+  ArquivoAtual = NomeArquivo(Este.Lista.Text(Este.Lista.Selected()), Catalogo());
 }

@@ -10,7 +10,7 @@ class cls_DAT;
 inline constexpr const char* PadraoSalvamentos = "*.srm;*.zst;*.zs1;*.zs2;*.zs3;*.zs4;*.zs5;*.zs6;*.zs7;*.zs8;*.zs9";
 
 // The text shown for a file (its name, without directory): the game's name, and the number of a saved state.
-std::string NomeExibido(const std::string& arquivo, const cls_DAT& catalogo);
+std::string NomeExibido(const std::string& Arquivo, const cls_DAT& Catalogo);
 
 // The file name, without directory, that a shown text stands for.
-std::string NomeArquivo(const std::string& texto, const cls_DAT& catalogo);
+std::string NomeArquivo(const std::string& Texto, const cls_DAT& Catalogo);

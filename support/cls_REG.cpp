@@ -16,19 +16,19 @@ struct Raiz {
   const std::string& Computador;  // empty: this one
 };
 
-std::string SemBarra(const std::string& caminho) { return caminho.starts_with('\\') ? caminho.substr(1) : caminho; }
+std::string SemBarra(const std::string& Caminho) { return Caminho.starts_with('\\') ? Caminho.substr(1) : Caminho; }
 
 // An open key, closed at the end of its life.
 class ChaveAberta {
  public:
-  ChaveAberta(const Raiz& raiz, const std::string& caminho) {
-    RegistryKey base = platform::RootKey(raiz.Chave);
+  ChaveAberta(const Raiz& Onde, const std::string& Caminho) {
+    RegistryKey base = platform::RootKey(Onde.Chave);
     RegistryKey remota = 0;
-    if (!raiz.Computador.empty()) {
-      platform::RegConnectRegistryA(raiz.Computador, base, remota);
+    if (!Onde.Computador.empty()) {
+      platform::RegConnectRegistryA(Onde.Computador, base, remota);
       base = remota;
     }
-    if (platform::RegOpenKeyExA(base, caminho, platform::KeyQueryAndSet, chave_) != 0) chave_ = 0;
+    if (platform::RegOpenKeyExA(base, Caminho, platform::KeyQueryAndSet, chave_) != 0) chave_ = 0;
     if (remota != 0) platform::RegCloseKey(remota);
   }
   ~ChaveAberta() {
@@ -52,30 +52,30 @@ struct Lido {
   std::array<char, 255> Bytes{};
 };
 
-std::optional<Lido> Consultar(const ChaveAberta& chave, const std::string& nome) {
+std::optional<Lido> Consultar(const ChaveAberta& Chave, const std::string& Nome) {
   Lido lido;
   lido.Tamanho = static_cast<std::uint32_t>(lido.Bytes.size());
-  if (platform::RegQueryValueExA(chave.Numero(), nome, lido.Tipo, lido.Bytes.data(), lido.Tamanho) != 0) {
+  if (platform::RegQueryValueExA(Chave.Numero(), Nome, lido.Tipo, lido.Bytes.data(), lido.Tamanho) != 0) {
     return std::nullopt;
   }
   return lido;
 }
 
 // The first four bytes as a number; nothing when there are more.
-std::optional<std::int32_t> NumeroDe(const Lido& lido) {
-  if (lido.Tamanho > sizeof(std::int32_t)) return std::nullopt;
+std::optional<std::int32_t> NumeroDe(const Lido& Dado) {
+  if (Dado.Tamanho > sizeof(std::int32_t)) return std::nullopt;
   std::int32_t numero;
-  std::memcpy(&numero, lido.Bytes.data(), sizeof numero);
+  std::memcpy(&numero, Dado.Bytes.data(), sizeof numero);
   return numero;
 }
 
-Valor ValorDe(const Lido& lido) {
+Valor ValorDe(const Lido& Dado) {
   constexpr std::int16_t ilegivel = 0;
-  const auto numero = NumeroDe(lido);
-  switch (lido.Tipo) {
+  const auto numero = NumeroDe(Dado);
+  switch (Dado.Tipo) {
     case platform::RegistryText:
-      if (lido.Tamanho == 0) return {};
-      return std::string(lido.Bytes.data(), lido.Tamanho - 1);
+      if (Dado.Tamanho == 0) return {};
+      return std::string(Dado.Bytes.data(), Dado.Tamanho - 1);
     case platform::RegistryNumber:
       return numero ? Valor(*numero) : Valor(ilegivel);
     case platform::RegistryBinary:
@@ -85,46 +85,46 @@ Valor ValorDe(const Lido& lido) {
   }
 }
 
-void GravarTexto(const ChaveAberta& chave, const std::string& nome, const std::string& texto) {
-  platform::RegSetValueExA(chave.Numero(), nome, platform::RegistryText, texto.c_str(),
-                           static_cast<std::uint32_t>(texto.size() + 1));
+void GravarTexto(const ChaveAberta& Chave, const std::string& Nome, const std::string& Texto) {
+  platform::RegSetValueExA(Chave.Numero(), Nome, platform::RegistryText, Texto.c_str(),
+                           static_cast<std::uint32_t>(Texto.size() + 1));
 }
 
-void GravarNumero(const ChaveAberta& chave, const std::string& nome, const Valor& valor) {
-  if (const auto numero = InteiroDe(valor)) {
-    platform::RegSetValueExA(chave.Numero(), nome, platform::RegistryNumber, &*numero, sizeof *numero);
+void GravarNumero(const ChaveAberta& Chave, const std::string& Nome, const Valor& Novo) {
+  if (const auto numero = InteiroDe(Novo)) {
+    platform::RegSetValueExA(Chave.Numero(), Nome, platform::RegistryNumber, &*numero, sizeof *numero);
   }
 }
 
-void GravarByte(const ChaveAberta& chave, const std::string& nome, const Valor& valor) {
-  const auto numero = InteiroDe(valor);
+void GravarByte(const ChaveAberta& Chave, const std::string& Nome, const Valor& Novo) {
+  const auto numero = InteiroDe(Novo);
   if (!numero || *numero < 0 || *numero > std::numeric_limits<std::uint8_t>::max()) return;
   const auto byte = static_cast<std::uint8_t>(*numero);
-  platform::RegSetValueExA(chave.Numero(), nome, platform::RegistryBinary, &byte, sizeof byte);
+  platform::RegSetValueExA(Chave.Numero(), Nome, platform::RegistryBinary, &byte, sizeof byte);
 }
 
-bool ChaveExiste(const Raiz& raiz, const std::string& caminho) {
-  return static_cast<bool>(ChaveAberta(raiz, SemBarra(caminho)));
+bool ChaveExiste(const Raiz& Onde, const std::string& Caminho) {
+  return static_cast<bool>(ChaveAberta(Onde, SemBarra(Caminho)));
 }
 
-void CriarChave(const Raiz& raiz, const std::string& caminho) {
-  const ChaveAberta base(raiz, "");
+void CriarChave(const Raiz& Onde, const std::string& Caminho) {
+  const ChaveAberta base(Onde, "");
   RegistryKey criada = 0;
-  if (base && platform::RegCreateKeyA(base.Numero(), caminho, criada) == 0) platform::RegCloseKey(criada);
+  if (base && platform::RegCreateKeyA(base.Numero(), Caminho, criada) == 0) platform::RegCloseKey(criada);
 }
 
-void CriarCaminhoChave(const Raiz& raiz, const std::string& caminho) {
-  for (auto barra = caminho.find('\\'); barra != std::string::npos; barra = caminho.find('\\', barra + 1)) {
-    const std::string trecho = caminho.substr(0, barra + 1);
-    if (!ChaveExiste(raiz, trecho)) CriarChave(raiz, trecho);
+void CriarCaminhoChave(const Raiz& Onde, const std::string& Caminho) {
+  for (auto barra = Caminho.find('\\'); barra != std::string::npos; barra = Caminho.find('\\', barra + 1)) {
+    const std::string trecho = Caminho.substr(0, barra + 1);
+    if (!ChaveExiste(Onde, trecho)) CriarChave(Onde, trecho);
   }
-  if (!ChaveExiste(raiz, caminho)) CriarChave(raiz, caminho);
+  if (!ChaveExiste(Onde, Caminho)) CriarChave(Onde, Caminho);
 }
 
-std::string_view SemBrancos(std::string_view texto) {
-  const auto inicio = texto.find_first_not_of(" \t");
+std::string_view SemBrancos(std::string_view Texto) {
+  const auto inicio = Texto.find_first_not_of(" \t");
   if (inicio == std::string_view::npos) return {};
-  return texto.substr(inicio, texto.find_last_not_of(" \t") - inicio + 1);
+  return Texto.substr(inicio, Texto.find_last_not_of(" \t") - inicio + 1);
 }
 
 }  // namespace

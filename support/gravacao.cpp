@@ -14,21 +14,21 @@ constexpr std::size_t TamanhoMarca = 8;
 constexpr std::string_view Digitos = "0123456789abcdef";
 
 // "Jogo.zip" becomes "Jogo.zip.0f3a99c2.novo~", so that no two programs write the same file, and none of the person's.
-std::string ComMarca(const std::string& caminho) {
+std::string ComMarca(const std::string& Caminho) {
   std::uint32_t acaso = std::random_device{}();
   std::string marca(TamanhoMarca, '0');
   for (char& digito : marca) {
     digito = Digitos[acaso & 0xF];
     acaso >>= 4;
   }
-  return caminho + "." + marca + std::string(Terminacao);
+  return Caminho + "." + marca + std::string(Terminacao);
 }
 
-bool TemMarca(std::string_view nome) {
+bool TemMarca(std::string_view Nome) {
   constexpr std::size_t fim = 1 + TamanhoMarca + Terminacao.size();
-  if (nome.size() <= fim || !nome.ends_with(Terminacao)) return false;
-  const std::string_view marca = nome.substr(nome.size() - fim + 1, TamanhoMarca);
-  return nome[nome.size() - fim] == '.' && marca.find_first_not_of(Digitos) == std::string_view::npos;
+  if (Nome.size() <= fim || !Nome.ends_with(Terminacao)) return false;
+  const std::string_view marca = Nome.substr(Nome.size() - fim + 1, TamanhoMarca);
+  return Nome[Nome.size() - fim] == '.' && marca.find_first_not_of(Digitos) == std::string_view::npos;
 }
 
 // Where a text goes in a file of a known length.
@@ -37,20 +37,20 @@ struct Trecho {
   std::int64_t Antes, Depois;  // the file's lengths
 };
 
-Trecho TrechoDe(const Gravacao& pedido, std::int64_t tamanho) {
-  const std::int64_t posicao = pedido.Posicao < 0 ? tamanho : pedido.Posicao;
-  const std::int64_t fim = posicao + static_cast<std::int64_t>(pedido.Texto.size());
-  return {posicao, fim, tamanho, pedido.Cortar ? fim : std::max(fim, tamanho)};
+Trecho TrechoDe(const Gravacao& Pedido, std::int64_t Tamanho) {
+  const std::int64_t posicao = Pedido.Posicao < 0 ? Tamanho : Pedido.Posicao;
+  const std::int64_t fim = posicao + static_cast<std::int64_t>(Pedido.Texto.size());
+  return {posicao, fim, Tamanho, Pedido.Cortar ? fim : std::max(fim, Tamanho)};
 }
 
 // What the file has where the text goes. Nothing that can be put back is better than a file that cannot be written:
 // without the memory for it, or when it cannot be read, it is the empty text.
-std::string Guardar(platform::File& arquivo, const Trecho& trecho) {
-  const std::int64_t ate = trecho.Depois < trecho.Antes ? trecho.Antes : std::min(trecho.Fim, trecho.Antes);
-  if (ate <= trecho.Posicao) return "";
+std::string Guardar(platform::File& Arquivo, const Trecho& Onde) {
+  const std::int64_t ate = Onde.Depois < Onde.Antes ? Onde.Antes : std::min(Onde.Fim, Onde.Antes);
+  if (ate <= Onde.Posicao) return "";
   try {
-    std::string guardado(static_cast<std::size_t>(ate - trecho.Posicao), '\0');
-    const std::int64_t lidos = arquivo.Read(trecho.Posicao, guardado.data(), guardado.size());
+    std::string guardado(static_cast<std::size_t>(ate - Onde.Posicao), '\0');
+    const std::int64_t lidos = Arquivo.Read(Onde.Posicao, guardado.data(), guardado.size());
     guardado.resize(static_cast<std::size_t>(std::max<std::int64_t>(lidos, 0)));
     return guardado;
   } catch (const std::bad_alloc&) {
@@ -59,28 +59,28 @@ std::string Guardar(platform::File& arquivo, const Trecho& trecho) {
 }
 
 // The room is reserved before the first byte is written: a full disk says so while the old contents still stand.
-bool Reservar(platform::File& arquivo, const Trecho& trecho) {
-  return trecho.Depois <= trecho.Antes || arquivo.SetSize(trecho.Depois);
+bool Reservar(platform::File& Arquivo, const Trecho& Onde) {
+  return Onde.Depois <= Onde.Antes || Arquivo.SetSize(Onde.Depois);
 }
 
-bool Escrever(platform::File& arquivo, std::string_view texto, const Trecho& trecho) {
-  if (!arquivo.Write(trecho.Posicao, texto)) return false;
-  if (trecho.Depois < trecho.Antes && !arquivo.SetSize(trecho.Depois)) return false;
-  return arquivo.Flush();
+bool Escrever(platform::File& Arquivo, std::string_view Texto, const Trecho& Onde) {
+  if (!Arquivo.Write(Onde.Posicao, Texto)) return false;
+  if (Onde.Depois < Onde.Antes && !Arquivo.SetSize(Onde.Depois)) return false;
+  return Arquivo.Flush();
 }
 
-void PorDeVolta(platform::File& arquivo, std::string_view guardado, const Trecho& trecho) {
-  if (!guardado.empty()) arquivo.Write(trecho.Posicao, guardado);
-  arquivo.SetSize(trecho.Antes);
-  arquivo.Flush();
+void PorDeVolta(platform::File& Arquivo, std::string_view Guardado, const Trecho& Onde) {
+  if (!Guardado.empty()) Arquivo.Write(Onde.Posicao, Guardado);
+  Arquivo.SetSize(Onde.Antes);
+  Arquivo.Flush();
 }
 
-bool EscreverOuDesfazer(platform::File& arquivo, const Gravacao& pedido, std::int64_t tamanho) {
-  const Trecho trecho = TrechoDe(pedido, tamanho);
-  const std::string guardado = Guardar(arquivo, trecho);
-  if (!Reservar(arquivo, trecho)) return false;
-  if (Escrever(arquivo, pedido.Texto, trecho)) return true;
-  PorDeVolta(arquivo, guardado, trecho);
+bool EscreverOuDesfazer(platform::File& Arquivo, const Gravacao& Pedido, std::int64_t Tamanho) {
+  const Trecho trecho = TrechoDe(Pedido, Tamanho);
+  const std::string guardado = Guardar(Arquivo, trecho);
+  if (!Reservar(Arquivo, trecho)) return false;
+  if (Escrever(Arquivo, Pedido.Texto, trecho)) return true;
+  PorDeVolta(Arquivo, guardado, trecho);
   return false;
 }
 

@@ -11,66 +11,66 @@ namespace {
 
 constexpr std::int64_t MaiorTamanho = std::numeric_limits<std::int32_t>::max();
 
-std::optional<std::string> Brancos(std::int64_t tamanho) {
+std::optional<std::string> Brancos(std::int64_t Tamanho) {
   try {
-    return std::string(static_cast<std::size_t>(tamanho), ' ');
+    return std::string(static_cast<std::size_t>(Tamanho), ' ');
   } catch (const std::bad_alloc&) {
     return std::nullopt;
   }
 }
 
 // All bytes from a position, counted from 0, to the end of the file.
-std::optional<std::string> LerAteFim(platform::File& arquivo, std::int64_t posicao) {
-  const std::int64_t tamanho = arquivo.Size();
+std::optional<std::string> LerAteFim(platform::File& Arquivo, std::int64_t Posicao) {
+  const std::int64_t tamanho = Arquivo.Size();
   if (tamanho < 0 || tamanho > MaiorTamanho) return std::nullopt;
-  auto texto = Brancos(std::max<std::int64_t>(tamanho - posicao, 0));
+  auto texto = Brancos(std::max<std::int64_t>(tamanho - Posicao, 0));
   if (!texto || texto->empty()) return texto;
-  const std::int64_t lidos = arquivo.Read(posicao, texto->data(), texto->size());
+  const std::int64_t lidos = Arquivo.Read(Posicao, texto->data(), texto->size());
   if (lidos < 0) return std::nullopt;
   texto->resize(static_cast<std::size_t>(lidos));
   return texto;
 }
 
 // A file that was deleted before writing at a later position begins with zeros.
-bool Substituir(const std::string& caminho, std::string_view texto, std::int64_t posicao) {
-  if (posicao > 0) {
+bool Substituir(const std::string& Caminho, std::string_view Texto, std::int64_t Posicao) {
+  if (Posicao > 0) {
     try {
-      return Substituir(caminho, std::string(static_cast<std::size_t>(posicao), '\0').append(texto), 0);
+      return Substituir(Caminho, std::string(static_cast<std::size_t>(Posicao), '\0').append(Texto), 0);
     } catch (const std::bad_alloc&) {
       return false;
     }
   }
-  return Substituicao(caminho, texto).Concluir();
+  return Substituicao(Caminho, Texto).Concluir();
 }
 
 enum class Tentativa { Feita, NaoLida, SemLugar, Recusada };
 
 // The copy lies beside its place until it is complete. Each piece is on the disk before the next one: a slow disk takes
 // its time for a piece and not, at the end, for all of them.
-Tentativa CopiarAoLado(platform::File& origem, const std::string& caminho, const Andamento& andamento) {
+Tentativa CopiarAoLado(platform::File& Origem, const std::string& Caminho, const Andamento& AoAndar) {
   constexpr std::size_t tamanhoPedaco = 65'536;
-  ArquivoAoLado destino(caminho);
-  const std::int64_t tamanho = origem.Size();
+  ArquivoAoLado destino(Caminho);
+  const std::int64_t tamanho = Origem.Size();
   if (tamanho < 0) return Tentativa::NaoLida;
   std::string pedaco(tamanhoPedaco, '\0');
   for (std::int64_t posicao = 0; posicao < tamanho;) {
-    const std::int64_t lidos = origem.Read(posicao, pedaco.data(), pedaco.size());
+    const std::int64_t lidos = Origem.Read(posicao, pedaco.data(), pedaco.size());
     if (lidos <= 0) return Tentativa::NaoLida;
     if (!destino.Arquivo().Write(posicao, {pedaco.data(), static_cast<std::size_t>(lidos)})) return Tentativa::SemLugar;
     if (!destino.Arquivo().Flush()) return Tentativa::Recusada;
     posicao += lidos;
-    if (posicao < tamanho && andamento) andamento(static_cast<int>(100 * posicao / tamanho));
+    if (posicao < tamanho && AoAndar) AoAndar(static_cast<int>(100 * posicao / tamanho));
   }
-  destino.Arquivo().CopyInformation(origem);
+  destino.Arquivo().CopyInformation(Origem);
   if (destino.Arquivo().IsOpen() && !destino.Arquivo().Flush()) return Tentativa::Recusada;
   return destino.TomarNome(platform::Existing::Replace) ? Tentativa::Feita : Tentativa::SemLugar;
 }
 
 // Where there is no room for a copy beside it, the contents are written like any other text.
-Copia CopiarNoLugar(platform::File& origem, const std::string& destino) {
-  const auto conteudo = LerInteiro(origem);
+Copia CopiarNoLugar(platform::File& Origem, const std::string& Destino) {
+  const auto conteudo = LerInteiro(Origem);
   if (!conteudo) return Copia::NaoLida;
-  return GravarNoLugar(destino, {*conteudo, 0, true}) ? Copia::Feita : Copia::NaoGravada;
+  return GravarNoLugar(Destino, {*conteudo, 0, true}) ? Copia::Feita : Copia::NaoGravada;
 }
 
 }  // namespace
@@ -98,22 +98,22 @@ std::optional<std::string> LerInteiro(platform::File& Arquivo) { return LerAteFi
 
 int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32_t Posicao, bool ApagarAntes) {
   if (Posicao < -1) return -1;
-  const std::int64_t posicao = Posicao == 0 ? 0 : Posicao - 1;  // below 0: the end
-  const bool gravado = ApagarAntes ? Substituir(Caminho, Texto, std::max<std::int64_t>(posicao, 0))
-                                   : GravarNoLugar(Caminho, {Texto, posicao, false});
+  const std::int64_t inicio = Posicao == 0 ? 0 : Posicao - 1;  // below 0: the end
+  const bool gravado = ApagarAntes ? Substituir(Caminho, Texto, std::max<std::int64_t>(inicio, 0))
+                                   : GravarNoLugar(Caminho, {Texto, inicio, false});
   return gravado ? 1 : -1;
 }
 
 Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const Andamento& AoAndar) {
-  platform::File origem(Origem, platform::Access::Read);
-  if (!origem.IsOpen()) return Copia::NaoLida;
-  switch (CopiarAoLado(origem, Destino, AoAndar)) {
+  platform::File fonte(Origem, platform::Access::Read);
+  if (!fonte.IsOpen()) return Copia::NaoLida;
+  switch (CopiarAoLado(fonte, Destino, AoAndar)) {
     case Tentativa::Feita:
       return Copia::Feita;
     case Tentativa::NaoLida:
       return Copia::NaoLida;
     case Tentativa::SemLugar:
-      return CopiarNoLugar(origem, Destino);
+      return CopiarNoLugar(fonte, Destino);
     default:
       return Copia::NaoGravada;
   }

@@ -18,31 +18,31 @@ constexpr std::string_view TodosOsArquivos = "Todos os arquivos (*.*)\0*.*\0"sv;
 using Dialogo = bool (*)(platform::OpenFileName&);
 
 // The name with blanks behind it, so that the buffer is filled.
-std::string ComBrancos(const std::string& nome) {
+std::string ComBrancos(const std::string& Nome) {
   constexpr std::size_t maximo = TamanhoBuffer - 1;
-  return nome + std::string(nome.size() < maximo ? maximo - nome.size() : 1, ' ');
+  return Nome + std::string(Nome.size() < maximo ? maximo - Nome.size() : 1, ' ');
 }
 
-std::string SemBrancos(std::string_view texto) {
-  const auto inicio = texto.find_first_not_of(' ');
+std::string SemBrancos(std::string_view Texto) {
+  const auto inicio = Texto.find_first_not_of(' ');
   if (inicio == std::string_view::npos) return "";
-  return std::string(texto.substr(inicio, texto.find_last_not_of(' ') - inicio + 1));
+  return std::string(Texto.substr(inicio, Texto.find_last_not_of(' ') - inicio + 1));
 }
 
-std::string Perguntar(Dialogo dialogo, platform::OpenFileName pedido, std::string& filtro) {
-  if (filtro.empty()) filtro = TodosOsArquivos;
-  pedido.Filter = filtro;
-  pedido.File = ComBrancos(pedido.File);
-  pedido.FileSize = TamanhoBuffer;
-  if (!dialogo(pedido)) return "";
-  const std::string_view escolhido = pedido.File;
+std::string Perguntar(Dialogo Mostrar, platform::OpenFileName Pedido, std::string& Filtro) {
+  if (Filtro.empty()) Filtro = TodosOsArquivos;
+  Pedido.Filter = Filtro;
+  Pedido.File = ComBrancos(Pedido.File);
+  Pedido.FileSize = TamanhoBuffer;
+  if (!Mostrar(Pedido)) return "";
+  const std::string_view escolhido = Pedido.File;
   return SemBrancos(escolhido.substr(0, escolhido.find('\0')));
 }
 
 // True for a file that the disk lists under this name, in whatever letter case.
-bool Listado(const std::string& caminho) {
-  const auto entrada = platform::ListPath(caminho);
-  const std::string nome = UltimaParte(caminho);
+bool Listado(const std::string& Caminho) {
+  const auto entrada = platform::ListPath(Caminho);
+  const std::string nome = UltimaParte(Caminho);
   return entrada && platform::CharUpperBuffA(entrada->Name) == platform::CharUpperBuffA(nome);
 }
 

@@ -23,14 +23,14 @@ void LerCaminhos(const cls_REG& Registro) {
     const char* Ajuste;
     std::string Padrao;
   };
-  const std::array<Caminho, 5> Caminhos = {{{DirRoms, "RomDir", DirPrograma + "Roms\\"},
+  const std::array<Caminho, 5> caminhos = {{{DirRoms, "RomDir", DirPrograma + "Roms\\"},
                                             {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
                                             {DirImgs, "ImgDir", DirPrograma + "Imgs\\"},
                                             {ArquivoEmulador, "EmuExe", ""},
                                             {ArquivoCfgEmulador, "EmuCFG", ""}}};
-  for (const Caminho& Cada : Caminhos) {
-    const Valor Texto = Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Ajuste);
-    Cada.Destino = CaminhoConfigurado(TextoDe(Texto), Cada.Padrao);
+  for (const Caminho& cada : caminhos) {
+    const Valor texto = Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, cada.Ajuste);
+    cada.Destino = CaminhoConfigurado(TextoDe(texto), cada.Padrao);
   }
 }
 

@@ -6,8 +6,8 @@
 
 namespace {
 
-std::uint32_t ClasseDePrioridade(int prioridade) {
-  switch (prioridade) {
+std::uint32_t ClasseDePrioridade(int Prioridade) {
+  switch (Prioridade) {
     case 1:
       return platform::PriorityIdle;
     case 3:
@@ -20,15 +20,15 @@ std::uint32_t ClasseDePrioridade(int prioridade) {
 }
 
 // Where an absolute path begins that stands at the beginning of the text or behind a blank.
-bool ComecaCaminho(const std::string& texto, std::size_t posicao) {
-  return (posicao == 0 || texto[posicao - 1] == ' ') &&
-         (texto.compare(posicao + 1, 2, ":\\") == 0 || texto.compare(posicao, 2, "\\\\") == 0);
+bool ComecaCaminho(const std::string& Texto, std::size_t Posicao) {
+  return (Posicao == 0 || Texto[Posicao - 1] == ' ') &&
+         (Texto.compare(Posicao + 1, 2, ":\\") == 0 || Texto.compare(Posicao, 2, "\\\\") == 0);
 }
 
 // The command line up to its last backslash. Where that lies in an argument that is an absolute path, the directory is
 // the argument's.
-std::string DiretorioDoComando(const std::string& comando) {
-  std::string ate = DiretorioDe(comando);
+std::string DiretorioDoComando(const std::string& Comando) {
+  std::string ate = DiretorioDe(Comando);
   for (std::size_t i = ate.size(); i-- > 0;) {
     if (ComecaCaminho(ate, i)) return ate.substr(i);
   }
@@ -36,11 +36,11 @@ std::string DiretorioDoComando(const std::string& comando) {
 }
 
 // A program that did not start is waited for once, like one that ends at once.
-void EsperarFim(const platform::Process& processo, std::uint32_t intervalo) {
+void EsperarFim(const platform::Process& Processo, std::uint32_t Intervalo) {
   do {
     platform::RunPendingEvents();
-    if (!processo.Started()) platform::Sleep(intervalo);
-  } while (!processo.WaitForEnd(intervalo));
+    if (!Processo.Started()) platform::Sleep(Intervalo);
+  } while (!Processo.WaitForEnd(Intervalo));
 }
 
 }  // namespace
