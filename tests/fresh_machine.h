@@ -11,6 +11,7 @@
 #include "platform/text.h"
 #include "support/gravacao.h"
 #include "support/mod_Globais.h"
+#include "tests/messages.h"
 
 using namespace platform::simulated;
 using namespace std::string_literals;
@@ -28,19 +29,25 @@ struct FreshMachine : testing::Test {
   }
 };
 
-inline const std::string Error = "Erro, OK, critical: ";
-
-// The messages shown since the last call, as "title, buttons, icon: text".
-inline Texts TakeMessages() {
+// A message as "title, buttons, icon: text".
+inline std::string InOneText(const ShownMessage& message) {
   constexpr const char* buttons[] = {"OK", "Yes/No/Cancel", "Retry/Cancel"};
   constexpr const char* icons[] = {"critical", "question", "exclamation", "information"};
+  const std::string button = buttons[static_cast<int>(message.Choice)], icon = icons[static_cast<int>(message.Symbol)];
+  return message.Title + ", " + button + ", " + icon + ": " + message.Text;
+}
+
+// The messages shown since the last call.
+inline Texts TakeMessages() {
   Texts texts;
-  for (const auto& [text, title, choice, symbol] : ShownMessages()) {
-    const std::string button = buttons[static_cast<int>(choice)], icon = icons[static_cast<int>(symbol)];
-    texts.push_back(title + ", " + button + ", " + icon + ": " + text);
-  }
+  for (const ShownMessage& each : ShownMessages()) texts.push_back(InOneText(each));
   ForgetMessages();
   return texts;
+}
+
+// The message of this name, as TakeMessages tells it.
+inline std::string Told(Mensagem which, const std::string& value = "") {
+  return InOneText({TextOf(which, value), TitleOf(which), RowOf(which).Botoes, RowOf(which).Icone});
 }
 
 // The entries of a list, with a bar behind each.

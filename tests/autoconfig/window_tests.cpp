@@ -59,7 +59,7 @@ TEST_F(Configurator, ShowsWhatItFoundInEachLanguageAndWritesIt) {
                                 "Pictures|C:\\Tolvaris\\Imgs\\");
   DenyKey(Key);
   Save();
-  EXPECT_EQ(TakeMessages(), Texts{Error + "Não foi possível gravar a configuração."_ansi});
+  EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::ErroAoGravarAjustes)});
   EXPECT_FALSE(form->IsClosed());
   DenyKey(Key, false);
   Save();
@@ -138,9 +138,6 @@ TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
       {"no short names", false, "C:\\Meu Tolvaris", "C:\\Meu Tolvaris\\Z\\zsnes.exe", "\\Z\\zsnes.exe",
        "\\Z\\zsnes.cfg"},
   };
-  const std::string warning =
-      "Informação, OK, exclamation: O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\n"
-      "Se os jogos não abrirem, mude o emulador para um diretório sem espaços.\r\n\r\n"_ansi;
   for (const auto& [name, shortNames, program, chosen, emulator, setting] : cases) {
     SCOPED_TRACE(name);
     Reset();
@@ -151,7 +148,7 @@ TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
     ChooseOther(chosen);
     Save();
     EXPECT_EQ(Stored(), (Texts{"\\Roms\\", "\\Saves\\", "\\Imgs\\", emulator, setting}));
-    EXPECT_EQ(TakeMessages(), shortNames ? Texts() : Texts{warning + chosen});
+    EXPECT_EQ(TakeMessages(), shortNames ? Texts() : Texts{Told(Mensagem::EmuladorComEspacos, chosen)});
   }
   PutFile("C:\\E\\zsnes.cfg", "x");
   EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";
@@ -169,10 +166,8 @@ TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRe
   EXPECT_EQ(asked.InitialDirectory, "C:\\Outro\\");
   EXPECT_EQ(asked.Title + asked.Filter,
             "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
-  const std::string tooLong = Error + "O caminho é longo demais: o Tolvaris lê no máximo 254 caracteres.\r\n\r\n"_ansi;
-  for (const auto& [file, message] :
-       {std::pair("C:\\Outro\\vazio.exe"s, Error + "O emulador ZSnes não foi encontrado."_ansi),
-        {longPath + "z.exe", tooLong + longPath + "zsnesw.cfg"}}) {
+  for (const auto& [file, message] : {std::pair("C:\\Outro\\vazio.exe"s, Told(Mensagem::EmuladorNaoEncontrado)),
+                                      {longPath + "z.exe", Told(Mensagem::CaminhoLongo, longPath + "zsnesw.cfg")}}) {
     ChooseOther(file);
     Save();
     EXPECT_EQ(TakeMessages(), Texts{message});
@@ -190,11 +185,7 @@ const std::string After = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPath
 
 TEST_F(Configurator, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
   const std::string older = "SaveDirectory = C:\\S\r\n";
-  const Texts question = {
-      "Confirmar, Yes/No/Cancel, question: Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris "
-      "não altera ao jogar.\r\n"
-      "Com ele a opção de usar disquete não tem efeito.\r\n\r\n"
-      "Gravar agora nessa configuração os diretórios de jogos e de salvamentos do Tolvaris ?"_ansi};
+  const Texts question = {Told(Mensagem::ConfiguracaoMaisNova)};
   const std::tuple<const char*, std::string, Answer, std::string, bool> cases[] = {
       // the file before, the answer to the question, the file afterwards, and whether the settings are written
       {"cancelled", Before, Answer::Cancel, Before, false},  {"refused", Before, Answer::No, Before, true},
@@ -234,7 +225,7 @@ TEST_F(Configurator, EveryFaultLeavesWholeFilesAndIsSaid) {
     const std::string content = Content(Configuration).value_or("");
     EXPECT_TRUE(content == Before || content == After) << content;
     const Texts messages = TakeMessages();
-    EXPECT_EQ(closed, messages.empty() || !messages.back().starts_with("Erro, "));
+    EXPECT_EQ(closed, messages.empty() || messages.back() == Told(Mensagem::ConfiguracaoMaisNova));
     EXPECT_TRUE(Stored() == Defaults || (Stored()[4] == "-" && !closed)) << "configured is only what is complete";
     EXPECT_EQ(open, 0U);
   };

@@ -31,8 +31,7 @@ TEST(ControllerHelp, ShowsTheKeysOfTheChosenPlayerAndRemindsOnceAtEachOpening) {
           "[TOLVARIS20]\r\nControle=Pad\r\n&Fechar=&Close\r\nSeta cima=Up\r\nInformação=Note\r\n"
           "Guarde os comandos do controle. Se necessário anote-os.=Learn them.\r\n"_ansi);
   Use("Pad||&Close|Up|" + keys1, "Pad||&Close|" + keys2, [](Form3&) { Form3::Descarregar(); });
-  const Texts reminders = {"Informação, OK, information: Guarde os comandos do controle. Se necessário anote-os."_ansi,
-                           "Note, OK, information: Learn them."};
+  const Texts reminders = {Told(Mensagem::GuardeOsComandos), "Note, OK, information: Learn them."};
   EXPECT_EQ(TakeMessages(), reminders) << "also: both windows were opened";
 }
 

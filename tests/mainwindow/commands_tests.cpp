@@ -8,14 +8,14 @@ namespace {
 struct Commands : Menu {};
 
 TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
-  const Texts unknown = {Error + "Erro interno: jogo não encontrado no sistema."_ansi};
-  const Texts gone = {Error + "O jogo não foi encontrado."_ansi};
+  const Texts unknown = {Told(Mensagem::JogoDesconhecido)};
+  const Texts gone = {Told(Mensagem::JogoNaoEncontrado)};
   const std::tuple<const char*, std::function<void()>, Texts, Texts> cases[] = {
       // what is missing, what play says, and what export and delete say
       {"a selection", [this] { form->List1.Select(-1); }, {}, unknown},
       {"the game's row", [this] { form->Jogos.clear(); }, unknown, unknown},
       {"the ROM", [] { RemoveFile(Roms + "SEMFIG.SMC"); }, gone, gone},
-      {"the emulator", [] { RemoveFile(Emulator); }, {Error + "O emulador ZSnes não foi encontrado."_ansi}, {}},
+      {"the emulator", [] { RemoveFile(Emulator); }, {Told(Mensagem::EmuladorNaoEncontrado)}, {}},
   };
   for (const auto& [name, spoil, playSays, othersSay] : cases) {
     SCOPED_TRACE(name);
@@ -45,6 +45,9 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
   const std::string catalogue = Home + "tolvaris.dat";
   // A picture that cannot be seen is taken for one that is not there.
   const std::string withoutPicture = Package("Super Jogo", "SUPERJOG", "");
+  const std::set<std::string> questions = {Told(Mensagem::JogoJaExiste), Told(Mensagem::ArquivoJaExiste),
+                                           Told(Mensagem::DeletarJogo, "Super Jogo")};
+  const std::set<std::string> successes = {Told(Mensagem::JogoAdicionado), Told(Mensagem::ArquivoSalvo)};
   const struct {
     const char* Name;
     std::function<void()> Operate;
@@ -75,13 +78,12 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
     const auto check = [&] {
       EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
       Texts shown = TakeMessages();
-      const bool asked =
-          std::erase_if(shown, [](const std::string& text) { return text.starts_with("Confirmar"); }) > 0;
+      const bool asked = std::erase_if(shown, [&](const std::string& text) { return questions.contains(text); }) > 0;
       EXPECT_TRUE(asked || result == Roms + "SUPERJOG.zip" || Content(result) == before[result]) << "replaced unasked";
       EXPECT_LE(shown.size(), 1U);
       EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
       EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
-      EXPECT_TRUE(shown.empty() || !shown[0].starts_with("Ok, ") || Content(result) != before[result]);
+      EXPECT_TRUE(shown.empty() || !successes.contains(shown[0]) || Content(result) != before[result]);
       EXPECT_EQ(Leftovers({Roms, Imgs, "C:\\Emu\\", "C:\\"}), Texts{});
       for (const bool cut : {false, true}) {
         if (cut) CutPower();
@@ -120,7 +122,7 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
     EXPECT_EQ(Selected(), neighbour) << name;
     EXPECT_EQ(States(), *neighbour ? GameSelected : NothingSelected) << name;
   }
-  EXPECT_EQ(TakeMessages()[0], "Confirmar deleção, Yes/No/Cancel, exclamation: Deletar o jogo ' Sem figura ' ?"_ansi);
+  EXPECT_EQ(TakeMessages()[0], Told(Mensagem::DeletarJogo, "Sem figura"));
 }
 
 }  // namespace

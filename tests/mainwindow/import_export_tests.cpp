@@ -2,16 +2,10 @@
 
 namespace {
 
-const std::string Added = "Ok, OK, information: Jogo adicionado com sucesso.",
-                  Saved = "Ok, OK, information: Arquivo salvo.";
-const std::string ReadError = Error + "Erro ao ler arquivo.", WriteError = Error + "Erro ao gravar arquivo.";
-const std::string ExportError = Error + "Erro ao salvar arquivo.";
-const std::string Corrupt = Error +
-                            "Houve uma diferença na medição dos códigos CRC.\r\n"
-                            "Essa mudança indica que o arquivo está corrompido."_ansi;
-const std::string ReplaceGame =
-    "Confirmar, Yes/No/Cancel, exclamation: O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?"_ansi;
-const std::string ReplaceFile = "Confirmar, Yes/No/Cancel, exclamation: Arquivo já existente.\r\n\r\nSubstituir ?"_ansi;
+const std::string Added = Told(Mensagem::JogoAdicionado), Saved = Told(Mensagem::ArquivoSalvo);
+const std::string ReadError = Told(Mensagem::ErroAoLer), WriteError = Told(Mensagem::ErroAoGravar);
+const std::string ExportError = Told(Mensagem::ErroAoSalvar), Corrupt = Told(Mensagem::JogoCorrompido);
+const std::string ReplaceGame = Told(Mensagem::JogoJaExiste), ReplaceFile = Told(Mensagem::ArquivoJaExiste);
 const std::string WithoutChecksum(1048576, 'x');  // a length that has none
 
 // What happens before the command is given.

@@ -24,10 +24,7 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   const std::pair<const char*, const char*> settings[] = {
       {"AvisoALTF4", "1"}, {"LRom", "Nome comprido"}, {"Disquete", "0"}, {"pl", "1500"}, {"pt", "1200"}};
   for (const auto& [name, value] : settings) EXPECT_EQ(StoredText(Key, name), value) << name;
-  const std::string notice =
-      "Informação, OK, information: Para fechar o jogo precione e segure a tecla 'ALT' e "
-      "simultaneamente aperte e tecla 'F4'"_ansi;
-  EXPECT_EQ(TakeMessages(), Texts{notice});
+  EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::ComoFecharOJogo)});
   EXPECT_EQ(States(), GameSelected);
 
   const auto writes = WriteCount(EmulatorConfig);
@@ -74,10 +71,7 @@ TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
   QueueAnswer(Answer::Retry);
   QueueAnswer(Answer::Cancel);
   Click(form->Command1);
-  const std::string prompt =
-      "Disquete A:, Retry/Cancel, exclamation: Não há disquete na unidade A:\\\r\n\r\n"
-      "Coloque um disquete e clique em 'Repetir'."_ansi;
-  EXPECT_EQ(TakeMessages(), Texts(3, prompt));
+  EXPECT_EQ(TakeMessages(), Texts(3, Told(Mensagem::SemDisquete)));
   EXPECT_TRUE(StartedProcesses().empty());
   EXPECT_EQ(StoredText(Key, "Disquete"), std::nullopt);
   EXPECT_EQ(States(), GameSelected);
@@ -127,7 +121,7 @@ TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
 TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
   ASSERT_TRUE(Start());
   Click(form->Command3);
-  EXPECT_EQ(TakeMessages(), Texts{Error + "O programa de download não foi encontrado."_ansi});
+  EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::SemDownloader)});
   EXPECT_EQ(States(), GameSelected);
 
   PutFile(Downloader, "no program");

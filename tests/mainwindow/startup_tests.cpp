@@ -104,13 +104,7 @@ TEST_F(Startup, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
 
 TEST_F(Startup, WithoutConfigurationItEndsOrRunsTheConfigurator) {
   const std::string configurator = Home + "tolvariscfg.exe";
-  const std::string missing =
-      Error +
-      "Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi encontrado.\r\n"
-      "Reinstale o programa."_ansi;
-  const std::string question =
-      "Configuração, Yes/No/Cancel, information: O Tolvaris não foi configurado.\r\n"
-      "Clique em 'Sim' para rodar o programa de auto-configuração."_ansi;
+  const std::string missing = Told(Mensagem::SemConfigurador), question = Told(Mensagem::SemConfiguracao);
   PutText(Key, "EmuCFG", "");
   EXPECT_FALSE(Start());
   EXPECT_TRUE(form->IsClosed());

@@ -11,24 +11,24 @@ using namespace platform;
 const std::string OnBoth = "Corrida 2 [State 0]", Old = "velho no disquete", New = "novo no computador";
 const std::string Unnamed = "SEMNOME [State 2]", Source = "C:\\Saves\\SEMNOME.zs2", Target = "A:\\SEMNOME.zs2";
 
-const std::string WriteError = Error + "Erro ao gravar arquivo.", ReadError = Error + "Erro ao ler arquivo.";
-const std::string DiskFull =
-    "Disco cheio, OK, exclamation: Não há espaço livre suficiente em disco para completar a operação."_ansi;
-const std::string Delete = "Confirmar deleção, Yes/No/Cancel, question: "_ansi;
+const std::string WriteError = Told(Mensagem::ErroAoGravar), ReadError = Told(Mensagem::ErroAoLer);
+const std::string DiskFull = Told(Mensagem::DiscoCheio), OnTheFloppy = Told(Mensagem::SalvamentoNoDisquete);
 
-std::string AlreadyThere(const std::string& side) {
-  return "Salvamento já existente, Yes/No/Cancel, question: O salvamento selecionado já se encontra no "_ansi + side +
-         ".\r\nVocê deseja substituí-lo ?"_ansi;
-}
-
-// Where the save is that is on both sides.
+// Where the save is that is on both sides, and what is asked before it is replaced or deleted.
 struct Side {
   std::string Name, File, Content;
+  Mensagem MayReplace, MayDelete;
   ListBox Form4::*Pane;
   ImageButton Form4::*Delete;
 };
-const Side Floppy = {"Disquete (A:)", "A:\\DOIS.zst", Old, &Form4::List1, &Form4::Image1};
-const Side Computer = {"Computador", "C:\\Saves\\DOIS.zst", New, &Form4::List2, &Form4::Image2};
+const Side Floppy = {
+    "floppy",      "A:\\DOIS.zst", Old, Mensagem::SalvamentoNoDisquete, Mensagem::DeletarDoDisquete,
+    &Form4::List1, &Form4::Image1,
+};
+const Side Computer = {
+    "computer",    "C:\\Saves\\DOIS.zst", New, Mensagem::SalvamentoNoComputador, Mensagem::DeletarDoComputador,
+    &Form4::List2, &Form4::Image2,
+};
 
 // Saves: one on the floppy, one on the computer, and one on both.
 struct Saves : FreshMachine {
@@ -84,7 +84,7 @@ struct Saves : FreshMachine {
     });
     EXPECT_EQ(Content(side.File), yes ? other.Content : side.Content);
     EXPECT_EQ(Content(other.File), other.Content);
-    EXPECT_EQ(TakeMessages(), Texts{AlreadyThere(side.Name)});
+    EXPECT_EQ(TakeMessages(), Texts{Told(side.MayReplace)});
   }
 
   // Deletes this side's save of what is on both sides.
@@ -103,8 +103,7 @@ struct Saves : FreshMachine {
     });
     EXPECT_EQ(Content(side.File), yes ? std::nullopt : std::optional(side.Content));
     EXPECT_EQ(Content(other.File), other.Content);
-    const std::string question = "Deletar o salvamento do jogo '" + OnBoth + "' que está no "_ansi + side.Name + " ?";
-    EXPECT_EQ(TakeMessages(), Texts{Delete + question});
+    EXPECT_EQ(TakeMessages(), Texts{Told(side.MayDelete, OnBoth)});
   }
 };
 
@@ -188,7 +187,6 @@ TEST_F(Saves, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
     SetFreeSpace('A', 0);
   };
   const Action oldLeftover = [&] { leftover(), SetAge("A:\\X.srm.0f3a99c2.novo~", 3601); };
-  const std::string replaceQuestion = AlreadyThere("Disquete (A:)");
   // What happens before the copy button is pressed, and during the copy; what is said; what the floppy holds then.
   const std::tuple<const char*, Action, Action, Texts, std::optional<std::string>> cases[] = {
       {"just room", [] { SetFreeSpace('A', 512); }, nothing, {}, "sem nome"},
@@ -204,7 +202,7 @@ TEST_F(Saves, ThatCannotBeCopiedLeaveTheOldOneWholeAndAreToldOf) {
       {"full half-way",
        [] { PutFile(Target, "velho"); },
        [] { SetFreeSpace('A', 2); },
-       {replaceQuestion, WriteError},
+       {OnTheFloppy, WriteError},
        "velho"},
       {"disk taken out", nothing, takeOut, {WriteError}, {}},
   };
@@ -243,7 +241,7 @@ TEST_F(Saves, AreOldOrNewButWholeWhateverCallOfThePlatformFails) {
   };
   const auto check = [&] {
     const Texts said = TakeMessages();
-    const bool warned = !said.empty() && said.back() != AlreadyThere("Disquete (A:)");
+    const bool warned = !said.empty() && said.back() != OnTheFloppy;
     warnings += warned ? 1 : 0;
     EXPECT_EQ(Content("A:\\DOIS.zst"), offered && !warned ? New : Old);
     EXPECT_EQ(Content("C:\\Saves\\DOIS.zst"), New);
@@ -266,7 +264,8 @@ TEST_F(Saves, AreShownAndDeletedInTheLanguageOfTheTranslation) {
     EXPECT_EQ(TextsOf(window), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
     PressKey(window.List2, 46);
   });
-  EXPECT_EQ(TakeMessages(), Texts{Delete + "Delete 'SEMNOME [State 2]' here?"});
+  EXPECT_EQ(TakeMessages(), Texts{TitleOf(Mensagem::DeletarDoComputador) +
+                                  ", Yes/No/Cancel, question: Delete 'SEMNOME [State 2]' here?"});
 }
 
 }  // namespace

@@ -26,7 +26,7 @@ TEST_F(DeleteGame, OnYesOnlySelectsTheNeighbourDownToTheEmptyList) {
     SCOPED_TRACE(game);
     if (Selected() != game) Select(game);
     Click(Delete);
-    EXPECT_EQ(Answer(answered), Question("Confirmar deleção", "Deletar o jogo ' " + game + " ' ?"));
+    EXPECT_EQ(Answer(answered), Of(Mensagem::DeletarJogo, game));
     EXPECT_SOON_EQ(then, Selected());
     EXPECT_SOON(window->Pictures[Import].Enabled());
     EXPECT_SOON_EQ(!then.empty(), window->Pictures[Delete].Enabled());

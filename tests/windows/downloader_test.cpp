@@ -45,7 +45,7 @@ TEST_F(Downloader, GivesTheWindowBackWithTheGamesThatItBrought) {
 
 TEST_F(Downloader, ThatIsMissingOrCannotBeStartedLeavesTheWindowUsable) {
   Click(Download);
-  EXPECT_EQ(Answer(IDOK), Failure("O programa de download não foi encontrado."));
+  EXPECT_EQ(Answer(IDOK), Of(Mensagem::SemDownloader));
   ExpectBack(Games);
 
   // The list that is built again shows that the attempt is over.

@@ -50,10 +50,10 @@ TEST_F(ExportGame, OffersWhatAGameCanBeSavedAsAndAsksBeforeItReplacesAFile) {
     if (!typed.empty()) dialog.Type(typed);
     dialog.Press(VK_RETURN);
     if (answered != 0) {
-      EXPECT_EQ(Answer(answered), Question("Confirmar", "Arquivo já existente.\r\n\r\nSubstituir ?"));
+      EXPECT_EQ(Answer(answered), Of(Mensagem::ArquivoJaExiste));
     }
     if (answered == 0 || answered == IDYES) {
-      EXPECT_EQ(Answer(IDOK), (Message{"Ok", "Arquivo salvo.", {IDOK}}));
+      EXPECT_EQ(Answer(IDOK), Of(Mensagem::ArquivoSalvo));
     }
     ExpectQuietEnd();
     expected[file] = content;
@@ -75,7 +75,7 @@ TEST_F(ExportGame, ThatCannotBeWrittenIsToldAndLeavesWhatWasThere) {
   for (const std::string& path : {Outside + "falta\\e.zip", std::string("A:\\cheio.zip"), std::string("A:\\e.tvk")}) {
     Select("Élan");
     Choose(Export, path);
-    EXPECT_EQ(Answer(IDOK), Failure("Erro ao gravar arquivo.")) << path;
+    EXPECT_EQ(Answer(IDOK), Of(Mensagem::ErroAoGravar)) << path;
     ExpectQuietEnd();
   }
   ExpectFiles({{"leia.txt", "texto"}}, FilesIn(Outside));

@@ -5,13 +5,8 @@
 
 namespace {
 
-const Message Added = {"Ok", "Jogo adicionado com sucesso.", {IDOK}};
-const Message CannotRead = Failure("Erro ao ler arquivo.");
-const Message Corrupted = Failure(
-    "Houve uma diferença na medição dos códigos CRC.\r\n"
-    "Essa mudança indica que o arquivo está corrompido.");
-
-const Message Replace = Question("Confirmar", "O jogo a ser adiciona já existe.\r\n\r\nSubstituir ?");
+const Message Added = Of(Mensagem::JogoAdicionado), Replace = Of(Mensagem::JogoJaExiste);
+const Message CannotRead = Of(Mensagem::ErroAoLer), Corrupted = Of(Mensagem::JogoCorrompido);
 
 class ImportGame : public Installation {};
 

@@ -7,6 +7,7 @@
 #include "tests/windows/driver/file_dialog.h"
 #include "tests/windows/driver/waiting.h"
 #include "tests/windows/files.h"
+#include "tests/windows/messages.h"
 #include "tests/windows/program_windows.h"
 
 using Texts = std::vector<std::string>;
@@ -17,14 +18,6 @@ const std::string Outside = "C:\\Fora\\";  // a directory that is not the progra
 
 // The names of the games that are there at a test's beginning, as the list sorts them.
 const Texts Games = {"abelha", "Água Viva", "Corrida das Nuvens", "Élan", "Zebra"};
-
-inline Message Failure(const std::string& text) { return {"Erro", text, {IDOK}}; }
-inline Message Question(const std::string& title, const std::string& text) {
-  return {title, text, {IDYES, IDNO, IDCANCEL}};
-}
-const Message NoDisk = {"Disquete A:",
-                        "Não há disquete na unidade A:\\\r\n\r\nColoque um disquete e clique em 'Repetir'.",
-                        {IDRETRY, IDCANCEL}};
 
 // A test whose installation is as one that was just configured, with all one-time notices shown. What a test before
 // left is removed first: a failure can be looked into.

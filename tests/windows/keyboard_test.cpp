@@ -59,25 +59,25 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   PressKey(VK_RETURN);
   EXPECT_SOON(!window->FloppyChecked());
   Use(pictures[ManageSaves], VK_SPACE);
-  EXPECT_EQ(Press(VK_ESCAPE).Title, "Disquete A:");
+  EXPECT_EQ(Press(VK_ESCAPE), Of(Mensagem::SemDisquete));
   EXPECT_SOON(pictures[ManageSaves].Focused());
   Use(pictures[Download], VK_RETURN);
-  EXPECT_EQ(Press(VK_RETURN).Text, "O programa de download não foi encontrado.");
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::SemDownloader));
   EXPECT_SOON(pictures[Download].Focused());
   Use(pictures[Import], VK_SPACE);
   FileDialog(*program).Enter(Outside + "novo.smc");
-  EXPECT_EQ(Press(VK_SPACE).Text, "Jogo adicionado com sucesso.");
+  EXPECT_EQ(Press(VK_SPACE), Of(Mensagem::JogoAdicionado));
   EXPECT_SOON_EQ(std::string("novo"), Selected());
   EXPECT_SOON(window->List.Focused() && pictures[Export].Enabled());
   Use(pictures[Export], VK_RETURN);
   FileDialog(*program).Enter(Outside + "copia.smc");
-  EXPECT_EQ(Press(VK_RETURN).Text, "Arquivo salvo.");
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::ArquivoSalvo));
   EXPECT_EQ(ContentOf(Outside + "copia.smc"), "jogo novo");
   EXPECT_SOON(window->List.Focused());
   PressKey('N');
   EXPECT_SOON(pictures[Delete].Enabled());
   Use(pictures[Delete], VK_SPACE);
-  EXPECT_EQ(Press(VK_RETURN).Title, "Confirmar deleção");
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::DeletarJogo, "novo"));
   EXPECT_SOON_EQ(Games, Entries(window->List));
   EXPECT_EQ(Content("Roms\\novo.smc"), "");
 
@@ -121,12 +121,12 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   Start();
   EXPECT_SOON(window->List.Focused());
   Use(window->Pictures[ManageSaves], VK_RETURN);
-  EXPECT_EQ(Press(VK_RETURN), NoDisk);
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::SemDisquete));
   ASSERT_SOON(FindMessage(*program));
   const FloppyDisk disk;
   PutFile("A:\\AGUA.srm", "bateria A");
   PutFile("A:\\ZEBRA.srm", "bateria Z");
-  EXPECT_EQ(Press(VK_RETURN), NoDisk);
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::SemDisquete));
   const SaveManager manager(*program);
   const auto& [floppyList, floppyDelete] = manager.Floppy;
   const auto& [computerList, computerDelete] = manager.Computer;
@@ -140,7 +140,7 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   const std::string atRest = manager.Copy.Picture();
   EXPECT_TRUE(TabTo(manager.Copy));
   floppyDelete.Click();
-  EXPECT_EQ(Press(VK_ESCAPE).Title, "Confirmar deleção");
+  EXPECT_EQ(Press(VK_ESCAPE), Of(Mensagem::DeletarDoDisquete, "Zebra"));
   EXPECT_SOON(manager.Copy.Picture() == atRest);
 
   Use(manager.Copy, VK_SPACE);
@@ -151,14 +151,14 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   EXPECT_SOON_EQ(ComputerOffered, manager.Offered());
   ExpectTabOrder({computerDelete, manager.Close, floppyList, manager.Copy, computerList});
   Use(computerDelete, VK_RETURN);
-  EXPECT_EQ(Press(VK_RETURN).Title, "Confirmar deleção");
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::DeletarDoComputador, "Zebra"));
   EXPECT_SOON(computerList.Focused());
   EXPECT_EQ(Content("Saves\\ZEBRA.srm"), "");
   EXPECT_TRUE(TabTo(floppyList));
   TypeText("Á");
   EXPECT_SOON_EQ(FloppyOffered, manager.Offered());
   PressKey(VK_DELETE);
-  EXPECT_EQ(Press(VK_RETURN).Title, "Confirmar deleção");
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::DeletarDoDisquete, "Água Viva"));
   EXPECT_SOON_EQ(Texts{"Zebra"}, Entries(floppyList));
   EXPECT_EQ(ContentOf("A:\\AGUA.srm"), "");
 
@@ -178,7 +178,7 @@ TEST_F(Keyboard, ReadsAndClosesTheControllerHelp) {
   for (const bool byEscape : {true, false}) {
     Set("AvisoControle", "");
     Run();
-    EXPECT_EQ(Press(VK_RETURN).Title, "Informação");
+    EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::GuardeOsComandos));
     const Window help = FindVisible(*program, "Controle");
     const Window players = help.ChildAt(120, 120);
     const Window upKey = help.ChildAt(2040, 1560);

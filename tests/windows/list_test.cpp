@@ -39,7 +39,7 @@ TEST_F(List, HoldsNamesOfAnyLength) {
   PressKey(VK_RETURN);
   ExpectPlayed("ZEBRA.SMC");
   window->Pictures[Delete].Click();
-  EXPECT_EQ(Answer(IDNO).Text, "Deletar o jogo ' " + names[1] + " ' ?");
+  EXPECT_EQ(Answer(IDNO), Of(Mensagem::DeletarJogo, names[1]));
   window->CloseByUser();
   EXPECT_SOON(program->HasEnded());
   EXPECT_EQ(program->ExitCode(), 0U);

@@ -41,10 +41,7 @@ TEST_F(Play, TellsHowToLeaveAGameAndRemembersThatAndTheGameAndTheWindow) {
   SetWindowPos(window->Handle(), nullptr, 30, 40, 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
   Select("Élan");
   window->Play.Click();
-  EXPECT_EQ(Answer(IDOK),
-            (Message{"Informação",
-                     "Para fechar o jogo precione e segure a tecla 'ALT' e simultaneamente aperte e tecla 'F4'",
-                     {IDOK}}));
+  EXPECT_EQ(Answer(IDOK), Of(Mensagem::ComoFecharOJogo));
   ExpectPlayed("elan.ZIP");
   EXPECT_EQ(Settings(), expected);
 
@@ -69,15 +66,15 @@ TEST_F(Play, WithTheSavesOnAFloppyDiskRewritesTheEmulatorsConfigurationWhenItDif
   ASSERT_SOON(window->FloppyChecked());
   const auto before = Settings();
   window->Play.Click();
-  EXPECT_EQ(Answer(IDCANCEL), NoDisk);
+  EXPECT_EQ(Answer(IDCANCEL), Of(Mensagem::SemDisquete));
   EXPECT_SOON(window->List.Focused());
   EXPECT_EQ(Settings(), before);
 
   window->Play.Click();
-  EXPECT_EQ(Answer(IDRETRY), NoDisk);
+  EXPECT_EQ(Answer(IDRETRY), Of(Mensagem::SemDisquete));
   ASSERT_SOON(FindMessage(*program));
   const FloppyDisk disk;
-  EXPECT_EQ(Answer(IDRETRY), NoDisk);
+  EXPECT_EQ(Answer(IDRETRY), Of(Mensagem::SemDisquete));
   ExpectPlayed("ZEBRA.SMC");
   EXPECT_EQ(Content("Emulador\\zsnesw.cfg"), EmulatorConfiguration("SaveDirectory = A:", games));
   last_write_time(file, last_write_time(file) - std::chrono::hours(1000));

@@ -4,7 +4,7 @@
 namespace {
 
 constexpr size_t Block = 4096;  // the disk gives its space away in blocks
-const Message DiskFull = {"Disco cheio", "Não há espaço livre suficiente em disco para completar a operação.", {IDOK}};
+const Message DiskFull = Of(Mensagem::DiscoCheio);
 
 size_t FreeOnFloppy() {
   ULARGE_INTEGER available{};
@@ -12,9 +12,10 @@ size_t FreeOnFloppy() {
   return static_cast<size_t>(available.QuadPart);
 }
 
-// A side of the manager: the files that it is to have, and how it is called.
+// A side of the manager: the files that it is to have, and what is asked before one of them is replaced or deleted.
 struct Side {
-  std::string Directory, Name, CopyFromHere;
+  std::string Directory, CopyFromHere;
+  Mensagem MayReplace, MayDelete;
   std::vector<bool> Offered;  // for an entry of its own
   Files Expected;
 };
@@ -64,8 +65,18 @@ class Saves : public Installation {
   }
 
   const FloppyDisk disk;
-  Side floppy = {"A:\\", "Disquete (A:)", "Copiar do disquete para o computador", FloppyOffered, {}};
-  Side computer = {Home + "Saves\\", "Computador", "Copiar do computador para o disquete", ComputerOffered, {}};
+  Side floppy = {"A:\\",
+                 "Copiar do disquete para o computador",
+                 Mensagem::SalvamentoNoDisquete,
+                 Mensagem::DeletarDoDisquete,
+                 FloppyOffered,
+                 {}};
+  Side computer = {Home + "Saves\\",
+                   "Copiar do computador para o disquete",
+                   Mensagem::SalvamentoNoComputador,
+                   Mensagem::DeletarDoComputador,
+                   ComputerOffered,
+                   {}};
   std::optional<SaveManager> manager;
 };
 
@@ -99,8 +110,7 @@ TEST_F(Saves, AreListedCopiedBothWaysAndReplacedAndDeletedOnYesOnly) {
       ExpectBothSides();
       Pick(*from, entry);
       manager->Copy.Click();
-      EXPECT_EQ(Answer(answer), Question("Salvamento já existente", "O salvamento selecionado já se encontra no " +
-                                                                        to->Name + ".\r\nVocê deseja substituí-lo ?"));
+      EXPECT_EQ(Answer(answer), Of(to->MayReplace));
     }
     ExpectCopied(*to, copy, from->Expected[source]);
     EXPECT_EQ(PaneOf(*to).Delete.Text(), "Excluir");
@@ -108,8 +118,7 @@ TEST_F(Saves, AreListedCopiedBothWaysAndReplacedAndDeletedOnYesOnly) {
       ExpectBothSides();
       Pick(*to, entry);
       PaneOf(*to).Delete.Click();
-      EXPECT_EQ(Answer(answer), Question("Confirmar deleção", "Deletar o salvamento do jogo '" + entry +
-                                                                  "' que está no " + to->Name + " ?"));
+      EXPECT_EQ(Answer(answer), Of(to->MayDelete, entry));
     }
     EXPECT_SOON_EQ(before, EntriesOf(*to));
     EXPECT_SOON_EQ(NothingOffered, manager->Offered());
@@ -137,7 +146,7 @@ TEST_F(Saves, ThatDoNotFitOnTheFloppyAreRefused) {
   {
     const HeldFile held(computer.Directory + "AGUA.zs2");
     manager->Copy.Click();
-    EXPECT_EQ(Answer(IDOK), Failure("Erro ao ler arquivo."));
+    EXPECT_EQ(Answer(IDOK), Of(Mensagem::ErroAoLer));
   }
   EXPECT_SOON_EQ(NothingOffered, manager->Offered());
   ExpectBothSides();

@@ -5,9 +5,7 @@
 
 namespace {
 
-const Message Configure = Question("Configuração",
-                                   "O Tolvaris não foi configurado.\r\n"
-                                   "Clique em 'Sim' para rodar o programa de auto-configuração.");
+const Message Configure = Of(Mensagem::SemConfiguracao);
 const std::string Autoconfiguration = Home + "tolvariscfg.exe";
 
 class FirstStart : public Installation {
@@ -27,8 +25,7 @@ TEST_F(FirstStart, EndsWhenItIsNotOrCannotBeConfigured) {
   EXPECT_EQ(Content("tolvariscfg.exe.call"), "");
   Remove("tolvariscfg.exe");
   Run();
-  EXPECT_EQ(Answer(IDOK), Failure("Não foi possível configurar o Tolvaris, o programa de auto-configuração não foi "
-                                  "encontrado.\r\nReinstale o programa."));
+  EXPECT_EQ(Answer(IDOK), Of(Mensagem::SemConfigurador));
   EXPECT_SOON(program->HasEnded());
 }
 
@@ -68,7 +65,7 @@ class ControllerHelp : public Installation {};
 TEST_F(ControllerHelp, ComesOnceBeforeTheMainWindow) {
   Set("AvisoControle", "");
   Run();
-  EXPECT_EQ(Answer(IDOK), (Message{"Informação", "Guarde os comandos do controle. Se necessário anote-os.", {IDOK}}));
+  EXPECT_EQ(Answer(IDOK), Of(Mensagem::GuardeOsComandos));
   EXPECT_FALSE(FindVisible(*program, "Tolvaris"));
   const Window help = FindVisible(*program, "Controle");
   const Window upKey = help.ChildAt(2040, 1560);

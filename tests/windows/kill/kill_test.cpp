@@ -11,7 +11,7 @@
 namespace {
 
 const std::string Floppy = "A:\\";
-const Message Added = {"Ok", "Jogo adicionado com sucesso.", {IDOK}}, Saved = {"Ok", "Arquivo salvo.", {IDOK}};
+const Message Added = Of(Mensagem::JogoAdicionado), Saved = Of(Mensagem::ArquivoSalvo);
 
 int Kills() {
   const char* const wanted = std::getenv("TOLVARIS_KILLS");
@@ -67,12 +67,10 @@ class Kill : public Installation {
   }
 
   void PressButton(int button) const { Window(GetDlgItem(FindMessage(*program).Handle(), button)).Click(); }
-  void AwaitQuestion() const {
-    ASSERT_SOON(FindMessage(*program) && FindMessage(*program).Text().starts_with("Confirmar"));
-  }
-  bool Told() const {
+  // Whether a message that is titled like this one is there.
+  bool Told(const Message& one) const {
     const Window message = FindMessage(*program);
-    return message && message.Text() == "Ok";
+    return message && message.Text() == one.Title;
   }
 
   // Files of the operation are old again, and nothing of a round before is left.
@@ -186,7 +184,7 @@ TEST_F(Kill, ImportOfARom) {
          FileDialog(*program).Type(path);
        },
        [] { PressKey(VK_RETURN); },
-       [&] { return Told(); },
+       [&] { return Told(Added); },
        [&] { EXPECT_EQ(Answer(IDOK), Added); }});
 }
 
@@ -203,10 +201,10 @@ TEST_F(Kill, PackageOverAGame) {
        {{game, rom}, {preview, picture}},
        [&] {
          Choose(Import, Outside + "jogo.tvk");
-         AwaitQuestion();
+         ASSERT_SOON(Told(Of(Mensagem::JogoJaExiste)));
        },
        [&] { PressButton(IDYES); },
-       [&] { return Told(); },
+       [&] { return Told(Added); },
        [&] { EXPECT_EQ(Answer(IDOK), Added); }});
 }
 
@@ -225,10 +223,10 @@ TEST_F(Kill, ExportOverAFile) {
        [&] {
          Select("Élan");
          Choose(Export, path);
-         AwaitQuestion();
+         ASSERT_SOON(Told(Of(Mensagem::ArquivoJaExiste)));
        },
        [&] { PressButton(IDYES); },
-       [&] { return Told(); },
+       [&] { return Told(Saved); },
        [&] { EXPECT_EQ(Answer(IDOK), Saved); },
        false});
 }

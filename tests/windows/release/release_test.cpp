@@ -3,6 +3,7 @@
 #include <cstdlib>
 
 #include "tests/windows/files.h"
+#include "tests/windows/messages.h"
 #include "tests/windows/program_windows.h"
 
 namespace {
@@ -61,7 +62,9 @@ struct Words {
   std::string Configuration, Frame, Save, Controller, Close, Play, Information;
 };
 const Words Portuguese = {
-    "Configuração do Tolvaris", " Configuração ", "&Gravar", "Controle", "&Fechar", "Jogar", "Informação"};
+    "Configuração do Tolvaris",          " Configuração ", "&Gravar", "Controle", "&Fechar", "Jogar",
+    TitleOf(Mensagem::GuardeOsComandos),
+};
 const Words English = {
     "Tolvaris configuration", "Configuration", "&Save", "Controller", "&Close", "Play", "Information"};
 
