@@ -74,7 +74,7 @@ std::optional<Pacote> LerPacote(std::string_view Conteudo) {
     valores[i] = *valor;
   }
   const auto& [nome, dosName, crc, iImg, tImg, iRom, tRom] = valores;
-  if (!NomeDeArquivo(nome) || !NomeDeArquivo(dosName)) return std::nullopt;
+  if (!NomeSeguro(nome) || !NomeSeguro(dosName)) return std::nullopt;
   const auto inicioImagem = LerNumero(iImg), tamanhoImagem = LerNumero(tImg);
   const auto inicioRom = LerNumero(iRom), tamanhoRom = LerNumero(tRom);
   if (!inicioImagem || !tamanhoImagem || !inicioRom || !tamanhoRom) return std::nullopt;

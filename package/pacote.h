@@ -23,7 +23,7 @@ std::string MontarPacote(std::string_view Nome, std::string_view DOSName, std::s
                          std::string_view Rom);
 
 // What a package file's content holds; nothing when it is no package, or one of whose names cannot name a file
-// (NomeDeArquivo). Blocks that the content is too short for are cut short.
+// (NomeSeguro). Blocks that the content is too short for are cut short.
 std::optional<Pacote> LerPacote(std::string_view Conteudo);
 
 // Not for a content that is gone before the blocks are used.
@@ -33,4 +33,4 @@ std::optional<Pacote> LerPacote(Passageiro&& Conteudo) = delete;
 // Whether this name and an extension make the name of a plain file in whichever directory they are appended to. False
 // for what would lead elsewhere: a path separator, a drive or stream (":"), a control character, a device (CON, NUL,
 // COM1, ...). True for the empty name, and for what the platform refuses by itself when the file is created.
-bool NomeDeArquivo(std::string_view Nome);
+bool NomeSeguro(std::string_view Nome);

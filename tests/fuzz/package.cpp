@@ -30,7 +30,7 @@ void WriteAndRead(std::string_view name, std::string_view dosName, std::string_v
   const auto read = LerPacote(content);
   if (!IsFree(name) || !IsFree(dosName) || !IsFree(checksum)) return;
   const bool fits = content.size() - picture.size() - rom.size() <= LongestHeader;
-  const bool complete = !picture.empty() && !rom.empty() && NomeDeArquivo(name) && NomeDeArquivo(dosName);
+  const bool complete = !picture.empty() && !rom.empty() && NomeSeguro(name) && NomeSeguro(dosName);
   Require(read.has_value() == (fits && complete));
   if (!read) return;
   Require(read->Nome == name && read->DOSName == dosName && read->CRC == checksum && read->Imagem == picture &&

@@ -111,8 +111,8 @@ TEST(FileName, IsNoneThatWouldLeaveItsDirectory) {
   const std::string inside[] = {
       "CONTRA", "COM10", "COMX", "LPT", "Super CON", " CON", "..", "Jogo Bros. ", "Quem? *<>\"", "Ação|Pão=1"_ansi,
   };
-  for (const auto& each : outside) EXPECT_FALSE(NomeDeArquivo(each)) << each;
-  for (const auto& each : inside) EXPECT_TRUE(NomeDeArquivo(each)) << each;
+  for (const auto& each : outside) EXPECT_FALSE(NomeSeguro(each)) << each;
+  for (const auto& each : inside) EXPECT_TRUE(NomeSeguro(each)) << each;
 }
 
 TEST(Package, WhatIsWrittenIsReadBack) {

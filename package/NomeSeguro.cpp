@@ -27,7 +27,7 @@ bool NomeiaDispositivo(std::string_view Nome) {
 
 }  // namespace
 
-bool NomeDeArquivo(std::string_view Nome) {
+bool NomeSeguro(std::string_view Nome) {
   const auto levaFora = [](char Letra) {
     return static_cast<unsigned char>(Letra) < ' ' || Letra == '\\' || Letra == '/' || Letra == ':';
   };
