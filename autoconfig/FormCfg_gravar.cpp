@@ -1,6 +1,6 @@
 // Saving the settings.
 #include "autoconfig/FormCfg.h"
-#include "autoconfig/configuracao_nova.h"
+#include "autoconfig/forma_nova.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"

@@ -99,7 +99,7 @@ class Form1 : public platform::Window {
   bool EsperarDisquete();  // false: the user gave up
   std::optional<std::string> DirSavesDoJogo();
   void AvisarALTF4();
-  void GravarAjustes(const std::string& UltimoJogo);
+  void GravarPartida(const std::string& UltimoJogo);
   void IniciarEmulador(const Jogo& Escolhido);
 
   // A copy of the selected game's row (pending events may rebuild the table) when it and its ROM file are there;

@@ -2,7 +2,7 @@
 #include "catalog/cls_DAT.h"
 #include "controller/Form3.h"
 #include "mainwindow/Form1.h"
-#include "mainwindow/ajustes.h"
+#include "mainwindow/janela_inicial.h"
 #include "platform/events.h"
 #include "platform/registry.h"
 #include "platform/screen.h"

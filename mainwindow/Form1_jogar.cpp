@@ -21,7 +21,7 @@ void ConfigurarEmulador(const std::string& DirSavesDoJogo) {
   const bool existe = arquivo.IsOpen();
   arquivo.Close();
   if (existe && !texto) return;
-  const auto nova = !texto || texto->empty() ? ConfiguracaoNova(DirSavesDoJogo, DirRoms)
+  const auto nova = !texto || texto->empty() ? ConfiguracaoInicial(DirSavesDoJogo, DirRoms)
                                              : ConfiguracaoAtualizada(*texto, DirSavesDoJogo, DirRoms);
   if (nova) Substituicao(ArquivoCfgEmulador, *nova, existe ? Existing::Replace : Existing::Keep).Concluir();
 }
@@ -45,7 +45,7 @@ void Form1::Command1_Click() {
   if (!dirSavesEscolhido) return;
   AvisarALTF4();
   ConfigurarEmulador(*dirSavesEscolhido);
-  GravarAjustes(nome);
+  GravarPartida(nome);
   platform::RunPendingEvents();
   IniciarEmulador(*escolhido);
   JogoIniciado = true;
@@ -89,7 +89,7 @@ void Form1::AvisarALTF4() {
   GravarAjuste("AvisoALTF4", "1");
 }
 
-void Form1::GravarAjustes(const std::string& UltimoJogo) {
+void Form1::GravarPartida(const std::string& UltimoJogo) {
   GravarAjuste("LRom", UltimoJogo);
   GravarAjuste("Disquete", std::to_string(Check1.Value()));
   GravarAjuste("pl", std::to_string(Left()));

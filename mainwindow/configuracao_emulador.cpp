@@ -28,7 +28,7 @@ std::size_t FimDaLinha(const std::string& Texto, std::size_t Posicao) {
 }
 
 // Every occurrence, from the start; in one pass, since a hostile file can hold very many.
-std::string Substituir(const std::string& Texto, const std::string& Antigo, const std::string& Novo) {
+std::string TrocarTodas(const std::string& Texto, const std::string& Antigo, const std::string& Novo) {
   std::string resultado;
   std::size_t posicao = 0;
   for (auto achado = Texto.find(Antigo); achado != std::string::npos; achado = Texto.find(Antigo, posicao)) {
@@ -49,13 +49,13 @@ bool AtualizarEntrada(std::string& Texto, const Entrada& Nova) {
   }
   const std::string antiga = Texto.substr(inicio, FimDaLinha(Texto, inicio) - inicio);
   if (platform::CharUpperBuffA(antiga) == platform::CharUpperBuffA(Nova.Linha)) return false;
-  Texto = Substituir(Texto, antiga, Nova.Linha);
+  Texto = TrocarTodas(Texto, antiga, Nova.Linha);
   return true;
 }
 
 }  // namespace
 
-std::string ConfiguracaoNova(const std::string& DirSaves, const std::string& DirRoms) {
+std::string ConfiguracaoInicial(const std::string& DirSaves, const std::string& DirRoms) {
   return std::string(FimDeLinha)
       .append(EntradaSaves(DirSaves).Linha)
       .append(FimDeLinha)

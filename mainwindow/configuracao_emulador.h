@@ -5,7 +5,7 @@
 #include <string>
 
 // The contents of a new file with only the two entries. Directories end with a backslash, which is left out.
-std::string ConfiguracaoNova(const std::string& DirSaves, const std::string& DirRoms);
+std::string ConfiguracaoInicial(const std::string& DirSaves, const std::string& DirRoms);
 
 // The text with its entries SaveDirectory and GameDirectory naming these directories, all else as it was; nothing
 // when both already do, in any letter case.

@@ -32,10 +32,10 @@ std::optional<std::string> LerAteFim(platform::File& Arquivo, std::int64_t Posic
 }
 
 // A file that was deleted before writing at a later position begins with zeros.
-bool Substituir(const std::string& Caminho, std::string_view Texto, std::int64_t Posicao) {
+bool GravarDoZero(const std::string& Caminho, std::string_view Texto, std::int64_t Posicao) {
   if (Posicao > 0) {
     try {
-      return Substituir(Caminho, std::string(static_cast<std::size_t>(Posicao), '\0').append(Texto), 0);
+      return GravarDoZero(Caminho, std::string(static_cast<std::size_t>(Posicao), '\0').append(Texto), 0);
     } catch (const std::bad_alloc&) {
       return false;
     }
@@ -99,7 +99,7 @@ std::optional<std::string> LerInteiro(platform::File& Arquivo) { return LerAteFi
 int GravarArquivo(const std::string& Caminho, std::string_view Texto, std::int32_t Posicao, bool ApagarAntes) {
   if (Posicao < -1) return -1;
   const std::int64_t inicio = Posicao == 0 ? 0 : Posicao - 1;  // below 0: the end
-  const bool gravado = ApagarAntes ? Substituir(Caminho, Texto, std::max<std::int64_t>(inicio, 0))
+  const bool gravado = ApagarAntes ? GravarDoZero(Caminho, Texto, std::max<std::int64_t>(inicio, 0))
                                    : GravarNoLugar(Caminho, {Texto, inicio, false});
   return gravado ? 1 : -1;
 }

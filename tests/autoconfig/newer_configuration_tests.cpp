@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "autoconfig/configuracao_nova.h"
+#include "autoconfig/forma_nova.h"
 #include "platform/text.h"
 
 namespace {

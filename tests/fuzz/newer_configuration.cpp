@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "autoconfig/configuracao_nova.h"
+#include "autoconfig/forma_nova.h"
 #include "platform/text.h"
 #include "tests/fuzz/target.h"
 

@@ -1,4 +1,4 @@
-#include "mainwindow/ajustes.h"
+#include "mainwindow/janela_inicial.h"
 #include "support/mod_Configuracao.h"
 #include "tests/mainwindow/menu.h"
 

@@ -1,4 +1,4 @@
-#include "autoconfig/configuracao_nova.h"
+#include "autoconfig/forma_nova.h"
 
 #include "platform/text.h"
 

@@ -1,4 +1,4 @@
-// What start-up makes of the texts in the settings: pure functions.
+// How the window begins: what start-up makes of the texts in the settings. Pure functions.
 #pragma once
 
 #include <optional>
