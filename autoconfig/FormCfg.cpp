@@ -7,6 +7,7 @@
 #include "autoconfig/procura.h"
 #include "platform/events.h"
 #include "platform/files.h"
+#include "platform/keys.h"
 #include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
@@ -40,7 +41,6 @@ constexpr std::array<Linha, 5> Linhas = {{{"Emulador:", &Ajustes::EmuExe},
                                           {"Imagens:", &Ajustes::ImgDir}}};
 
 constexpr std::uint32_t IntervaloTimer1 = 50;
-constexpr int Enter = 13;
 
 platform::WindowStyle Janela() {
   return {.Caption = "Configuração do Tolvaris"_ansi, .ClientWidth = 8400, .ClientHeight = 5295, .CloseOnEscape = true};
@@ -173,7 +173,7 @@ void FormCfg::MostrarEscolha() {
 void FormCfg::List1_Click() { MostrarEscolha(); }
 
 void FormCfg::List1_KeyDown(int KeyCode) {
-  if (KeyCode == Enter) Command1_Click();
+  if (KeyCode == platform::KeyEnter) Command1_Click();
 }
 
 void FormCfg::Command2_Click() { Close(); }

@@ -7,6 +7,7 @@
 #include "mainwindow/Form1.h"
 #include "platform/events.h"
 #include "platform/files.h"
+#include "platform/keys.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
@@ -15,7 +16,6 @@
 namespace {
 
 constexpr char PadraoRoms[] = "*.zip;*.smc";
-constexpr int TeclaEnter = 13;
 
 void CriarDiretoriosQueFaltam() {
   for (const std::string* diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
@@ -121,7 +121,7 @@ void Form1::List1_DblClick() {
 }
 
 void Form1::List1_KeyDown(int KeyCode) {
-  if (KeyCode == TeclaEnter && Command1.Enabled()) Command1_Click();
+  if (KeyCode == platform::KeyEnter && Command1.Enabled()) Command1_Click();
 }
 
 void Form1::Timer1_Tick() {

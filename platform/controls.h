@@ -145,7 +145,8 @@ class ListBox : public Control {
 
   std::function<void()> OnClick;  // the user selected an entry, by mouse or keyboard
   std::function<void()> OnDoubleClick;
-  // Before the list acts on the key; 13 is Enter. Once for a key that is held down, on which the list goes on acting.
+  // Before the list acts on the key (platform/keys.h). Once for a key that is held down, on which the list goes on
+  // acting.
   std::function<void(int keyCode)> OnKeyDown;
 };
 

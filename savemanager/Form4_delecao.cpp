@@ -1,24 +1,19 @@
 // Deleting the picked file.
+#include "platform/keys.h"
 #include "savemanager/Form4.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
-
-namespace {
-
-constexpr int TeclaDelete = 46;
-
-}  // namespace
 
 void Form4::Image1_Click() { Deletar(disquete_); }
 
 void Form4::Image2_Click() { Deletar(computador_); }
 
 void Form4::List1_KeyDown(int KeyCode) {
-  if (KeyCode == TeclaDelete) Image1_Click();
+  if (KeyCode == platform::KeyDelete) Image1_Click();
 }
 
 void Form4::List2_KeyDown(int KeyCode) {
-  if (KeyCode == TeclaDelete) Image2_Click();
+  if (KeyCode == platform::KeyDelete) Image2_Click();
 }
 
 void Form4::Deletar(const Painel& Este) {

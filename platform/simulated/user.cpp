@@ -2,6 +2,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "platform/keys.h"
 #include "platform/simulated/machine.h"
 
 namespace platform::simulated {
@@ -36,11 +37,10 @@ const WindowFacts* ActiveWindow() {
 
 // Where the keys that move the selection lead; nothing for other keys.
 std::optional<int> Destination(int keyCode, int selected, int count) {
-  constexpr int end = 35, home = 36, up = 38, down = 40;
-  if (keyCode == end) return count - 1;
-  if (keyCode == home) return 0;
-  if (keyCode == up) return std::max(selected - 1, 0);
-  if (keyCode == down) return std::min(selected + 1, count - 1);
+  if (keyCode == KeyEnd) return count - 1;
+  if (keyCode == KeyHome) return 0;
+  if (keyCode == KeyUp) return std::max(selected - 1, 0);
+  if (keyCode == KeyDown) return std::min(selected + 1, count - 1);
   return std::nullopt;
 }
 
