@@ -3,12 +3,14 @@
 #include <algorithm>
 #include <array>
 #include <iterator>
+#include <string_view>
 #include <utility>
 
 #include "platform/environment.h"
 #include "platform/files.h"
 #include "platform/text.h"
 #include "platform/wildcards.h"
+#include "support/brancos.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 
@@ -26,14 +28,12 @@ std::string ComBarra(std::string Diretorio) {
 }
 
 // What stands between semicolons, without quotes and blanks around it.
-std::vector<std::string> Partes(const std::string& Texto) {
+std::vector<std::string> Partes(std::string_view Texto) {
   std::vector<std::string> achadas;
   for (std::size_t inicio = 0; inicio < Texto.size();) {
     const std::size_t fim = std::min(Texto.find(';', inicio), Texto.size());
-    const auto primeiro = Texto.find_first_not_of(" \"", inicio);
-    if (primeiro < fim) {
-      achadas.push_back(Texto.substr(primeiro, Texto.find_last_not_of(" \"", fim - 1) - primeiro + 1));
-    }
+    const std::string_view parte = SemBrancos(Texto.substr(inicio, fim - inicio), " \"");
+    if (!parte.empty()) achadas.emplace_back(parte);
     inicio = fim + 1;
   }
   return achadas;

@@ -6,6 +6,7 @@
 
 #include "package/pacote.h"
 #include "platform/text.h"
+#include "support/brancos.h"
 
 namespace {
 
@@ -41,12 +42,8 @@ std::optional<std::string_view> AcharValor(const Cabecalho& Onde, std::string_vi
 
 // Plain digits with blanks around them, from 1 to the largest signed 32-bit number.
 std::optional<std::int64_t> LerNumero(std::string_view Texto) {
-  constexpr std::string_view brancos = " \t";
-  const std::size_t inicio = Texto.find_first_not_of(brancos);
-  if (inicio == std::string_view::npos) return std::nullopt;
-  Texto = Texto.substr(inicio, Texto.find_last_not_of(brancos) + 1 - inicio);
   std::int64_t numero = 0;
-  for (const char digito : Texto) {
+  for (const char digito : SemBrancos(Texto, " \t")) {
     if (digito < '0' || digito > '9') return std::nullopt;
     numero = numero * 10 + (digito - '0');
     if (numero > std::numeric_limits<std::int32_t>::max()) return std::nullopt;

@@ -6,6 +6,8 @@
 #include <limits>
 #include <string_view>
 
+#include "support/brancos.h"
+
 namespace {
 
 using platform::RegistryKey;
@@ -121,12 +123,6 @@ void CriarCaminhoChave(const Raiz& Onde, const std::string& Caminho) {
   if (!ChaveExiste(Onde, Caminho)) CriarChave(Onde, Caminho);
 }
 
-std::string_view SemBrancos(std::string_view Texto) {
-  const auto inicio = Texto.find_first_not_of(" \t");
-  if (inicio == std::string_view::npos) return {};
-  return Texto.substr(inicio, Texto.find_last_not_of(" \t") - inicio + 1);
-}
-
 }  // namespace
 
 std::string TextoDe(const Valor& Value) {
@@ -141,7 +137,7 @@ std::optional<std::int32_t> InteiroDe(const Valor& Value) {
   if (const auto* longo = std::get_if<std::int32_t>(&Value)) return *longo;
   const auto* texto = std::get_if<std::string>(&Value);
   if (texto == nullptr) return std::nullopt;
-  std::string_view digitos = SemBrancos(*texto);
+  std::string_view digitos = SemBrancos(*texto, " \t");
   if (digitos.starts_with('+') && !digitos.starts_with("+-")) digitos.remove_prefix(1);
   std::int32_t numero = 0;
   const auto [fim, erro] = std::from_chars(digitos.data(), digitos.data() + digitos.size(), numero);

@@ -6,6 +6,7 @@
 #include "platform/files.h"
 #include "platform/messages.h"
 #include "platform/text.h"
+#include "support/brancos.h"
 #include "support/caminhos.h"
 
 namespace {
@@ -23,12 +24,6 @@ std::string ComBrancos(const std::string& Nome) {
   return Nome + std::string(Nome.size() < maximo ? maximo - Nome.size() : 1, ' ');
 }
 
-std::string SemBrancos(std::string_view Texto) {
-  const auto inicio = Texto.find_first_not_of(' ');
-  if (inicio == std::string_view::npos) return "";
-  return std::string(Texto.substr(inicio, Texto.find_last_not_of(' ') - inicio + 1));
-}
-
 std::string Perguntar(Dialogo Mostrar, platform::OpenFileName Pedido, std::string& Filtro) {
   if (Filtro.empty()) Filtro = TodosOsArquivos;
   Pedido.Filter = Filtro;
@@ -36,7 +31,7 @@ std::string Perguntar(Dialogo Mostrar, platform::OpenFileName Pedido, std::strin
   Pedido.FileSize = TamanhoBuffer;
   if (!Mostrar(Pedido)) return "";
   const std::string_view escolhido = Pedido.File;
-  return SemBrancos(escolhido.substr(0, escolhido.find('\0')));
+  return std::string(SemBrancos(escolhido.substr(0, escolhido.find('\0')), " "));
 }
 
 // True for a file that the disk lists under this name, in whatever letter case.
