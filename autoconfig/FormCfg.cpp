@@ -165,7 +165,7 @@ Ajustes FormCfg::AjustesEscolhidos() const { return AjustesPara(Selecionado(), a
 void FormCfg::MostrarEscolha() {
   const Ajustes novos = AjustesEscolhidos();
   for (std::size_t i = 0; i < Linhas.size(); ++i) {
-    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(novos.*Linhas[i].Texto, ""), LarguraNoQuadro));
+    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(novos.*Linhas[i].Texto), LarguraNoQuadro));
   }
   Command1.Enable(!Selecionado().empty());
 }

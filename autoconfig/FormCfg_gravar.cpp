@@ -21,7 +21,7 @@ void FormCfg::Command1_Click() {
 
 // What is set already is taken as it is.
 bool FormCfg::Conferir(const Ajustes& Novos) const {
-  for (const NomeDeAjuste& cada : NomesDosAjustes) {
+  for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
     const std::string& novo = Novos.*cada.Texto;
     const auto motivo = novo == atuais_.*cada.Texto ? std::nullopt : Impedimento(novo);
     if (!motivo) continue;
@@ -33,16 +33,16 @@ bool FormCfg::Conferir(const Ajustes& Novos) const {
     MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
     return false;
   }
-  const std::string emulador = CaminhoConfigurado(Novos.EmuExe, "");
+  const std::string emulador = CaminhoConfigurado(Novos.EmuExe);
   if (TemBranco(emulador)) MostrarMensagem(Mensagem::EmuladorComEspacos, emulador);
   return true;
 }
 
 bool FormCfg::ConfigurarFormaNova(const Ajustes& Novos) const {
-  const std::string arquivo = CaminhoConfigurado(Novos.EmuCFG, "");
+  const std::string arquivo = CaminhoConfigurado(Novos.EmuCFG);
   const std::string texto = LerArquivo(arquivo);
   if (!FormaNova(texto)) return true;
-  const auto novo = ComDiretorios(texto, CaminhoConfigurado(Novos.RomDir, ""), CaminhoConfigurado(Novos.SaveDir, ""));
+  const auto novo = ComDiretorios(texto, CaminhoConfigurado(Novos.RomDir), CaminhoConfigurado(Novos.SaveDir));
   if (!novo) return true;
   const Answer resposta = MostrarMensagem(Mensagem::ConfiguracaoMaisNova);
   if (resposta != Answer::Yes) return resposta == Answer::No;

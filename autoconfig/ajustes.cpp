@@ -7,7 +7,6 @@
 #include "platform/text.h"
 #include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
-#include "support/mod_Configuracao.h"
 #include "support/mod_Globais.h"
 
 namespace {
@@ -28,14 +27,8 @@ std::string LerTexto(const cls_REG& Registro, const char* Nome) {
 
 }  // namespace
 
-Ajustes LerAjustes(const cls_REG& Registro) {
-  Ajustes lidos;
-  for (const NomeDeAjuste& cada : NomesDosAjustes) lidos.*cada.Texto = LerTexto(Registro, cada.Nome);
-  return lidos;
-}
-
 bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos) {
-  return std::all_of(NomesDosAjustes.begin(), NomesDosAjustes.end(), [&](const NomeDeAjuste& Cada) {
+  return std::all_of(AjustesDeCaminhos.begin(), AjustesDeCaminhos.end(), [&](const AjusteDeCaminho& Cada) {
     const std::string& novo = Novos.*Cada.Texto;
     if (LerTexto(Registro, Cada.Nome) == novo) return true;
     Registro.SetValue(platform::RootCurrentUser, ChaveConfiguracao, Cada.Nome, novo);
@@ -45,15 +38,12 @@ bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos) {
 
 Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Outro) {
   Ajustes novos = Atuais;
-  const auto preencher = [](std::string& Ajuste, bool Mudar, const std::string& Texto) {
-    if (Mudar || Ajuste.empty()) Ajuste = Texto;
-  };
-  preencher(novos.RomDir, false, CaminhoRelativo(DirPrograma + "Roms\\"));
-  preencher(novos.SaveDir, false, CaminhoRelativo(DirPrograma + "Saves\\"));
-  preencher(novos.ImgDir, false, CaminhoRelativo(DirPrograma + "Imgs\\"));
+  for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
+    if ((novos.*cada.Texto).empty()) novos.*cada.Texto = cada.Padrao;
+  }
   if (Emulador.empty()) return novos;
-  preencher(novos.EmuExe, Outro, AjusteDoEmulador(Emulador));
-  preencher(novos.EmuCFG, Outro, CaminhoRelativo(ConfiguracaoDoEmulador(Emulador)));
+  if (Outro || novos.EmuExe.empty()) novos.EmuExe = AjusteDoEmulador(Emulador);
+  if (Outro || novos.EmuCFG.empty()) novos.EmuCFG = CaminhoRelativo(ConfiguracaoDoEmulador(Emulador));
   return novos;
 }
 

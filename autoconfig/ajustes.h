@@ -1,32 +1,12 @@
 // The settings that this program fills in, and what they become.
 #pragma once
 
-#include <array>
 #include <optional>
 #include <string>
 
 #include "support/cls_REG.h"
 #include "support/mensagens.h"
-
-// As the settings hold them: a leading backslash stands for the program's directory; empty: not set.
-struct Ajustes {
-  std::string RomDir, SaveDir, ImgDir;  // directories, with a backslash at their end
-  std::string EmuExe, EmuCFG;           // the emulator's program and configuration files
-};
-
-struct NomeDeAjuste {
-  const char* Nome;
-  std::string Ajustes::*Texto;
-};
-
-// In the order in which they are written: only with the last one is the program configured.
-inline constexpr std::array<NomeDeAjuste, 5> NomesDosAjustes = {{{"RomDir", &Ajustes::RomDir},
-                                                                 {"SaveDir", &Ajustes::SaveDir},
-                                                                 {"ImgDir", &Ajustes::ImgDir},
-                                                                 {"EmuExe", &Ajustes::EmuExe},
-                                                                 {"EmuCFG", &Ajustes::EmuCFG}}};
-
-Ajustes LerAjustes(const cls_REG& Registro);
+#include "support/mod_Configuracao.h"
 
 // Writes what differs from the settings. False when they do not hold all of it afterwards.
 bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos);

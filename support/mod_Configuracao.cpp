@@ -1,11 +1,8 @@
 #include "support/mod_Configuracao.h"
 
-#include <array>
-
 #include "platform/files.h"
 #include "platform/registry.h"
 #include "support/mod_Arquivos.h"
-#include "support/mod_Globais.h"
 
 void DefinirDirPrograma() {
   DirPrograma = platform::ProgramDirectory();
@@ -17,24 +14,22 @@ void EscolherIdioma() {
   if (!ArquivoExiste(ArquivoIdioma)) ArquivoIdioma.clear();
 }
 
+Ajustes LerAjustes(const cls_REG& Registro) {
+  Ajustes lidos;
+  for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
+    lidos.*cada.Texto = TextoDe(Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, cada.Nome));
+  }
+  return lidos;
+}
+
 void LerCaminhos(const cls_REG& Registro) {
-  struct Caminho {
-    std::string& Destino;
-    const char* Ajuste;
-    std::string Padrao;
-  };
-  const std::array<Caminho, 5> caminhos = {{{DirRoms, "RomDir", DirPrograma + "Roms\\"},
-                                            {DirSaves, "SaveDir", DirPrograma + "Saves\\"},
-                                            {DirImgs, "ImgDir", DirPrograma + "Imgs\\"},
-                                            {ArquivoEmulador, "EmuExe", ""},
-                                            {ArquivoCfgEmulador, "EmuCFG", ""}}};
-  for (const Caminho& cada : caminhos) {
-    const Valor texto = Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, cada.Ajuste);
-    cada.Destino = CaminhoConfigurado(TextoDe(texto), cada.Padrao);
+  const Ajustes lidos = LerAjustes(Registro);
+  for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
+    const std::string& texto = lidos.*cada.Texto;
+    *cada.Destino = CaminhoConfigurado(texto.empty() ? cada.Padrao : texto);
   }
 }
 
-std::string CaminhoConfigurado(const std::string& Texto, const std::string& Padrao) {
-  if (Texto.empty()) return Padrao;
+std::string CaminhoConfigurado(const std::string& Texto) {
   return Texto.starts_with('\\') ? DirPrograma + Texto.substr(1) : Texto;
 }

@@ -27,7 +27,7 @@ struct Configurator : FreshMachine {
   // RomDir, SaveDir, ImgDir, EmuExe and EmuCFG as they are stored; "-": not set.
   static Texts Stored() {
     Texts texts;
-    for (const NomeDeAjuste& each : NomesDosAjustes) texts.push_back(StoredText(Key, each.Nome).value_or("-"));
+    for (const AjusteDeCaminho& each : AjustesDeCaminhos) texts.push_back(StoredText(Key, each.Nome).value_or("-"));
     return texts;
   }
 
@@ -103,7 +103,7 @@ TEST_F(Configurator, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
     AddDisk('D', 1 << 20);
     for (const std::string& file : {mine, Emulator, DosEmulator}) PutFile(file, "MZ");
     for (std::size_t i = 0; i < before.size(); ++i) {
-      if (before[i] != "-") PutText(Key, NomesDosAjustes[i].Nome, before[i]);
+      if (before[i] != "-") PutText(Key, AjustesDeCaminhos[i].Nome, before[i]);
     }
     OpenAndSearch();
     EXPECT_EQ(form->List1.Selected(), 0);

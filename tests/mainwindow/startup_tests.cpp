@@ -86,7 +86,7 @@ TEST_F(Startup, DefaultsInANetworkDirectoryAreWhereTheProgramIs) {
   DirPrograma = "\\\\casa\\jogos\\";
   LerCaminhos({});
   EXPECT_EQ(DirRoms, "\\\\casa\\jogos\\Roms\\");
-  EXPECT_EQ(CaminhoConfigurado("\\Roms\\", "unused"), "\\\\casa\\jogos\\Roms\\");
+  EXPECT_EQ(CaminhoConfigurado("\\Roms\\"), "\\\\casa\\jogos\\Roms\\");
 }
 
 TEST_F(Startup, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
