@@ -12,21 +12,8 @@ import sys
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 LONGEST = 400  # lines
 
-# Who may include whose headers, besides its own: app -> windows -> collection -> package, catalog -> support -> platform.
-SUPPORT = {"platform", "support"}
-WINDOW = SUPPORT | {"catalog", "package", "collection", "resources"}
-MAY_INCLUDE = {
-    "platform": {"resources"},
-    "support": {"platform"},
-    "catalog": SUPPORT,
-    "package": SUPPORT,
-    "collection": SUPPORT | {"catalog", "package"},
-    "controller": WINDOW,
-    "savemanager": WINDOW,
-    "mainwindow": WINDOW | {"controller", "savemanager"},
-    "autoconfig": SUPPORT,
-    "app": WINDOW | {"controller", "savemanager", "mainwindow"},
-}
+# A library of a folder, as CMakeLists.txt makes it: its name, the folder, and what it is linked with.
+LIBRARY = re.compile(r"^\s*tolvaris_folder\((\w+)\s+(\w+)[\w/]*([^)]*)\)", re.MULTILINE)
 SYSTEM_HEADERS = re.compile(r"(platform|tests|benchmarks)/windows/|tests/contract/\w+_windows\.cpp$")
 TWIN_HEADERS = ("platform/simulated/", "tests/", "benchmarks/")
 INCLUDE = re.compile(r'^\s*#\s*include\s*[<"]([^>"]+)[>"]')
@@ -44,7 +31,19 @@ MESSAGE = re.compile(r'MessageBoxA\(|Traduzir\("')
 SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "collection/", "controller/", "mainwindow/", "package/", "savemanager/")
 
 
-def check_include(name, included):
+def layers():
+    """Of each folder that is a library: the folders that it is linked with, directly or through others."""
+    libraries = LIBRARY.findall((ROOT / "CMakeLists.txt").read_text(encoding="utf-8"))
+    folders = {name: folder for name, folder, _ in libraries}
+    below = {folder: set() for folder in folders.values()}
+    for _ in libraries:
+        for _, folder, linked in libraries:
+            for other in (folders[name] for name in linked.split() if name in folders):
+                below[folder] |= {other} | below[other]
+    return below
+
+
+def check_include(name, included, below):
     folder, _, _ = name.partition("/")
     other, separator, _ = included.partition("/")
     if included.lower() == "windows.h" and not SYSTEM_HEADERS.match(name):
@@ -53,18 +52,18 @@ def check_include(name, included):
         yield f"includes {included}, which is for tests"
     if included.startswith("platform/windows/") and not name.startswith(("platform/windows/", "tests/contract/")):
         yield f"includes {included}, which is for its own folder"
-    if folder in MAY_INCLUDE and separator and (ROOT / other).is_dir():
-        if other != folder and other not in MAY_INCLUDE[folder]:
-            yield f"includes {included}: {folder} must not know {other}"
+    if folder in below and separator and (ROOT / other).is_dir():
+        if other not in below[folder] | {folder, "resources"}:
+            yield f"includes {included}: {folder} is not linked with {other}"
 
 
-def check_source(name):
+def check_source(name, below):
     lines = (ROOT / name).read_text(encoding="utf-8").splitlines()
     if len(lines) > LONGEST:
         yield name, len(lines), f"is longer than {LONGEST} lines"
     for number, line in enumerate(lines, 1):
         if match := INCLUDE.match(line):
-            for fault in check_include(name, match[1]):
+            for fault in check_include(name, match[1], below):
                 yield name, number, fault
         if name.startswith(SHOWS_NO_TEXTS) and MESSAGE.search(line):
             yield name, number, "shows a text that has no name in support/mensagens.h or textos.h"
@@ -81,18 +80,19 @@ def check_compiled(sources, builds):
 
 
 def main():
-    files = project_files()
+    files, below = project_files(), layers()
     sources = [name for name in files if name.endswith((".cpp", ".h"))]
     faults = [(name, 1, "has a name that is not plain ASCII") for name in files if not name.isascii()]
     for name in sources:
-        faults += check_source(name)
+        faults += check_source(name, below)
     if len(sys.argv) > 1:
         faults += check_compiled(sources, sys.argv[1:])
     for name, line, fault in faults:
         print(f"{name}:{line}: {fault}")
-    if not sources:
-        print("no sources found")
-    return 1 if faults or not sources else 0
+    if not sources or not below:
+        print("no sources or no layers found")
+        return 1
+    return 1 if faults else 0
 
 
 sys.exit(main())
