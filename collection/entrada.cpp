@@ -40,10 +40,7 @@ Entrada PorRom(const std::string& Caminho, const EntrePassos& Pausa) {
   if (conteudo.empty()) return Entrada::NaoLida;
   Pausa();
   const std::string destino = DirRoms + UltimaParte(Caminho);
-  const bool existia = ArquivoExiste(destino);
-  if (GravarArquivo(destino, conteudo, 1, true) == 1) return Entrada::Feita;
-  if (!existia) ApagarArquivo(destino);
-  return Entrada::NaoGravada;
+  return GravarArquivo(destino, conteudo, 1, true) == 1 ? Entrada::Feita : Entrada::NaoGravada;
 }
 
 Encontro OQueEncontra(const Pacote& Novo) {

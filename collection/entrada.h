@@ -14,8 +14,8 @@ using EntrePassos = std::function<void()>;  // called between long steps
 // Copies a ROM file into the ROM directory as it is, over one of its name.
 Entrada PorRom(const std::string& Caminho, const EntrePassos& Pausa);
 
-// What a package's ROM meets under its file name, which a game of another name can have. A file that cannot be seen
-// counts as none.
+// What a package's ROM meets under its file name, which a game of another name can have. What cannot be seen or read
+// counts as another ROM.
 enum class Encontro { Nada, MesmaRom, OutraRom };
 Encontro OQueEncontra(const Pacote& Novo);
 

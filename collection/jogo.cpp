@@ -2,7 +2,6 @@
 
 #include "catalog/cls_DAT.h"
 #include "support/caminhos.h"
-#include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 
 namespace {
@@ -27,7 +26,7 @@ Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurt
 std::string ImagemDoJogo(const std::string& Nome) {
   for (const char* extensao : ExtensoesDeImagem) {
     std::string caminho = DirImgs + Nome + extensao;
-    if (ArquivoExiste(caminho)) return caminho;
+    if (platform::FileSize(caminho).value_or(0) != 0) return caminho;
   }
   return "";
 }

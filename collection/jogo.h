@@ -17,6 +17,6 @@ struct Jogo {
 // name: asking the disk again, file by file, costs milliseconds each in a large directory.
 Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto);
 
-// The picture file of the game of this name, or the empty text: the first one present of ".gif", ".bmp", ".jpg",
-// ".png".
+// The picture file of the game of this name, or the empty text: the first one of ".gif", ".bmp", ".jpg", ".png" that is
+// there and not empty, or of which that cannot be told.
 std::string ImagemDoJogo(const std::string& Nome);

@@ -15,13 +15,6 @@ Saida Gravar(const Destino& alvo, std::string_view conteudo) {
   return Substituicao(alvo.Caminho, conteudo, alvo.Existente).Concluir() ? Saida::Feita : Saida::NaoGravada;
 }
 
-// Puts all bytes of a file behind those of the text; false when not all of them could be read.
-bool Acrescentar(std::string& texto, const std::string& caminho, std::int32_t tamanho) {
-  const std::size_t antes = texto.size();
-  AcrescentarArquivo(texto, caminho);
-  return texto.size() - antes == static_cast<std::size_t>(tamanho);
-}
-
 }  // namespace
 
 Saida SalvarRom(const Jogo& Escolhido, const Destino& Alvo, const EntrePassos& Pausa) {
@@ -36,16 +29,19 @@ Saida SalvarRom(const Jogo& Escolhido, const Destino& Alvo, const EntrePassos& P
 Saida SalvarPacote(const Jogo& Escolhido, const std::string& ArquivoImagem, const Destino& Alvo,
                    const EntrePassos& Pausa) {
   constexpr std::size_t folga = 1024;  // a longer header costs a copy, no more
-  const std::int32_t tamanhoImagem = TamanhoArquivo(ArquivoImagem), tamanhoRom = TamanhoArquivo(Escolhido.Arquivo);
   std::string pacote;
-  pacote.reserve(folga + static_cast<std::size_t>(tamanhoImagem) + static_cast<std::size_t>(tamanhoRom));
-  if (!Acrescentar(pacote, ArquivoImagem, tamanhoImagem)) return Saida::SemPacote;
-  const std::size_t inicioRom = pacote.size();
-  if (!Acrescentar(pacote, Escolhido.Arquivo, tamanhoRom)) return Saida::SemPacote;
+  pacote.reserve(folga + static_cast<std::size_t>(TamanhoArquivo(ArquivoImagem)) +
+                 static_cast<std::size_t>(TamanhoArquivo(Escolhido.Arquivo)));
+  if (!ArquivoImagem.empty() && !AcrescentarArquivo(pacote, ArquivoImagem)) return Saida::SemPacote;
+  const std::size_t tamanhoImagem = pacote.size();
+  if (!AcrescentarArquivo(pacote, Escolhido.Arquivo)) return Saida::SemPacote;
+  const std::size_t tamanhoRom = pacote.size() - tamanhoImagem;
   Pausa();
-  const auto soma = cls_CRC().CRC(std::string_view(pacote).substr(inicioRom));
+  const auto soma = cls_CRC().CRC(std::string_view(pacote).substr(tamanhoImagem));
   if (!soma) return Saida::SemPacote;
-  pacote.insert(0, MontarPacote(Escolhido.Nome, Escolhido.DOSName, TextoCRC(*soma), tamanhoImagem, tamanhoRom, {}, {}));
+  pacote.insert(
+      0, MontarPacote(Escolhido.Nome, Escolhido.DOSName, TextoCRC(*soma), static_cast<std::int32_t>(tamanhoImagem),
+                      static_cast<std::int32_t>(tamanhoRom), {}, {}));
   Pausa();
   return Gravar(Alvo, pacote);
 }

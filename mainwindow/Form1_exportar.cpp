@@ -54,7 +54,7 @@ std::optional<Saida> Salvar(const Form1& dono, const Jogo& escolhido, const std:
   const auto tamanho = platform::FileSize(caminho);
   if (tamanho > 0 && MostrarMensagem(Mensagem::ArquivoJaExiste) != platform::Answer::Yes) return std::nullopt;
   RunPendingEvents();
-  const Destino destino{caminho, tamanho ? Existing::Replace : Existing::Keep};
+  const Destino destino{caminho, tamanho >= 0 ? Existing::Replace : Existing::Keep};
   return TipoDoArquivo(caminho) == "TVK" ? SalvarPacote(escolhido, arquivoImagem, destino, RunPendingEvents)
                                          : SalvarRom(escolhido, destino, RunPendingEvents);
 }

@@ -66,7 +66,8 @@ inline constexpr std::uint32_t AttributeNormal = 0x80;  // of a file that has no
 // The attribute set of a file or directory; nothing when the path does not exist or cannot be reached.
 std::optional<std::uint32_t> GetFileAttributesA(const std::string& path);
 
-// The length in bytes of a file, without opening it; nothing for a directory and for a missing file.
+// The length in bytes of a file, without opening it; nothing for a directory and for a missing file, -1 when it cannot
+// be told whether there is one.
 std::optional<std::int64_t> FileSize(const std::string& path);
 
 bool DeleteFileA(const std::string& path);  // false for a missing, read-only or open file

@@ -129,15 +129,14 @@ bool Substituicao::Concluir() {
 }
 
 bool GravarNoLugar(const std::string& Caminho, const Gravacao& Pedido, Existing Existente) {
-  const bool existia = platform::GetFileAttributesA(Caminho).has_value();
-  const bool novo = Existente == Existing::Keep;
-  platform::File arquivo(Caminho, novo ? platform::Access::CreateNew : platform::Access::ReadWrite);
+  platform::File arquivo(Caminho, platform::Access::CreateNew);
+  const bool novo = arquivo.IsOpen();
+  if (!novo && Existente == Existing::Replace) arquivo = platform::File(Caminho, platform::Access::ReadWrite);
   if (!arquivo.IsOpen()) return false;
   const std::int64_t tamanho = arquivo.Size();
   if (tamanho >= 0 && EscreverOuDesfazer(arquivo, Pedido, tamanho)) return true;
   arquivo.Close();
-  // Made by opening it; but whatever holds something is not deleted.
-  if ((novo || !existia) && platform::FileSize(Caminho) == 0) platform::DeleteFileA(Caminho);
+  if (novo) platform::DeleteFileA(Caminho);
   return false;
 }
 

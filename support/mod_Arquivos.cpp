@@ -84,14 +84,13 @@ std::string LerArquivo(const std::string& Caminho, std::int32_t Inicio, std::int
   return texto;
 }
 
-void AcrescentarArquivo(std::string& Texto, const std::string& Caminho) {
+bool AcrescentarArquivo(std::string& Texto, const std::string& Caminho) {
   platform::File arquivo(Caminho, platform::Access::Read);
   const std::int64_t tamanho = arquivo.Size();
-  if (tamanho < 0 || tamanho > MaiorTamanho) return;
+  if (tamanho < 0 || tamanho > MaiorTamanho) return false;
   const std::size_t antes = Texto.size(), quantos = static_cast<std::size_t>(tamanho);
   Texto.resize(antes + quantos);
-  const std::int64_t lidos = arquivo.Read(0, Texto.data() + antes, quantos);
-  Texto.resize(antes + static_cast<std::size_t>(std::max<std::int64_t>(lidos, 0)));
+  return arquivo.Read(0, Texto.data() + antes, quantos) == tamanho;
 }
 
 std::optional<std::string> LerInteiro(platform::File& Arquivo) { return LerAteFim(Arquivo, 0); }
@@ -122,10 +121,10 @@ Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const
 void ApagarArquivo(const std::string& Caminho) { platform::DeleteFileA(Caminho); }
 
 std::int32_t TamanhoArquivo(const std::string& Caminho) {
-  return static_cast<std::int32_t>(std::min(platform::FileSize(Caminho).value_or(0), MaiorTamanho));
+  return static_cast<std::int32_t>(std::clamp<std::int64_t>(platform::FileSize(Caminho).value_or(0), 0, MaiorTamanho));
 }
 
-bool ArquivoExiste(const std::string& Caminho) { return platform::FileSize(Caminho).value_or(0) != 0; }
+bool ArquivoExiste(const std::string& Caminho) { return platform::FileSize(Caminho) > 0; }
 
 bool DiretorioExiste(const std::string& Caminho) {
   return platform::GetFileAttributesA(Caminho) == platform::AttributeDirectory;

@@ -16,8 +16,9 @@ class File;
 // cannot be read to its end, or does not fit in a text.
 std::string LerArquivo(const std::string& Caminho, std::int32_t Inicio = 1, std::int32_t Tamanho = -1);
 
-// Puts all bytes of a file behind those of the text; none of a file that LerArquivo would give as empty.
-void AcrescentarArquivo(std::string& Texto, const std::string& Caminho);
+// Puts all bytes of a file behind those of the text. False: it cannot be read to its end, or is longer than a 32-bit
+// length can say.
+bool AcrescentarArquivo(std::string& Texto, const std::string& Caminho);
 
 // All bytes of an open file; nothing when it cannot be read, or is longer than a 32-bit length can say.
 std::optional<std::string> LerInteiro(platform::File& Arquivo);
@@ -38,10 +39,10 @@ Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const
 // A file that is missing or cannot be deleted is left alone.
 void ApagarArquivo(const std::string& Caminho);
 
-// The length in bytes; 0 for a missing file, and the largest number for a longer file than it can tell.
+// The length in bytes; 0 for a file that is missing or cannot be seen, and the largest number for a longer file than it can tell.
 std::int32_t TamanhoArquivo(const std::string& Caminho);
 
-// True for a file that is not empty.
+// True for a file that can be seen and is not empty.
 bool ArquivoExiste(const std::string& Caminho);
 
 // True for a directory that has no other attribute.

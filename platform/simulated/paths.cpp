@@ -49,7 +49,8 @@ std::optional<std::uint32_t> GetFileAttributesA(const std::string& path) {
 std::optional<std::int64_t> FileSize(const std::string& path) {
   const bool fault = Fails();
   const std::optional<Place> place = Locate(path);
-  if (fault || !IsFile(place)) return std::nullopt;
+  if (fault) return -1;
+  if (!IsFile(place)) return std::nullopt;
   return static_cast<std::int64_t>(place->Found->Content.size());
 }
 

@@ -3,6 +3,7 @@
 #include <windows.h>
 
 #include <algorithm>
+#include <iterator>
 #include <utility>
 
 #include "platform/windows/paths.h"
@@ -26,6 +27,14 @@ HANDLE OpenFile(const std::string& path, Access access) {
   const DWORD how = access == Access::Read ? OPEN_EXISTING : access == Access::CreateNew ? CREATE_NEW : OPEN_ALWAYS;
   return ::CreateFileA(WindowsPath(path), rights, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr, how,
                        FILE_ATTRIBUTE_NORMAL, nullptr);
+}
+
+// What a failure to see a file says of its length.
+std::optional<std::int64_t> Unseen(DWORD error) {
+  constexpr DWORD none[] = {ERROR_FILE_NOT_FOUND, ERROR_PATH_NOT_FOUND, ERROR_INVALID_NAME,        ERROR_BAD_PATHNAME,
+                            ERROR_INVALID_DRIVE,  ERROR_NOT_READY,      ERROR_FILENAME_EXCED_RANGE};
+  if (std::find(std::begin(none), std::end(none), error) != std::end(none)) return std::nullopt;
+  return -1;
 }
 
 std::uint64_t Number(const FILETIME& time) { return std::uint64_t{time.dwHighDateTime} << 32 | time.dwLowDateTime; }
@@ -128,7 +137,7 @@ std::optional<std::uint32_t> GetFileAttributesA(const std::string& path) {
 
 std::optional<std::int64_t> FileSize(const std::string& path) {
   WIN32_FILE_ATTRIBUTE_DATA data;
-  if (!::GetFileAttributesExA(WindowsPath(path), GetFileExInfoStandard, &data)) return std::nullopt;
+  if (!::GetFileAttributesExA(WindowsPath(path), GetFileExInfoStandard, &data)) return Unseen(::GetLastError());
   if (data.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) return std::nullopt;
   return static_cast<std::int64_t>(data.nFileSizeHigh) << 32 | data.nFileSizeLow;
 }

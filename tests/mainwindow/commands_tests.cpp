@@ -43,8 +43,6 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
 TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
   // The catalogue only grows: a disk that goes for good within that write leaves a part of the new entry.
   const std::string catalogue = Home + "tolvaris.dat";
-  // A picture that cannot be seen is taken for one that is not there.
-  const std::string withoutPicture = Package("Super Jogo", "SUPERJOG", "");
   const std::set<std::string> questions = {Told(Mensagem::JogoJaExiste), Told(Mensagem::ArquivoJaExiste),
                                            Told(Mensagem::DeletarJogo, "Super Jogo")};
   const std::set<std::string> successes = {Told(Mensagem::JogoAdicionado), Told(Mensagem::ArquivoSalvo)};
@@ -61,46 +59,49 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
       {"export a package", [this] { ChooseFile(form->Command5, "C:\\novo.tvk"); }, "C:\\novo.tvk"},
       {"delete", [this] { Click(form->Command6); }},
   };
-  for (const auto& [name, operate, result] : operations) {
-    SCOPED_TRACE(name);
-    Files before, after;
-    const auto prepare = [&] {
-      SetUpMachine();
-      PutFile("C:\\SUPERJOG.zip", "another ROM");
-      PutFile("C:\\p.tvk", Package("Jogo Novo", "NOVO"));
-      for (const std::string& old : {Roms + "NOVO.zip", "C:\\novo.smc"s, "C:\\novo.tvk"s}) PutFile(old, "old");
-      PutFile(Imgs + "Jogo Novo.gif", "old");
-      PutText(Key, "LRom", "Super Jogo");
-      ASSERT_TRUE(Start());
-      before = Standing();
-      QueueAnswer(Answer::Yes);
-    };
-    const auto check = [&] {
-      EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
-      Texts shown = TakeMessages();
-      const bool asked = std::erase_if(shown, [&](const std::string& text) { return questions.contains(text); }) > 0;
-      EXPECT_TRUE(asked || result == Roms + "SUPERJOG.zip" || Content(result) == before[result]) << "replaced unasked";
-      EXPECT_LE(shown.size(), 1U);
-      EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
-      EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
-      EXPECT_TRUE(shown.empty() || !successes.contains(shown[0]) || Content(result) != before[result]);
-      EXPECT_EQ(Leftovers({Roms, Imgs, "C:\\Emu\\", "C:\\"}), Texts{});
-      for (const bool cut : {false, true}) {
-        if (cut) CutPower();
-        for (const Files& files : {before, after, Standing()}) {
-          for (const auto& [path, content] : files) {
-            const auto now = Content(path);
-            const bool broken = path == catalogue && after[path]->starts_with(*now);
-            EXPECT_TRUE(now == before[path] || now == after[path] || now == withoutPicture || broken) << path;
+  for (const auto& [name, operate, result] : operations)
+    for (const bool full : {false, true}) {
+      SCOPED_TRACE(testing::Message() << name << (full ? ", on a full disk" : ""));
+      Files before, after;
+      const auto prepare = [&] {
+        SetUpMachine();
+        PutFile("C:\\SUPERJOG.zip", "another ROM");
+        PutFile("C:\\p.tvk", Package("Jogo Novo", "NOVO"));
+        for (const std::string& old : {Roms + "NOVO.zip", "C:\\novo.smc"s, "C:\\novo.tvk"s}) PutFile(old, "old");
+        PutFile(Imgs + "Jogo Novo.gif", "old");
+        PutText(Key, "LRom", "Super Jogo");
+        ASSERT_TRUE(Start());
+        before = Standing();
+        QueueAnswer(Answer::Yes);
+        if (full) SetFreeSpace('C', 0);
+      };
+      const auto check = [&] {
+        EXPECT_TRUE(form->IsClosed() || form->Command4.Enabled());
+        Texts shown = TakeMessages();
+        const bool asked = std::erase_if(shown, [&](const std::string& text) { return questions.contains(text); }) > 0;
+        EXPECT_TRUE(asked || result == Roms + "SUPERJOG.zip" || Content(result) == before[result])
+            << "replaced unasked";
+        EXPECT_LE(shown.size(), 1U);
+        EXPECT_EQ(StoredText(Key, "LRom"), "Super Jogo") << "the game that is played, now as before";
+        EXPECT_TRUE(result.empty() || !shown.empty() || Standing() == before) << "a silent change";
+        EXPECT_TRUE(shown.empty() || !successes.contains(shown[0]) || Content(result) != before[result]);
+        EXPECT_EQ(Leftovers({Roms, Imgs, "C:\\Emu\\", "C:\\"}), Texts{});
+        for (const bool cut : {false, true}) {
+          if (cut) CutPower();
+          for (const Files& files : {before, after, Standing()}) {
+            for (const auto& [path, content] : files) {
+              const auto now = Content(path);
+              const bool broken = path == catalogue && after[path]->starts_with(*now);
+              EXPECT_TRUE(now == before[path] || now == after[path] || broken) << path;
+            }
           }
         }
-      }
-    };
-    prepare();
-    operate();
-    after = Standing();
-    EXPECT_GT(WithEachFault(prepare, operate, check), 5);
-  }
+      };
+      prepare();
+      operate();
+      after = Standing();
+      EXPECT_GT(WithEachFault(prepare, operate, check), 5);
+    }
 }
 
 TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
