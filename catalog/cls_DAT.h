@@ -18,8 +18,9 @@ class cls_DAT {
   cls_DAT& operator=(cls_DAT&&) = delete;
   ~cls_DAT() = default;
 
-  // Opens the file where it is not open yet, and reads it. A missing file is created by Carregar, not by Carregar2;
-  // without a readable file the catalogue is empty.
+  // Opens the file where it is not open yet, and reads it; without a readable file the catalogue is empty. Carregar,
+  // for who adds to the catalogue, creates a missing file; Carregar2, for who only looks names up, leaves it missing
+  // and needs no leave to write.
   void Carregar();
   void Carregar2();
 

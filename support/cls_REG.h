@@ -20,7 +20,8 @@ std::optional<std::int32_t> InteiroDe(const Valor& Value);
 // Where the program's settings lie, below platform::RootCurrentUser.
 inline constexpr const char* ChaveConfiguracao = "Software\\Roms\\Tolvaris";
 
-// Key paths may begin with a backslash. A computer's name means the registry of that computer.
+// Key paths may begin with a backslash. A computer's name means the registry of that computer: whoever keeps several
+// machines can set them up from one.
 class cls_REG {
  public:
   // Writes a value and creates the key when it is missing. An existing number or byte stays one, and keeps what it held
@@ -32,6 +33,7 @@ class cls_REG {
   Valor GetValue(std::uint32_t Predefinedkey, const std::string& Keyname, const std::string& ValueName,
                  const std::string& ComputerName = "") const;
 
-  // True: the key existed and its deletion was asked for. A key with keys below it stays.
+  // For who takes a program's settings away with it. True: the key existed and its deletion was asked for. A key with
+  // keys below it stays.
   bool DeletKey(std::uint32_t Predefinedkey, const std::string& Keyname, const std::string& ComputerName = "") const;
 };
