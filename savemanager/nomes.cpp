@@ -2,6 +2,7 @@
 
 #include "catalog/cls_DAT.h"
 #include "platform/text.h"
+#include "support/caminhos.h"
 
 namespace {
 
@@ -12,11 +13,11 @@ bool Digito(char C) { return C >= '0' && C <= '9'; }
 }  // namespace
 
 std::string NomeExibido(const std::string& Arquivo, const cls_DAT& Catalogo) {
-  const std::size_t ponto = Arquivo.rfind('.');
-  if (ponto == std::string::npos) return Arquivo;
+  const auto base = NomeBase(Arquivo);
+  if (!base) return Arquivo;
   std::int16_t encontrado = 0;
-  std::string texto = Catalogo.DefineNome(Arquivo.substr(0, ponto), encontrado);
-  const std::string extensao = platform::CharUpperBuffA(Arquivo.substr(ponto + 1));
+  std::string texto = Catalogo.DefineNome(*base, encontrado);
+  const std::string extensao = platform::CharUpperBuffA(Arquivo.substr(base->size() + 1));
   if (!extensao.starts_with("ZS")) return texto;
   const char estado = extensao.back() == 'T' ? '0' : extensao.back();
   if (Digito(estado)) texto.append(Estado).append({estado, ']'});
