@@ -2,9 +2,9 @@
 #include "platform/events.h"
 
 int main() {
-  Form1 JanelaPrincipal;
-  if (!JanelaPrincipal.Form_Load()) return 0;
-  JanelaPrincipal.Show();
+  Form1 janelaPrincipal;
+  if (!janelaPrincipal.Form_Load()) return 0;
+  janelaPrincipal.Show();
   platform::RunEventLoop();
   return 0;
 }

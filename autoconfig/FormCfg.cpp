@@ -61,8 +61,8 @@ std::string Identidade(const std::string& Caminho) {
 }
 
 std::string FiltroDeEmuladores() {
-  const auto Par = [](Texto Nome, const std::string& Padrao) { return Traduzir(Nome) + '\0' + Padrao + '\0'; };
-  return Par(Texto::EmuladorZsnes, "zsnes*.exe") + Par(Texto::Programas, "*.exe");
+  const auto par = [](Texto Nome, const std::string& Padrao) { return Traduzir(Nome) + '\0' + Padrao + '\0'; };
+  return par(Texto::EmuladorZsnes, "zsnes*.exe") + par(Texto::Programas, "*.exe");
 }
 
 }  // namespace

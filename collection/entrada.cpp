@@ -10,27 +10,27 @@ namespace {
 
 using platform::Existing;
 
-std::string ArquivoDaRom(const Pacote& novo) { return DirRoms + novo.DOSName + ".zip"; }
+std::string ArquivoDaRom(const Pacote& Novo) { return DirRoms + Novo.DOSName + ".zip"; }
 
 // Makes the new contents the files' own. What has to be written in place can fail, and goes first; what lies complete
 // beside its file can only take the name.
-bool TomarNomes(Substituicao& figura, Substituicao& rom) {
-  return figura.EstaAoLado() ? rom.Concluir() && figura.Concluir() : figura.Concluir() && rom.Concluir();
+bool TomarNomes(Substituicao& Figura, Substituicao& Rom) {
+  return Figura.EstaAoLado() ? Rom.Concluir() && Figura.Concluir() : Figura.Concluir() && Rom.Concluir();
 }
 
 // Whether the ROM as it stands on the disk has the package's checksum.
-Entrada ConferirRom(const std::string& arquivo, const Pacote& novo) {
-  platform::File aberto(arquivo, platform::Access::Read);
+Entrada ConferirRom(const std::string& Arquivo, const Pacote& Novo) {
+  platform::File aberto(Arquivo, platform::Access::Read);
   const auto soma = cls_CRC().CRC(aberto);
   if (!soma) return Entrada::NaoLida;
-  return TextoCRC(*soma) == novo.CRC ? Entrada::Feita : Entrada::Corrompida;
+  return TextoCRC(*soma) == Novo.CRC ? Entrada::Feita : Entrada::Corrompida;
 }
 
 // The same of the package as it was read.
-Entrada ConferirPacote(const Pacote& novo) {
-  const auto soma = cls_CRC().CRC(novo.Rom);
-  if (!soma || novo.Imagem.empty()) return Entrada::NaoLida;
-  return TextoCRC(*soma) == novo.CRC ? Entrada::Feita : Entrada::Corrompida;
+Entrada ConferirPacote(const Pacote& Novo) {
+  const auto soma = cls_CRC().CRC(Novo.Rom);
+  if (!soma || Novo.Imagem.empty()) return Entrada::NaoLida;
+  return TextoCRC(*soma) == Novo.CRC ? Entrada::Feita : Entrada::Corrompida;
 }
 
 }  // namespace

@@ -10,9 +10,9 @@
 
 namespace {
 
-Saida Gravar(const Destino& alvo, std::string_view conteudo) {
-  ApagarRestos(DiretorioDe(alvo.Caminho));
-  return Substituicao(alvo.Caminho, conteudo, alvo.Existente).Concluir() ? Saida::Feita : Saida::NaoGravada;
+Saida Gravar(const Destino& Alvo, std::string_view Conteudo) {
+  ApagarRestos(DiretorioDe(Alvo.Caminho));
+  return Substituicao(Alvo.Caminho, Conteudo, Alvo.Existente).Concluir() ? Saida::Feita : Saida::NaoGravada;
 }
 
 }  // namespace

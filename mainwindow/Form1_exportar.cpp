@@ -16,18 +16,18 @@ struct Oferta {
   std::string Filtro, ExtensaoPadrao;  // as the save dialog takes them
 };
 
-void Oferecer(Oferta& ofertas, const std::string& rotulo, const std::string& padrao) {
-  ofertas.Filtro.append(rotulo).append(1, '\0').append(padrao).append(1, '\0');
+void Oferecer(Oferta& Ofertas, const std::string& Rotulo, const std::string& Padrao) {
+  Ofertas.Filtro.append(Rotulo).append(1, '\0').append(Padrao).append(1, '\0');
 }
 
 // What the game can be saved as. A package needs a picture and a catalogue entry.
-Oferta TiposOferecidos(const Jogo& escolhido, bool temImagem) {
+Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
   Oferta ofertas;
-  if (temImagem && escolhido.Catalogado) {
+  if (TemImagem && Escolhido.Catalogado) {
     Oferecer(ofertas, Traduzir(Texto::ArquivoTolvaris), "*.tvk");
     ofertas.ExtensaoPadrao = "tvk;";
   }
-  const std::string tipo = TipoDoArquivo(escolhido.Arquivo);
+  const std::string tipo = TipoDoArquivo(Escolhido.Arquivo);
   if (tipo == "ZIP") {
     Oferecer(ofertas, Traduzir(Texto::ArquivoZip), "*.zip");
     ofertas.ExtensaoPadrao += "zip";
@@ -36,39 +36,39 @@ Oferta TiposOferecidos(const Jogo& escolhido, bool temImagem) {
     ofertas.ExtensaoPadrao += "smc";
   } else {
     Oferecer(ofertas, tipo, "*.*");
-    ofertas.ExtensaoPadrao += escolhido.Arquivo.substr(escolhido.Arquivo.size() - tipo.size());
+    ofertas.ExtensaoPadrao += Escolhido.Arquivo.substr(Escolhido.Arquivo.size() - tipo.size());
   }
   return ofertas;
 }
 
-std::string PerguntarDestino(const Form1& dono, const Jogo& escolhido, bool temImagem) {
-  Oferta ofertas = TiposOferecidos(escolhido, temImagem);
-  return SalvarArquivo(dono, "", Traduzir(Texto::SalvarComo), ofertas.ExtensaoPadrao, escolhido.Nome, ofertas.Filtro,
+std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemImagem) {
+  Oferta ofertas = TiposOferecidos(Escolhido, TemImagem);
+  return SalvarArquivo(Dono, "", Traduzir(Texto::SalvarComo), ofertas.ExtensaoPadrao, Escolhido.Nome, ofertas.Filtro,
                        platform::HideReadOnly);
 }
 
 // Nothing: the person gave up.
-std::optional<Saida> Salvar(const Form1& dono, const Jogo& escolhido, const std::string& arquivoImagem) {
-  const std::string caminho = PerguntarDestino(dono, escolhido, !arquivoImagem.empty());
+std::optional<Saida> Salvar(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
+  const std::string caminho = PerguntarDestino(Dono, Escolhido, !ArquivoImagem.empty());
   if (caminho.empty()) return std::nullopt;
   const auto tamanho = platform::FileSize(caminho);
   if (tamanho > 0 && MostrarMensagem(Mensagem::ArquivoJaExiste) != platform::Answer::Yes) return std::nullopt;
   RunPendingEvents();
   const Destino destino{caminho, tamanho >= 0 ? Existing::Replace : Existing::Keep};
-  return TipoDoArquivo(caminho) == "TVK" ? SalvarPacote(escolhido, arquivoImagem, destino, RunPendingEvents)
-                                         : SalvarRom(escolhido, destino, RunPendingEvents);
+  return TipoDoArquivo(caminho) == "TVK" ? SalvarPacote(Escolhido, ArquivoImagem, destino, RunPendingEvents)
+                                         : SalvarRom(Escolhido, destino, RunPendingEvents);
 }
 
-std::optional<Saida> SalvarSemExcecao(const Form1& dono, const Jogo& escolhido, const std::string& arquivoImagem) {
+std::optional<Saida> SalvarSemExcecao(const Form1& Dono, const Jogo& Escolhido, const std::string& ArquivoImagem) {
   try {
-    return Salvar(dono, escolhido, arquivoImagem);
+    return Salvar(Dono, Escolhido, ArquivoImagem);
   } catch (...) {
     return Saida::SemPacote;
   }
 }
 
-Mensagem MensagemDe(Saida fim) {
-  switch (fim) {
+Mensagem MensagemDe(Saida Fim) {
+  switch (Fim) {
     case Saida::Feita:
       return Mensagem::ArquivoSalvo;
     case Saida::NaoLida:

@@ -20,18 +20,18 @@ struct Importacao {
   std::string Nome = {};       // of the new game in the list
 };
 
-std::string PerguntarArquivo(const Form1& dono) {
+std::string PerguntarArquivo(const Form1& Dono) {
   using namespace std::string_literals;
   std::string filtro = Traduzir(Texto::ArquivosSuportados) + "\0*.zip;*.smc;*.tvk\0"s;
-  return AbrirArquivo(dono, "", Traduzir(Texto::Adicionar), "", filtro, platform::HideReadOnly);
+  return AbrirArquivo(Dono, "", Traduzir(Texto::Adicionar), "", filtro, platform::HideReadOnly);
 }
 
-Importacao ImportarPacote(const Form1& lista, const std::string& caminho) {
-  const std::string conteudo = LerArquivo(caminho);
+Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
+  const std::string conteudo = LerArquivo(Caminho);
   const auto novo = LerPacote(conteudo);
   if (!novo) return {Entrada::NaoLida};
   RunPendingEvents();
-  const bool naLista = lista.InList1(novo->Nome);
+  const bool naLista = Lista.InList1(novo->Nome);
   const Encontro encontrado = naLista ? Encontro::OutraRom : OQueEncontra(*novo);
   if (encontrado == Encontro::OutraRom && MostrarMensagem(Mensagem::JogoJaExiste) != platform::Answer::Yes) return {};
   const Existing existente = encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace;
@@ -40,34 +40,34 @@ Importacao ImportarPacote(const Form1& lista, const std::string& caminho) {
   return {fim, novo->Nome};
 }
 
-Importacao Importar(const Form1& lista, const std::string& caminho) {
-  if (caminho.empty()) return {};
-  const auto base = NomeBase(UltimaParte(caminho));
-  if (!ArquivoExiste(caminho) || !base) return {Entrada::NaoLida};
-  const std::string tipo = TipoDoArquivo(caminho);
-  if (tipo == "ZIP" || tipo == "SMC") return {PorRom(caminho, RunPendingEvents), *base};
-  if (tipo == "TVK") return ImportarPacote(lista, caminho);
+Importacao Importar(const Form1& Lista, const std::string& Caminho) {
+  if (Caminho.empty()) return {};
+  const auto base = NomeBase(UltimaParte(Caminho));
+  if (!ArquivoExiste(Caminho) || !base) return {Entrada::NaoLida};
+  const std::string tipo = TipoDoArquivo(Caminho);
+  if (tipo == "ZIP" || tipo == "SMC") return {PorRom(Caminho, RunPendingEvents), *base};
+  if (tipo == "TVK") return ImportarPacote(Lista, Caminho);
   return {};
 }
 
 // Whatever goes wrong unexpectedly (a file larger than the memory) counts as a file that cannot be read.
-Importacao ImportarSemExcecao(const Form1& lista, const std::string& caminho) {
+Importacao ImportarSemExcecao(const Form1& Lista, const std::string& Caminho) {
   try {
-    return Importar(lista, caminho);
+    return Importar(Lista, Caminho);
   } catch (...) {
     return {Entrada::NaoLida};
   }
 }
 
-bool EhPacote(const std::string& caminho) { return TipoDoArquivo(caminho) == "TVK"; }
+bool EhPacote(const std::string& Caminho) { return TipoDoArquivo(Caminho) == "TVK"; }
 
 // Of a package, what cannot be written is told like what cannot be read.
-Mensagem MensagemDe(Entrada fim, bool pacote) {
-  switch (fim) {
+Mensagem MensagemDe(Entrada Fim, bool DePacote) {
+  switch (Fim) {
     case Entrada::Feita:
       return Mensagem::JogoAdicionado;
     case Entrada::NaoGravada:
-      return pacote ? Mensagem::ErroAoLer : Mensagem::ErroAoGravar;
+      return DePacote ? Mensagem::ErroAoLer : Mensagem::ErroAoGravar;
     case Entrada::Corrompida:
       return Mensagem::JogoCorrompido;
     default:

@@ -63,14 +63,14 @@ void Form1::RestaurarJanela() {
 
 Form1::Configuracao Form1::VerificarConfiguracao() {
   if (!ArquivoEmulador.empty() && !ArquivoCfgEmulador.empty()) return Configuracao::Pronta;
-  const std::string Configurador = DirPrograma + "tolvariscfg.exe";
-  if (!ArquivoExiste(Configurador)) {
+  const std::string configurador = DirPrograma + "tolvariscfg.exe";
+  if (!ArquivoExiste(configurador)) {
     MostrarMensagem(Mensagem::SemConfigurador);
     return Configuracao::Desistir;
   }
   if (MostrarMensagem(Mensagem::SemConfiguracao) != platform::Answer::Yes) return Configuracao::Desistir;
-  std::string Diretorio = DirPrograma;
-  ExecutarPrograma(Configurador, 500, true, 2, Diretorio);
+  std::string diretorio = DirPrograma;
+  ExecutarPrograma(configurador, 500, true, 2, diretorio);
   platform::RunPendingEvents();
   return Configuracao::Repetir;
 }

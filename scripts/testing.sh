@@ -2,6 +2,7 @@
 # building.sh, display.sh and wine.sh, and the project's root as the current directory.
 
 declare -i passed=0 failed=0 skipped=0
+declare checked= check_log= checking= # the check that start_check has started
 
 # A display and a Wine prefix of the tests' own, which all programs under scripts/wine-run then use; another name is
 # another prefix, for what may run at the same time: prepare_test_machine [NAME]
@@ -48,6 +49,26 @@ run_check() {
   ((status == 0)) || cat "$log" >&2
   rm -f "$log"
   count_result "$name" "$status"
+}
+
+# The same of a check that takes minutes: it runs while others do, until finish_check waits for it; one at a time.
+start_check() {
+  checked=$1
+  check_log=$(mktemp)
+  shift
+  "$@" >"$check_log" 2>&1 &
+  checking=$!
+  on_exit stop_process "$checking"
+}
+
+finish_check() {
+  local status=0
+  [[ -n $checking ]] || return 0
+  wait "$checking" || status=$?
+  checking=
+  ((status == 0)) || cat "$check_log" >&2
+  rm -f "$check_log"
+  count_result "$checked" "$status"
 }
 
 # Configures a preset, which is all that clang-tidy needs; a failure is a failed result: configure PRESET

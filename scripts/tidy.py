@@ -1,79 +1,96 @@
-"""Runs clang-tidy over the program's own sources of a built directory: tidy.py BUILD
+"""Runs clang-tidy over the sources that builds compile, each as the first build that has it does: tidy.py BUILD...
 
-A source is examined again only when it, a header of ours that it includes, .clang-tidy or the tool has changed since
-it was last found to be clean.
+The builds need only be configured. A source is examined again only when it, a header of ours that it includes, the
+rules, or a tool has changed since it was last found to be clean.
 """
 
 import concurrent.futures
+import functools
 import hashlib
 import json
 import os
 import pathlib
+import re
 import shlex
 import subprocess
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
-FOLDERS = ("app", "autoconfig", "catalog", "controller", "mainwindow", "package", "platform", "savemanager", "support")
+INCLUDE = re.compile(rb'^\s*#\s*include\s*"([^"]+)"', re.MULTILINE)
 
 
-def own(path):
-    return path.is_relative_to(ROOT) and path.relative_to(ROOT).parts[0] in FOLDERS
+def output_of(*command):
+    return subprocess.run(command, check=True, capture_output=True, text=True)
 
 
-def sources(build):
-    """Each source with the object file that the build makes of it."""
-    for command in json.loads((build / "compile_commands.json").read_text()):
-        path = pathlib.Path(command["file"])
-        if own(path):
-            words = shlex.split(command["command"])
-            yield path, words[words.index("-o") + 1]
+@functools.cache
+def arguments_for(compiler):
+    """What makes clang understand a command of another compiler."""
+    if "mingw" not in compiler:
+        return []
+    # clang looks for the headers of the language in another place than Debian puts them, and knows UTF-8 alone.
+    told = output_of(compiler, "-v", "-E", "-x", "c++", os.devnull).stderr
+    folders = [line.strip() for line in told.splitlines() if line.startswith(" /") and "/c++" in line]
+    options = [f"-isystem{folder}" for folder in folders] + ["-fexec-charset=UTF-8", "-Wno-error"]
+    return [f"--extra-arg={option}" for option in options]
 
 
-def included(build):
-    """By object file: our files that went into it, as the last build saw them."""
-    listing = subprocess.run(["ninja", "-C", build, "-t", "deps"], check=True, capture_output=True, text=True).stdout
-    files = {}
-    for line in listing.splitlines():
-        if line.startswith(" "):
-            path = (build / line.strip()).resolve()
-            if own(path):
-                current.append(path)
-        elif ": #deps" in line:
-            current = files.setdefault(line.partition(": #deps")[0], [])
+def sources(builds):
+    """Each source with the build that compiles it and the compiler."""
+    found = {}
+    for build in builds:
+        for command in json.loads((build / "compile_commands.json").read_text()):
+            path = pathlib.Path(command["directory"], command["file"])
+            if path.suffix == ".cpp" and path.is_relative_to(ROOT):
+                found.setdefault(path, (build, shlex.split(command["command"])[0]))
+    return found
+
+
+@functools.cache
+def included(path):
+    """The headers of ours that a file names; they are named from the project's root."""
+    named = (ROOT / name.decode() for name in INCLUDE.findall(path.read_bytes()))
+    return [header for header in named if header.is_file()]
+
+
+def with_headers(source):
+    files, waiting = set(), [source]
+    while waiting:
+        path = waiting.pop()
+        if path not in files:
+            files.add(path)
+            waiting += included(path)
     return files
 
 
-def digest(files, tool):
-    total = hashlib.sha256(tool)
-    for path in [ROOT / ".clang-tidy", *sorted(set(files))]:
+def digest(source, rules):
+    total = hashlib.sha256(rules)
+    for path in sorted(with_headers(source)):
         total.update(str(path).encode() + b"\0" + path.read_bytes())
     return total.hexdigest()
 
 
-def examine(build, source):
-    return subprocess.run(
-        ["clang-tidy", "--quiet", "-p", build, source], capture_output=True, text=True, check=False)
+def examine(source, build, compiler):
+    return subprocess.run(["clang-tidy", "--quiet", "-p", build, *arguments_for(compiler), source],
+                          capture_output=True, text=True, check=False)
 
 
 def main():
-    build = pathlib.Path(sys.argv[1]).resolve()
-    tool = subprocess.run(["clang-tidy", "--version"], check=True, capture_output=True).stdout
-    clean = build / "tidy"
+    builds = [pathlib.Path(name).resolve() for name in sys.argv[1:]]
+    rules = [output_of("clang-tidy", "--version").stdout.encode(), pathlib.Path(__file__).read_bytes()]
+    for where in (".clang-tidy", "*/.clang-tidy", "*/*/.clang-tidy"):
+        rules += [path.read_bytes() for path in sorted(ROOT.glob(where))]
+    clean = builds[0] / "tidy"
     clean.mkdir(exist_ok=True)
-    dependencies = included(build)
     waiting = {}
-    for source, output in sources(build):
-        if output not in dependencies:
-            print(f"{source.relative_to(ROOT)} has not been built")
-            return 1
-        mark = clean / digest([source, *dependencies[output]], tool)
+    for source, how in sources(builds).items():
+        mark = clean / digest(source, b"".join(rules))
         if not mark.exists():
-            waiting[source] = mark
+            waiting[source] = (how, mark)
     faults = 0
     with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
-        results = pool.map(lambda source: examine(build, source), waiting)
-        for (source, mark), result in zip(waiting.items(), results):
+        results = pool.map(lambda source: examine(source, *waiting[source][0]), waiting)
+        for (_, mark), result in zip(waiting.values(), results):
             if result.returncode == 0:
                 mark.touch()
             else:

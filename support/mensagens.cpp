@@ -148,7 +148,7 @@ constexpr DescricaoDeMensagem Tabela[] = {
     {ErroAoGravarAjustes, "ErroAoGravarAjustes", {"Não foi possível gravar a configuração."}, "Erro", Ok, Critical},
 };
 
-const DescricaoDeMensagem& Descricao(Mensagem qual) { return Tabela[static_cast<std::size_t>(qual)]; }
+const DescricaoDeMensagem& Descricao(Mensagem Qual) { return Tabela[static_cast<std::size_t>(Qual)]; }
 
 constexpr bool EstaEmOrdem() {
   for (std::size_t i = 0; i < std::size(Tabela); ++i) {

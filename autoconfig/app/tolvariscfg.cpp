@@ -2,9 +2,9 @@
 #include "platform/events.h"
 
 int main() {
-  FormCfg JanelaPrincipal;
-  JanelaPrincipal.Form_Load();
-  JanelaPrincipal.Show();
+  FormCfg janelaPrincipal;
+  janelaPrincipal.Form_Load();
+  janelaPrincipal.Show();
   platform::RunEventLoop();
   return 0;
 }

@@ -11,8 +11,8 @@ bool InputWaits() { return HIWORD(::GetQueueStatus(QS_KEY | QS_MOUSEBUTTON | QS_
 
 // Timers come once no input waits. The box is not just left invalid: who repaints windows until none is would not end.
 void DrawLater(HWND box) {
-  constexpr UINT_PTR Timer = 1;
-  ::SetTimer(box, Timer, USER_TIMER_MINIMUM, [](HWND handle, UINT, UINT_PTR timer, DWORD) {
+  constexpr UINT_PTR number = 1;
+  ::SetTimer(box, number, USER_TIMER_MINIMUM, [](HWND handle, UINT, UINT_PTR timer, DWORD) {
     ::KillTimer(handle, timer);
     ::InvalidateRect(handle, nullptr, FALSE);
   });

@@ -20,7 +20,7 @@ void Tick(const WindowState& window, UINT_PTR id) {
 }
 
 Timer::Timer(Window& window, std::uint32_t intervalMilliseconds)
-    : state_(std::make_unique<TimerState>(*this, &window.State(), intervalMilliseconds)) {
+    : state_(std::make_unique<TimerState>(TimerState{*this, &window.State(), intervalMilliseconds})) {
   state_->Owner->Timers.push_back(state_.get());
 }
 

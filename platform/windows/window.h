@@ -12,6 +12,8 @@
 namespace platform {
 
 struct WindowState {
+  WindowState(Window& object, const WindowStyle& style) : Object(object), Style(style) {}
+
   Window& Object;
   WindowStyle Style;      // its caption is the last one
   HWND Handle = nullptr;  // null once the window is closed

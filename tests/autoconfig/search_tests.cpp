@@ -13,6 +13,7 @@ struct Search : FreshMachine {
     return found;
   }
 
+ protected:
   int steps = 0;
 };
 

@@ -31,6 +31,7 @@ struct Configurator : FreshMachine {
     return texts;
   }
 
+ protected:
   std::unique_ptr<FormCfg> form;
 };
 

@@ -9,7 +9,7 @@ struct Catalogue : FreshMachine {
   // The name of a DOS name, or "-" when there is none.
   std::string NameOf(const std::string& dosName) const {
     Booleano found = 7;
-    const std::string name = catalogue.DefineNome(dosName, found);
+    const std::string name = Names.DefineNome(dosName, found);
     EXPECT_TRUE(found == Verdadeiro || found == Falso);
     if (found == Falso) {
       EXPECT_EQ(name, dosName);
@@ -17,7 +17,7 @@ struct Catalogue : FreshMachine {
     return found ? name : "-";
   }
 
-  cls_DAT catalogue;
+  cls_DAT Names;
 };
 
 TEST_F(Catalogue, LooksUpBothWays) {
@@ -37,16 +37,16 @@ TEST_F(Catalogue, LooksUpBothWays) {
       {"small letters in the catalogue", "|a=b|", "a", "-", "b", "a"},
   };
   for (const auto& each : cases) {
-    catalogue.Fechar();
+    Names.Fechar();
     PutFile(File, each.Data);
-    catalogue.Carregar();
+    Names.Carregar();
     EXPECT_EQ(NameOf(each.DosName), each.Name) << each.Case;
-    EXPECT_EQ(catalogue.DefineDOSName(each.GivenName), each.ItsDosName) << each.Case;
+    EXPECT_EQ(Names.DefineDOSName(each.GivenName), each.ItsDosName) << each.Case;
   }
 }
 
 TEST_F(Catalogue, OpensOnceUntilItIsClosedAndReadsAtEachLoad) {
-  catalogue.Carregar2();
+  Names.Carregar2();
   EXPECT_EQ(Content(File), std::nullopt) << "created by Carregar2";
   const auto load = &cls_DAT::Carregar, load2 = &cls_DAT::Carregar2, reload = &cls_DAT::Atualizar,
              close = &cls_DAT::Fechar;
@@ -71,13 +71,13 @@ TEST_F(Catalogue, OpensOnceUntilItIsClosedAndReadsAtEachLoad) {
     platform::File other(File, platform::Access::ReadWrite);  // beside the catalogue
     EXPECT_TRUE(other.SetSize(0));
     EXPECT_TRUE(other.Write(0, data));
-    if (act != nullptr) (catalogue.*act)();
+    if (act != nullptr) (Names.*act)();
     EXPECT_EQ(NameOf("a"), found);
     if (act == close) {
       EXPECT_EQ(OpenFiles(), 1U) << "the other program's";
     }
   }
-  catalogue.RegistrarRom("Novo", "n");
+  Names.RegistrarRom("Novo", "n");
   EXPECT_EQ(Content(File), "|A=V|") << "opened for reading only";
 }
 
@@ -85,20 +85,20 @@ TEST_F(Catalogue, RegistrarRomAppendsOneEntryInOneWriteWholeOrNotAtAll) {
   const std::string old = "|A=Primeiro|", entry = "|MAÇÃ=Maçã|"_ansi;
   const auto prepare = [&] {
     PutFile(File, old);
-    catalogue.Fechar();
-    catalogue.Carregar();
+    Names.Fechar();
+    Names.Carregar();
   };
-  const auto add = [&] { catalogue.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
+  const auto add = [&] { Names.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
   const auto check = [&] { EXPECT_TRUE(Content(File) == old || Content(File) == old + entry); };
   EXPECT_GE(WithEachFault(Fault::Once, prepare, add, check), 2);
   const auto writes = WriteCount(File);
   add();
   EXPECT_EQ(WriteCount(File), writes + 1);
   EXPECT_EQ(NameOf("MAÇÃ"_ansi), "-") << "not before it is read again";
-  catalogue.Atualizar();
+  Names.Atualizar();
   EXPECT_EQ(NameOf("maçã"_ansi), "Maçã"_ansi);
   add();
-  catalogue.RegistrarRom("Outra", "maçã"_ansi);
+  Names.RegistrarRom("Outra", "maçã"_ansi);
   CutPower();
   EXPECT_EQ(Content(File), old + entry + entry + "|MAÇÃ=Outra|"_ansi);
 }

@@ -6,7 +6,8 @@
 
 #include "tests/contract/machine.h"
 
-extern "C" decltype(&::FindNextFileW) __imp_FindNextFileW;  // where the program's calls of the function lead
+extern "C" decltype(&::FindNextFileW) __imp_FindNextFileW;  // NOLINT(readability-identifier-naming): the linker's;
+                                                            // where the program's calls of the function lead
 
 namespace {
 

@@ -7,11 +7,11 @@ namespace {
 
 using namespace contract;
 
-const RegistryKey root = RootKey(RootCurrentUser);
+const RegistryKey Root = RootKey(RootCurrentUser);
 
 class Registry : public Machine {
  protected:
-  Registry() { EXPECT_EQ(RegCreateKeyA(root, Key, key_), 0); }
+  Registry() { EXPECT_EQ(RegCreateKeyA(Root, Key, key_), 0); }
   ~Registry() override { EXPECT_EQ(RegCloseKey(key_), 0); }
 
   // The type and the data of a value that fits into so many bytes; or "failed".

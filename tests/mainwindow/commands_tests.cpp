@@ -59,9 +59,10 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
       {"export a package", [this] { ChooseFile(form->Command5, "C:\\novo.tvk"); }, "C:\\novo.tvk"},
       {"delete", [this] { Click(form->Command6); }},
   };
-  for (const auto& [name, operate, result] : operations)
+  for (const auto& [name, operate, file] : operations)
     for (const bool full : {false, true}) {
       SCOPED_TRACE(testing::Message() << name << (full ? ", on a full disk" : ""));
+      const std::string& result = file;
       Files before, after;
       const auto prepare = [&] {
         SetUpMachine();

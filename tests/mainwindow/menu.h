@@ -93,6 +93,7 @@ struct Menu : FreshMachine {
     return states + (form->Image1.Visible() ? "picture" : "");
   }
 
+ protected:
   std::unique_ptr<Form1> form;
 };
 

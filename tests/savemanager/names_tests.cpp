@@ -7,9 +7,9 @@ namespace {
 struct SaveNames : FreshMachine {
   SaveNames() {
     PutFile("C:\\Tolvaris\\tolvaris.dat", "|UM=Jogo Um||A=Igual||B=Igual||ACAO=Ação|"_ansi);
-    catalogue.Carregar();
+    Catalogue.Carregar();
   }
-  cls_DAT catalogue;
+  cls_DAT Catalogue;
 };
 
 TEST_F(SaveNames, AreInverseOnAllElevenExtensions) {
@@ -19,8 +19,8 @@ TEST_F(SaveNames, AreInverseOnAllElevenExtensions) {
     const char state = extension == "zst" ? '0' : extension.back();
     const std::string suffix = extension == "srm" ? "" : std::string(" [State ") + state + "]";
     for (const auto& [game, name] : games) {
-      EXPECT_EQ(NomeExibido(game + "." + extension, catalogue), name + suffix);
-      EXPECT_EQ(NomeArquivo(name + suffix, catalogue), game + "." + extension);
+      EXPECT_EQ(NomeExibido(game + "." + extension, Catalogue), name + suffix);
+      EXPECT_EQ(NomeArquivo(name + suffix, Catalogue), game + "." + extension);
     }
     pattern += (pattern.empty() ? "*." : ";*.") + extension;
   }
@@ -38,8 +38,8 @@ TEST_F(SaveNames, OfOddFilesAndTexts) {
       {"a mark that is cut off", "Jogo Um [State ", "Jogo Um [State ", "UM.zs"},
   };
   for (const auto& [name, file, text, standsFor] : cases) {
-    EXPECT_EQ(NomeExibido(file, catalogue), text) << name;
-    EXPECT_EQ(NomeArquivo(text, catalogue), standsFor) << name;
+    EXPECT_EQ(NomeExibido(file, Catalogue), text) << name;
+    EXPECT_EQ(NomeArquivo(text, Catalogue), standsFor) << name;
   }
 }
 

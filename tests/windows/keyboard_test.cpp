@@ -128,8 +128,8 @@ TEST_F(Keyboard, CopiesAndDeletesInTheSaveManager) {
   PutFile("A:\\ZEBRA.srm", "bateria Z");
   EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::SemDisquete));
   const SaveManager manager(*program);
-  const auto& [floppyList, floppyDelete] = manager.Floppy;
-  const auto& [computerList, computerDelete] = manager.Computer;
+  const Window &floppyList = manager.Floppy.List, &floppyDelete = manager.Floppy.Delete;
+  const Window &computerList = manager.Computer.List, &computerDelete = manager.Computer.Delete;
   EXPECT_SOON(floppyList.Focused());
   ExpectTabOrder({computerList, manager.Close, floppyList});
   PressKey('Z');

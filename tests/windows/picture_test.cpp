@@ -6,8 +6,8 @@ namespace {
 
 class Pictures : public Installation {};
 
-const COLORREF green = RGB(10, 200, 60);
-const COLORREF red = RGB(220, 20, 40);
+const COLORREF Green = RGB(10, 200, 60);
+const COLORREF Red = RGB(220, 20, 40);
 
 // Nearly as large as a picture may be: it takes half a second to decode.
 std::string LargeJpeg() {
@@ -26,27 +26,27 @@ std::string LargeBmp(COLORREF colour) {
 
 TEST_F(Pictures, ThatAreOnlyPassedByHoldNobodyUp) {
   constexpr int games = 100;
-  Put("Imgs\\Zebra.gif", Gif(red));
+  Put("Imgs\\Zebra.gif", Gif(Red));
   for (int i = 1; i <= games; ++i) {
     const std::string name = "zz" + std::to_string(100 + i);
     Put("Roms\\" + name + ".smc", "jogo");
-    Put("Imgs\\" + name + ".jpg", i < games ? LargeJpeg() : LargeBmp(green));
+    Put("Imgs\\" + name + ".jpg", i < games ? LargeJpeg() : LargeBmp(Green));
   }
   Set("LRom", "Zebra");
   Start();
-  EXPECT_SOON_EQ(red, window->Preview());
+  EXPECT_SOON_EQ(Red, window->Preview());
   for (int i = 0; i < games; ++i) PostMessageA(window->List.Handle(), WM_KEYDOWN, VK_DOWN, 1);
   EXPECT_SOON_EQ("zz" + std::to_string(100 + games), Selected());
-  EXPECT_SOON_EQ(green, window->Preview());
+  EXPECT_SOON_EQ(Green, window->Preview());
 }
 
 TEST_F(Pictures, ThatSayTheyAreTooLargeLeaveTheOneBefore) {
-  Put("Imgs\\Zebra.gif", Gif(green));
+  Put("Imgs\\Zebra.gif", Gif(Green));
   Put("Imgs\\Élan.jpg", contract::SmallJpeg({56540, 56540}));
   Put("Imgs\\Corrida das Nuvens.jpg", contract::SmallJpeg({8000, 8000}));
   Set("LRom", "Zebra");
   Start();
-  EXPECT_SOON_EQ(green, window->Preview());
+  EXPECT_SOON_EQ(Green, window->Preview());
   for (const char* game : {"Élan", "Corrida das Nuvens"}) {
     Select(game);
     window->Floppy.Click();  // handled behind the selection
@@ -54,7 +54,7 @@ TEST_F(Pictures, ThatSayTheyAreTooLargeLeaveTheOneBefore) {
     window->Floppy.Click();
     EXPECT_SOON(!window->FloppyChecked());
     window->FinishPainting();
-    EXPECT_EQ(window->Preview(), green) << game;
+    EXPECT_EQ(window->Preview(), Green) << game;
   }
 }
 

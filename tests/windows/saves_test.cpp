@@ -97,7 +97,8 @@ TEST_F(Saves, AreListedCopiedBothWaysAndReplacedAndDeletedOnYesOnly) {
     std::string Entry, Source, Copy;
   } cases[] = {{&floppy, &computer, "Água Viva [State 0]", "AGUA.ZST", "AGUA.zst"},
                {&computer, &floppy, "Zebra [State 9]", "ZEBRA.zs9", "ZEBRA.zs9"}};
-  for (const auto& [from, to, entry, source, copy] : cases) {
+  for (const auto& [from, other, entry, source, copy] : cases) {
+    Side* const to = other;
     const Texts before = EntriesOf(*to);
     Pick(*from, entry);
     manager->Copy.Click();

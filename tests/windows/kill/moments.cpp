@@ -46,11 +46,11 @@ void Moments::Wait(double milliseconds, const std::function<bool()>& ended) cons
 
 // What is written too quickly to be seen is killed around the moment at which it was last written.
 void Moments::AwaitOne(const std::function<bool()>& ended, bool whileWriting) {
-  constexpr double Quick = 3;  // milliseconds
+  constexpr double quick = 3;  // milliseconds
   const double writes = lastWrite_ - firstWrite_;
   const auto atRandom = [&](double from, double to) { return std::uniform_real_distribution(from, to)(random_); };
   if (!whileWriting) return Wait(atRandom(0, whole_), ended);
-  if (writes < Quick) return Wait(firstWrite_ + atRandom(-2 * Quick, Quick), [] { return false; });
+  if (writes < quick) return Wait(firstWrite_ + atRandom(-2 * quick, quick), [] { return false; });
   while (!Writing() && !ended() && Passed() < Limit) continue;
   Wait(atRandom(0, writes), ended);
 }
