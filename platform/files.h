@@ -93,11 +93,11 @@ struct DirectoryEntry {
 // The files of a directory (its path ends with a backslash) whose long names match one of the patterns
 // ("*.zip;*.smc"; "*" and "?", without regard to letter case), without hidden and system files and directories,
 // in ascending order of their names as CompareStringA orders them. An entry that cannot be read is left out. Empty when
-// the directory cannot be read.
+// the directory cannot be read, or its path ends otherwise.
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns);
 
 // The names of the directories in a directory (its path ends with a backslash), in the order of ListDirectory, without
-// hidden and system ones and without "." and "..". Empty when the directory cannot be read.
+// hidden and system ones and without "." and "..". Empty when the directory cannot be read, or its path ends otherwise.
 std::vector<std::string> ListSubdirectories(const std::string& directory);
 
 // The listing of exactly this path, no wildcards: nothing when it is missing, a directory, hidden or system.

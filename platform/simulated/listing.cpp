@@ -31,12 +31,16 @@ bool IsSeenDirectory(const Entry& entry) {
   return entry.IsDirectory() && (entry.Attributes & (AttributeHidden | AttributeSystem)) == 0;
 }
 
+bool IsDirectory(const std::optional<Place>& place) {
+  return place && place->EndsWithBackslash && place->Found && place->Found->IsDirectory();
+}
+
 }  // namespace
 
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
   const bool fault = Fails();
   const std::optional<Place> place = Locate(directory);
-  if (fault || !place || !place->Found || !place->Found->IsDirectory()) return {};
+  if (fault || !IsDirectory(place)) return {};
   const std::string wanted = CharUpperBuffA(patterns);
   Found found;
   for (const auto& [upperName, entry] : place->Found->Entries) {
@@ -53,7 +57,7 @@ std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const st
 std::vector<std::string> ListSubdirectories(const std::string& directory) {
   const bool fault = Fails();
   const std::optional<Place> place = Locate(directory);
-  if (fault || !place || !place->Found) return {};
+  if (fault || !IsDirectory(place)) return {};
   Found found;
   for (const auto& [upperName, entry] : place->Found->Entries) {
     if (IsSeenDirectory(*entry)) found.emplace_back(simulated::SortKey(entry->Name), entry.get());

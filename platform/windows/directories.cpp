@@ -44,10 +44,12 @@ DirectoryEntry EntryOf(const WIN32_FIND_DATAW& data) {
   return {ToAnsi(data.cFileName), ToAnsi(data.cAlternateFileName)};
 }
 
-// What a directory holds, as far as it is wanted, in the order of the names.
+// What a directory holds, as far as it is wanted, in the order of the names. A path without its last backslash would
+// list what begins with the directory's name beside it.
 template <typename Wanted>
 std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& wanted) {
   std::vector<DirectoryEntry> found;
+  if (!directory.ends_with('\\') && !directory.ends_with('/')) return found;
   WIN32_FIND_DATAW data;
   const FindHandle find = FindFirst(directory + "*", data);
   for (bool more = find != nullptr; more; more = FindNext(find, data)) {

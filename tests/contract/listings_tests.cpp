@@ -31,6 +31,7 @@ class Listings : public Machine {
 };
 
 TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
+  for (const char* name : {"Zebra\\within.txt", "Zebra beside.txt"}) Put(here_ + name);
   const std::tuple<const char*, string, string, Names> cases[] = {
       {"one pattern",
        here_,
@@ -41,6 +42,7 @@ TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
       {"in another letter case", here_, "a\xC7*", {"A\xE7\xE3o.SmC"}},
       {"no pattern", here_, "", {}},
       {"no directory", here_ + "nowhere\\", "*", {}},
+      {"a directory without its last backslash", here_ + "Zebra", "*", {}},
       {"a path that names nothing", here_ + Zero, "*", {}},
   };
   for (const auto& [name, directory, patterns, expected] : cases) {
@@ -50,7 +52,8 @@ TEST_F(Listings, HoldInOrderWhatMatchesAndCanBeSeen) {
   }
   EXPECT_EQ(ListSubdirectories(here_), (Names{"\xC1gua", "emu 10", "EMU 2.zip", "readonly", "Zebra"}));
   EXPECT_EQ(ListSubdirectories(here_ + "Zebra\\"), Names{"in"});
-  for (const string& none : {here_ + "Zebra\\in\\", here_ + "nowhere\\", here_ + Zero, string("q:\\")}) {
+  for (const string& none :
+       {here_ + "Zebra\\in\\", here_ + "Zebra", here_ + "nowhere\\", here_ + Zero, string("q:\\")}) {
     EXPECT_EQ(ListSubdirectories(none), Names()) << none;
   }
   for (const string& name :
