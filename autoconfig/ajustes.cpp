@@ -41,6 +41,9 @@ Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Out
   for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
     if ((novos.*cada.Texto).empty()) novos.*cada.Texto = cada.Padrao;
   }
+  for (std::string Ajustes::*diretorio : {&Ajustes::RomDir, &Ajustes::SaveDir, &Ajustes::ImgDir}) {
+    novos.*diretorio = ComBarra(novos.*diretorio);
+  }
   if (Emulador.empty()) return novos;
   if (Outro || novos.EmuExe.empty()) novos.EmuExe = AjusteDoEmulador(Emulador);
   if (Outro || novos.EmuCFG.empty()) novos.EmuCFG = CaminhoRelativo(ConfiguracaoDoEmulador(Emulador));

@@ -12,7 +12,7 @@
 bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos);
 
 // What the settings become for an emulator, or with the empty text for none. What is set stays, but for the emulator's
-// two files when the person has chosen another one.
+// two files when the person has chosen another one; a directory without its last backslash gets it.
 Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Outro);
 
 // A path for the settings: inside the program's directory it is written with the leading backslash.

@@ -11,6 +11,7 @@
 #include "platform/text.h"
 #include "platform/wildcards.h"
 #include "support/brancos.h"
+#include "support/caminhos.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 
@@ -21,11 +22,6 @@ constexpr int NiveisDoPrograma = 3, NiveisDeProgramas = 2, NiveisDaRaiz = 3;
 constexpr const char* NomesDeEmuladores = "ZSNES*;EMU*";
 constexpr std::array VariaveisDeProgramas = {"ProgramFiles", "ProgramFiles(x86)", "ProgramW6432"};
 constexpr int MaisDiretorios = 3000;  // at each place
-
-std::string ComBarra(std::string Diretorio) {
-  if (!Diretorio.ends_with('\\')) Diretorio += '\\';
-  return Diretorio;
-}
 
 // What stands between semicolons, without quotes and blanks around it.
 std::vector<std::string> Partes(std::string_view Texto) {

@@ -4,6 +4,10 @@
 
 std::string DiretorioDe(const std::string& Caminho) { return Caminho.substr(0, Caminho.rfind('\\') + 1); }
 
+std::string ComBarra(const std::string& Diretorio) {
+  return Diretorio.ends_with('\\') || Diretorio.ends_with('/') ? Diretorio : Diretorio + '\\';
+}
+
 std::string UltimaParte(const std::string& Caminho) { return Caminho.substr(Caminho.rfind('\\') + 1); }
 
 std::optional<std::string> NomeBase(const std::string& NomeDoArquivo) {

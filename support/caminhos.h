@@ -7,6 +7,9 @@
 // Up to its last backslash, that included; empty when there is none.
 std::string DiretorioDe(const std::string& Caminho);
 
+// The directory's path, with a backslash added where it ends with no separator.
+std::string ComBarra(const std::string& Diretorio);
+
 // Behind its last backslash: all of it when there is none.
 std::string UltimaParte(const std::string& Caminho);
 

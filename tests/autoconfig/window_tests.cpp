@@ -92,6 +92,10 @@ TEST_F(Configurator, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
       // what is set, what is chosen in the list, and what is set afterwards
       {"another one and back", all, {1, 0}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", mine, cfg}},
       {"another one", all, {1}, {"D:\\Jogos\\", "\\Salvos\\", "\\Imgs\\", Defaults[3], Defaults[4]}},
+      {"directories without their last backslash",
+       {"D:\\Jogos", "D:/Salvos/", "\\Figuras", mine, cfg},
+       {},
+       {"D:\\Jogos\\", "D:/Salvos/", "\\Figuras\\", mine, cfg}},
       {"none, a file alone was set", fileOnly, {}, {"\\Roms\\", "\\Saves\\", "\\Imgs\\", Defaults[3], "D:\\meu.cfg"}},
       {"another one, a file alone was set",
        fileOnly,
