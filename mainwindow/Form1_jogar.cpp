@@ -96,10 +96,10 @@ void Form1::GravarPartida(const std::string& UltimoJogo) {
   GravarAjuste("pt", std::to_string(Top()));
 }
 
-// The command line has no quotes: the short form of the ROM's path needs none.
+// The short form of the ROM's path has no blanks where the disk keeps short names; the long one may need quotes.
 void Form1::IniciarEmulador(const Jogo& Escolhido) {
   const auto barra = ArquivoEmulador.rfind('\\');
   if (barra == std::string::npos) return;
   std::string diretorio = ArquivoEmulador.substr(0, barra);
-  ExecutarPrograma(ArquivoEmulador + " " + Escolhido.ArquivoCurto, 100, false, 2, diretorio);
+  ExecutarPrograma(Argumento(ArquivoEmulador) + " " + Argumento(Escolhido.ArquivoCurto), 100, false, 2, diretorio);
 }

@@ -19,9 +19,9 @@ std::uint32_t ClasseDePrioridade(int Prioridade) {
   }
 }
 
-// Where an absolute path begins that stands at the beginning of the text or behind a blank.
+// Where an absolute path begins that stands at the beginning of the text or behind a blank or a quotation mark.
 bool ComecaCaminho(const std::string& Texto, std::size_t Posicao) {
-  return (Posicao == 0 || Texto[Posicao - 1] == ' ') &&
+  return (Posicao == 0 || Texto[Posicao - 1] == ' ' || Texto[Posicao - 1] == '"') &&
          (Texto.compare(Posicao + 1, 2, ":\\") == 0 || Texto.compare(Posicao, 2, "\\\\") == 0);
 }
 
@@ -44,6 +44,10 @@ void EsperarFim(const platform::Process& Processo, std::uint32_t Intervalo) {
 }
 
 }  // namespace
+
+std::string Argumento(const std::string& Texto) {
+  return Texto.find(' ') == std::string::npos ? Texto : '"' + Texto + '"';
+}
 
 bool ExecutarPrograma(const std::string& Comando, std::uint32_t Intervalo, bool Esperar, int Prioridade,
                       std::string& Diretorio) {

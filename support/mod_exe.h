@@ -4,6 +4,9 @@
 #include <cstdint>
 #include <string>
 
+// The text as one argument of a command line: in quotes when there is a blank in it, else as it is.
+std::string Argumento(const std::string& Texto);
+
 // Starts the program at the beginning of the command line, which is passed on as it stands; false when it cannot be
 // started. `Prioridade` says how the program shares the processor with others, for one that should give way or must
 // not wait: 1 idle, 2 normal, 3 high, 4 realtime, any other number normal. An empty `Diretorio` becomes

@@ -61,6 +61,38 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   EXPECT_TRUE(form->IsClosed());
 }
 
+// Without quotes the line would start what stands before the first blank of the emulator's path.
+TEST_F(Play, PutsInQuotesWhatHasABlankAndNothingElse) {
+  const struct {
+    const char* Name;
+    std::string Emulator;
+    bool ShortNames;
+    std::string Line;
+  } cases[] = {
+      {"no blank", "C:\\Emu\\zsnesw.exe", true, "C:\\Emu\\zsnesw.exe C:\\Tolvaris\\Roms\\NOMECO~1.SMC"},
+      {"in the emulator's path", "C:\\Emu 2\\zsnesw.exe", true,
+       "\"C:\\Emu 2\\zsnesw.exe\" C:\\Tolvaris\\Roms\\NOMECO~1.SMC"},
+      {"in the ROM's, which has no short form", "C:\\Emu\\zsnesw.exe", false,
+       "C:\\Emu\\zsnesw.exe \"C:\\Tolvaris\\Roms\\Nome comprido.smc\""},
+  };
+  for (const auto& [name, emulator, shortNames, line] : cases) {
+    SCOPED_TRACE(name);
+    SetUpMachine();
+    if (!shortNames) KeepNoShortNames();
+    PutFile(Roms + "Nome comprido.smc", Rom);
+    PutText(Key, "EmuExe", emulator);
+    for (const std::string& program : {emulator, "C:\\Emu.exe"s}) PutFile(program, "MZ");
+    bool another = false;
+    OnProcess("C:\\Emu.exe", 0, [&] { another = true; });
+    StartAndPick("Nome comprido");
+    Click(form->Command1);
+    ASSERT_EQ(StartedProcesses().size(), 1U);
+    EXPECT_EQ(StartedProcesses()[0].CommandLine, line);
+    EXPECT_EQ(StartedProcesses()[0].Directory + "\\zsnesw.exe", emulator);
+    EXPECT_FALSE(another);
+  }
+}
+
 TEST_F(Play, AndTheSaveManagerWaitForADiskUntilTheUserGivesUp) {
   StartAndPick("Super Jogo");
   Click(form->Check1);

@@ -45,12 +45,13 @@ TEST_F(Services, AProgramStartsWithItsPriorityInItsDirectory) {
       {"no directory", "C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "", 2, "C:\\Roms\\", 0x20},
       {"a directory, idle", "C:\\Emu\\emu.exe C:\\Roms\\Jogo.smc", "C:\\Emu", 1, "C:\\Emu", 0x40},
       {"a blank in the command, high", "C:\\Emu 2\\emu.exe -x", "", 3, "C:\\Emu 2\\", 0x80},
+      {"blanks and quotes", "\"C:\\Emu 2\\emu.exe\" \"C:\\Meus Jogos\\Um.smc\"", "", 2, "C:\\Meus Jogos\\", 0x20},
       {"the program alone, real time", "C:\\Emu\\emu.exe", "", 4, "C:\\Emu\\", 0x100},
       {"no such priority", "C:\\Emu\\emu.exe", "", 5, "C:\\Emu\\", 0x20},
   };
   PutFile("C:\\Emu\\emu.exe", "MZ");
   PutFile("C:\\Emu 2\\emu.exe", "MZ");
-  PutDirectory("C:\\Roms");
+  for (const char* directory : {"C:\\Roms", "C:\\Meus Jogos"}) PutDirectory(directory);
   for (const auto& [name, command, wanted, priority, used, priorityClass] : cases) {
     SCOPED_TRACE(name);
     std::string directory = wanted;

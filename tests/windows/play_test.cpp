@@ -51,6 +51,17 @@ TEST_F(Play, TellsHowToLeaveAGameAndRemembersThatAndTheGameAndTheWindow) {
   EXPECT_EQ(window->Place().top, 40);
 }
 
+TEST_F(Play, StartsTheEmulatorAndNotWhatStandsBeforeABlankInItsPath) {
+  const std::string emulator = Home + "Meu Emulador\\zsnesw.exe";
+  for (const char* file : {"Meu.exe", "Meu Emulador\\zsnesw.exe"}) PutStandIn(file);
+  Set("EmuExe", emulator);
+  Start();
+  window->Play.Click();
+  EXPECT_EQ(NextCall(emulator),
+            (Call{"\"" + emulator + "\" " + ShortPath(Home + "Roms\\ZEBRA.SMC"), Home + "Meu Emulador"}));
+  EXPECT_EQ(Content("Meu.exe.call"), "");
+}
+
 // The emulator's configuration file: a comment that mentions the keys, and a last line without an end.
 std::string EmulatorConfiguration(const std::string& saves, const std::string& games) {
   return "; SaveDirectory and GameDirectory: \t\x1A\xE9\r\n\r\nOption = 1\r\n" + saves + "\r\n\r\n" + games +
