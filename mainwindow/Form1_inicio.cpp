@@ -70,7 +70,7 @@ Form1::Configuracao Form1::VerificarConfiguracao() {
   }
   if (MostrarMensagem(Mensagem::SemConfiguracao) != platform::Answer::Yes) return Configuracao::Desistir;
   std::string diretorio = DirPrograma;
-  ExecutarPrograma(configurador, 500, true, 2, diretorio);
+  ExecutarPrograma(Argumento(configurador), 500, true, 2, diretorio);
   platform::RunPendingEvents();
   return Configuracao::Repetir;
 }

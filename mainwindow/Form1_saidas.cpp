@@ -22,7 +22,7 @@ void Form1::Command3_Click() {
   Catalogo().Fechar();
   const std::string identificadores = std::to_string(Handle()) + "@" + std::to_string(List1.Handle());
   std::string diretorio = DirPrograma;
-  if (ExecutarPrograma(downloader + " " + identificadores, 100, false, 2, diretorio)) {
+  if (ExecutarPrograma(Argumento(downloader) + " " + identificadores, 100, false, 2, diretorio)) {
     Timer1.Enable(true);
     return;
   }

@@ -150,6 +150,20 @@ TEST_F(HandOver, TheWindowWaitsForTheDownloaderAndShowsWhatItBrought) {
   EXPECT_EQ(States(), GameSelected);
 }
 
+TEST_F(HandOver, ABlankInTheProgramsDirectoryIsPartOfThePath) {
+  const std::string home = "C:\\Meu Tolvaris\\", configurator = home + "tolvariscfg.exe";
+  SetProgramDirectory(home);
+  for (const std::string& program : {home + "tolvarisdownload.exe", configurator}) PutFile(program, "MZ");
+  PutText(Key, "EmuExe", "");
+  OnProcess(configurator, 1, [] { PutText(Key, "EmuExe", Emulator); });
+  QueueAnswer(Answer::Yes);
+  ASSERT_TRUE(Start());
+  Click(form->Command3);
+  ASSERT_EQ(StartedProcesses().size(), 2U);
+  EXPECT_EQ(StartedProcesses()[0].CommandLine, "\"" + configurator + "\"");
+  EXPECT_TRUE(StartedProcesses()[1].CommandLine.starts_with("\"" + home + "tolvarisdownload.exe\" "));
+}
+
 TEST_F(HandOver, AMissingDownloaderIsToldAndOneThatDoesNotStartGivesTheWindowBack) {
   ASSERT_TRUE(Start());
   Click(form->Command3);
