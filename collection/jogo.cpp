@@ -19,7 +19,8 @@ Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurt
   jogo.Catalogado = encontrado != Falso;
   if (jogo.Catalogado) jogo.DOSName = Catalogo().DefineDOSName(jogo.Nome);
   jogo.ArquivoCurto = DirCurto + (Entrada.ShortName.empty() ? Entrada.Name : Entrada.ShortName);
-  jogo.Arquivo = DirRoms + Entrada.Name;
+  jogo.SemCaminho = Entrada.PathName().empty();
+  jogo.Arquivo = DirRoms + (jogo.SemCaminho ? Entrada.Name : Entrada.PathName());
   return jogo;
 }
 

@@ -11,6 +11,7 @@ struct Jogo {
   std::string ArquivoCurto;  // Arquivo in 8.3 form, for the emulator's command line
   std::string Arquivo;       // full path of the ROM file; empty for a file without an extension, which is no game
   bool Catalogado = false;   // the catalogue has an entry for the file's base name
+  bool SemCaminho = false;   // no path leads to the file: the code page lacks its name, and the disk has no short one
 };
 
 // The game of a file of the ROM directory, whose path in 8.3 form is given. The listing carries each file's own short

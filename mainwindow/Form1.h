@@ -102,8 +102,8 @@ class Form1 : public platform::Window {
   void GravarPartida(const std::string& UltimoJogo);
   void IniciarEmulador(const Jogo& Escolhido);
 
-  // A copy of the selected game's row (pending events may rebuild the table) when it and its ROM file are there;
-  // otherwise says what is missing.
+  // A copy of the selected game's row (pending events may rebuild the table) when it and its ROM file are there and can
+  // be reached; otherwise says what is missing.
   std::optional<Jogo> JogoSelecionado() const;
 
   std::string NomeSelecionado() const;  // text of the selected entry; empty when there is none

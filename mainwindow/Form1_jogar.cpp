@@ -58,6 +58,10 @@ std::optional<Jogo> Form1::JogoSelecionado() const {
     return std::nullopt;
   }
   const Jogo& selecionado = Jogos[static_cast<std::size_t>(linha)];
+  if (selecionado.SemCaminho) {
+    MostrarMensagem(Mensagem::NomeForaDoWindows);
+    return std::nullopt;
+  }
   if (!ArquivoExiste(selecionado.Arquivo)) {
     MostrarMensagem(Mensagem::JogoNaoEncontrado);
     return std::nullopt;

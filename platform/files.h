@@ -85,8 +85,13 @@ bool MoveFileExA(const std::string& from, const std::string& to, Existing existi
 bool CreateDirectoryA(const std::string& path);  // one directory; false when it exists or its parent does not
 
 struct DirectoryEntry {
-  std::string Name;       // as it is written on the disk
+  std::string Name;       // as it is written on the disk; for what the code page lacks, a look-alike or "?"
   std::string ShortName;  // its 8.3 form, where the disk keeps another one; else empty
+  bool IsExact = true;    // else the code page lacks the name: a path with it leads to nothing, or to another file
+
+  // The name for a path that leads here: as it is written, or else the short one. Empty when there is none.
+  const std::string& PathName() const { return IsExact ? Name : ShortName; }
+
   bool operator==(const DirectoryEntry&) const = default;
 };
 
@@ -97,7 +102,8 @@ struct DirectoryEntry {
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns);
 
 // The names of the directories in a directory (its path ends with a backslash), in the order of ListDirectory, without
-// hidden and system ones and without "." and "..". Empty when the directory cannot be read, or its path ends otherwise.
+// hidden and system ones and without "." and "..", each as a path has it; one that no path leads to is left out. Empty
+// when the directory cannot be read, or its path ends otherwise.
 std::vector<std::string> ListSubdirectories(const std::string& directory);
 
 // The listing of exactly this path, no wildcards: nothing when it is missing, a directory, hidden or system.

@@ -22,7 +22,7 @@ void Form4::Preencher(const Painel& Este) {
   std::vector<std::string> textos;
   if (!Este.Diretorio.empty()) {
     for (const platform::DirectoryEntry& arquivo : platform::ListDirectory(Este.Diretorio, PadraoSalvamentos)) {
-      textos.push_back(NomeExibido(arquivo.Name, Catalogo()));
+      if (!arquivo.PathName().empty()) textos.push_back(NomeExibido(arquivo.PathName(), Catalogo()));
     }
   }
   Este.Lista.Fill(textos);

@@ -35,6 +35,13 @@ constexpr DescricaoDeMensagem Tabela[] = {
 
     {JogoDesconhecido, "JogoDesconhecido", {"Erro interno: jogo não encontrado no sistema."}, "Erro", Ok, Critical},
     {JogoNaoEncontrado, "JogoNaoEncontrado", {"O jogo não foi encontrado."}, "Erro", Ok, Critical},
+    {NomeForaDoWindows,
+     "NomeForaDoWindows",
+     {"O nome do arquivo do jogo tem letras que o Tolvaris não pode usar neste Windows.", Peca::Linha,
+      "Mude o nome do arquivo e abra o Tolvaris de novo."},
+     "Erro",
+     Ok,
+     Critical},
     {EmuladorNaoEncontrado, "EmuladorNaoEncontrado", {"O emulador ZSnes não foi encontrado."}, "Erro", Ok, Critical},
     {SemDisquete,
      "SemDisquete",

@@ -17,6 +17,7 @@ enum class Mensagem {
   // Playing.
   JogoDesconhecido,
   JogoNaoEncontrado,
+  NomeForaDoWindows,
   EmuladorNaoEncontrado,
   SemDisquete,
   ComoFecharOJogo,

@@ -94,6 +94,17 @@ void PutFile(const std::string& path, std::string_view content, std::uint32_t at
   Attach(place, std::move(entry));
 }
 
+void PutForeignFile(const std::string& path, std::string_view content) {
+  const std::size_t name = path.rfind('\\') + 1;
+  const std::string written = path.substr(0, name) + "foreign";
+  PutFile(written, content);
+  Place place = Demand(written);
+  const std::shared_ptr<Entry> entry = place.Found;
+  Detach(place);
+  place.Name = path.substr(name);
+  Attach(place, entry);
+}
+
 void SetAttributes(const std::string& path, std::uint32_t attributes) {
   const std::optional<Place> place = Locate(path);
   if (!place || !place->Found) return;

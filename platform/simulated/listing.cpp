@@ -23,6 +23,11 @@ void Sort(Found& found) {
   if (!std::is_sorted(found.begin(), found.end(), before)) std::stable_sort(found.begin(), found.end(), before);
 }
 
+// A name that the code page lacks has a "?" in it, which no path can have.
+DirectoryEntry EntryOf(const Entry& entry) {
+  return {entry.Name, entry.ShortName, entry.Name.find('?') == std::string::npos};
+}
+
 bool IsListed(const Entry& entry) {
   return (entry.Attributes & (AttributeHidden | AttributeSystem | AttributeDirectory)) == 0;
 }
@@ -50,7 +55,7 @@ std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const st
   }
   Sort(found);
   std::vector<DirectoryEntry> entries;
-  for (const auto& [key, entry] : found) entries.push_back({entry->Name, entry->ShortName});
+  for (const auto& [key, entry] : found) entries.push_back(EntryOf(*entry));
   return entries;
 }
 
@@ -64,7 +69,10 @@ std::vector<std::string> ListSubdirectories(const std::string& directory) {
   }
   Sort(found);
   std::vector<std::string> names;
-  for (const auto& [key, entry] : found) names.push_back(entry->Name);
+  for (const auto& [key, entry] : found) {
+    const DirectoryEntry listed = EntryOf(*entry);
+    if (!listed.PathName().empty()) names.push_back(listed.PathName());
+  }
   return names;
 }
 
@@ -72,7 +80,7 @@ std::optional<DirectoryEntry> ListPath(const std::string& path) {
   const bool fault = Fails();
   const std::optional<Place> place = Locate(path);
   if (fault || !place || !place->Found || place->EndsWithBackslash || !IsListed(*place->Found)) return std::nullopt;
-  return DirectoryEntry{place->Found->Name, place->Found->ShortName};
+  return EntryOf(*place->Found);
 }
 
 std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_t bufferLength) {

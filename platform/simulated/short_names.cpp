@@ -9,7 +9,7 @@
 namespace platform::simulated {
 namespace {
 
-constexpr std::string_view NotInShortNames = " +,;=[].";
+constexpr std::string_view NotInShortNames = " +,;=[].?";
 
 bool IsPlain(char character) {
   return static_cast<unsigned char>(character) < 0x80 && NotInShortNames.find(character) == std::string_view::npos;

@@ -30,7 +30,9 @@ void KeepNoShortNames();  // from now on no file and no directory gets one, as o
 
 void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);                       // with its parents
 void PutFile(const std::string& path, std::string_view content, std::uint32_t attributes = 0x20);  // with its parents
-void SetAttributes(const std::string& path, std::uint32_t attributes);                             // if it exists
+// A file whose name has letters that the code page lacks, each a "?" here: only its short name leads to it, if any.
+void PutForeignFile(const std::string& path, std::string_view content);
+void SetAttributes(const std::string& path, std::uint32_t attributes);  // if it exists
 // As if another program held it: it cannot be opened, renamed, replaced or deleted.
 void LockFile(const std::string& path, bool locked = true);
 void RemoveFile(const std::string& path);

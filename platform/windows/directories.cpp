@@ -41,7 +41,10 @@ bool FindNext(const FindHandle& find, WIN32_FIND_DATAW& data) {
 
 // The wide structure holds every name, where that of ANSI has 260 bytes and fails at a longer one.
 DirectoryEntry EntryOf(const WIN32_FIND_DATAW& data) {
-  return {ToAnsi(data.cFileName), ToAnsi(data.cAlternateFileName)};
+  DirectoryEntry entry{ToAnsi(data.cFileName), ToAnsi(data.cAlternateFileName)};
+  entry.IsExact = ToWide(entry.Name) == data.cFileName;
+  if (ToWide(entry.ShortName) != data.cAlternateFileName) entry.ShortName.clear();
+  return entry;
 }
 
 // What a directory holds, as far as it is wanted, in the order of the names. A path without its last backslash would
@@ -89,7 +92,9 @@ std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const st
 
 std::vector<std::string> ListSubdirectories(const std::string& directory) {
   std::vector<std::string> names;
-  for (DirectoryEntry& each : Collect(directory, IsSubdirectory)) names.push_back(std::move(each.Name));
+  for (const DirectoryEntry& each : Collect(directory, IsSubdirectory)) {
+    if (!each.PathName().empty()) names.push_back(each.PathName());
+  }
   return names;
 }
 

@@ -1,6 +1,7 @@
 // Listings of directories in which Windows cannot read everything.
 #include <windows.h>
 
+#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -48,17 +49,27 @@ TEST_F(BrokenListings, GoOnBehindAnEntryThatFailsAndEndWhereEverythingDoes) {
   EXPECT_LT(calls, 20) << "a disk that is gone must not keep the program";
 }
 
-// As they are in the ANSI form of Windows' own listing: a letter that looks like it, or "?".
-TEST_F(BrokenListings, HoldNamesThatTheCodePageLacks) {
+// As they are in the ANSI form of Windows' own listing: a letter that looks like it, or "?". The one with the letter
+// names another file here.
+TEST_F(BrokenListings, LeadByTheShortNameToWhatTheCodePageLacks) {
+  Put(here_ + "A.smc", "another");
+  const std::wstring here(here_.begin(), here_.end());
   for (const wchar_t* name : {L"\u0100.smc", L"\u65E5.smc"}) {
-    const std::wstring path = std::wstring(here_.begin(), here_.end()) + name;
-    const HANDLE file = ::CreateFileW(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW, 0, nullptr);
+    const HANDLE file = ::CreateFileW((here + name).c_str(), GENERIC_WRITE, 0, nullptr, CREATE_NEW, 0, nullptr);
     EXPECT_NE(file, INVALID_HANDLE_VALUE);
     ::CloseHandle(file);
   }
-  std::vector<string> names;
-  for (const DirectoryEntry& entry : ListDirectory(here_, "*.smc")) names.push_back(entry.Name);
-  EXPECT_EQ(names, (std::vector<string>{"?.smc", "A.smc"}));
+  std::vector<string> found;
+  for (const DirectoryEntry& entry : ListDirectory(here_, "*.smc")) {
+    found.push_back(entry.Name + ": " + Content(here_ + entry.PathName()));
+  }
+  std::sort(found.begin(), found.end());
+  EXPECT_EQ(found, (std::vector<string>{"?.smc: ", "A.smc: ", "A.smc: another"}));
+
+  EXPECT_TRUE(::CreateDirectoryW((here + L"\u65E5").c_str(), nullptr));
+  const std::vector<string> directories = ListSubdirectories(here_);
+  ASSERT_EQ(directories.size(), 1U);
+  EXPECT_TRUE(GetFileAttributesA(here_ + directories[0])) << directories[0];
 }
 
 }  // namespace

@@ -37,6 +37,30 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
   }
 }
 
+TEST_F(Commands, OnAGameWhoseNameTheCodePageLacksUseItsShortNameOrSayWhyNot) {
+  for (const bool shortNames : {true, false}) {
+    SetUpMachine();
+    if (!shortNames) KeepNoShortNames();
+    PutForeignFile(Roms + "Jogo ??.smc", Rom);
+    ASSERT_TRUE(Start());
+    const Texts before = AllFiles();
+    for (platform::Button* command : {&form->Command1, &form->Command5, &form->Command6}) {
+      Pick("Jogo ??");
+      Click(*command);
+    }
+    if (shortNames) {
+      ASSERT_EQ(StartedProcesses().size(), 1U);
+      EXPECT_EQ(StartedProcesses()[0].CommandLine, Emulator + " " + Roms + "JOGO__~1.SMC");
+      EXPECT_EQ(ShownFileDialogs().size(), 1U);
+      EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::DeletarJogo, "Jogo ??")});
+    } else {
+      EXPECT_TRUE(StartedProcesses().empty());
+      EXPECT_EQ(TakeMessages(), Texts(3, Told(Mensagem::NomeForaDoWindows)));
+      EXPECT_EQ(AllFiles(), before);
+    }
+  }
+}
+
 // With any one call of the platform failing, or all later ones too, or the power gone, and when it goes afterwards:
 // each file is as it was before or as it is without a failure, the person is told one thing, and the window can be
 // used.

@@ -109,16 +109,19 @@ struct Saves : FreshMachine {
 
 TEST_F(Saves, AreListedUnderTheNamesOfTheirGamesAndThePickedOneDecides) {
   for (const char* const file : {"A:\\UM.ZS3", "A:\\um.zst", "A:\\UM.txt"}) PutFile(file, "x");
+  PutForeignFile("A:\\Um?.srm", "x");
+  KeepNoShortNames();
+  PutForeignFile("A:\\Dois?.srm", "x");  // no path leads to it
   const std::string fromFloppy = ", right -1, delete left, -> Copiar do disquete para o computador: ";
   const std::tuple<ListBox Form4::*, int, std::string> steps[] = {
       {&Form4::List1, 1, "direction 1, left 1" + fromFloppy + "UM.srm"},
       {&Form4::List1, 0, "direction 1, left 0" + fromFloppy + "DOIS.zst"},
       {&Form4::List2, 1,
        "direction 2, left -1, right 1, delete right, <- Copiar do computador para o disquete: SEMNOME.zs2"},
-      {&Form4::List1, 1, "direction 1, left 1" + fromFloppy + "UM.srm"},
+      {&Form4::List1, 4, "direction 1, left 4" + fromFloppy + "UM_~1.srm"},
   };
   OpenWith([&](Form4& window) {
-    EXPECT_EQ(EntriesOf(window.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|");
+    EXPECT_EQ(EntriesOf(window.List1), "Corrida 2 [State 0]|Jogo Um|Jogo Um [State 0]|Jogo Um [State 3]|UM_~1|");
     EXPECT_EQ(EntriesOf(window.List2), "Corrida 2 [State 0]|SEMNOME [State 2]|");
     window.List2_Click();
     window.Command1_Click();

@@ -19,6 +19,8 @@ const ShownMessage Expected[] = {
     {"Guarde os comandos do controle. Se necessário anote-os."_ansi, "Informação"_ansi, Buttons::Ok, Icon::Information},
     {"Erro interno: jogo não encontrado no sistema."_ansi, "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"O jogo não foi encontrado."_ansi, "Erro"_ansi, Buttons::Ok, Icon::Critical},
+    {"O nome do arquivo do jogo tem letras que o Tolvaris não pode usar neste Windows.\r\nMude o nome do arquivo e abra o Tolvaris de novo."_ansi,
+     "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"O emulador ZSnes não foi encontrado."_ansi, "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"Não há disquete na unidade A:\\\r\n\r\nColoque um disquete e clique em 'Repetir'."_ansi, "Disquete A:"_ansi,
      Buttons::RetryCancel, Icon::Exclamation},

@@ -1,5 +1,6 @@
 // Playing a game: what the emulator is told, and what is remembered.
 #include <filesystem>
+#include <fstream>
 
 #include "tests/windows/installation.h"
 
@@ -60,6 +61,19 @@ TEST_F(Play, StartsTheEmulatorAndNotWhatStandsBeforeABlankInItsPath) {
   EXPECT_EQ(NextCall(emulator),
             (Call{"\"" + emulator + "\" " + ShortPath(Home + "Roms\\ZEBRA.SMC"), Home + "Meu Emulador"}));
   EXPECT_EQ(Content("Meu.exe.call"), "");
+}
+
+// It is listed under the letters that look most like its own.
+TEST_F(Play, ReachesAGameByItsShortNameWhereTheCodePageLacksTheLongOne) {
+  const std::filesystem::path foreign = std::filesystem::path(Home + "Roms") / L"\u0100lan.smc";
+  std::ofstream(foreign) << "jogo";
+  WIN32_FIND_DATAW found{};
+  FindClose(FindFirstFileW(foreign.c_str(), &found));
+  const std::string shortName = FromWide(found.cAlternateFileName);
+  ASSERT_NE(shortName, "");
+  Start();
+  ClickEntry(window->List, "Alan", 2);
+  EXPECT_EQ(NextCall(Emulator), (Call{Emulator + " " + Home + "Roms\\" + shortName, Home + "Emulador"}));
 }
 
 // The emulator's configuration file: a comment that mentions the keys, and a last line without an end.
