@@ -1,6 +1,7 @@
 // Saving the settings.
 #include "autoconfig/FormCfg.h"
 #include "autoconfig/forma_nova.h"
+#include "autoconfig/programa_dos.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
@@ -19,8 +20,12 @@ void FormCfg::Command1_Click() {
   Close();
 }
 
-// What is set already is taken as it is.
+// What is set already is taken as it is, but for an emulator that can never start.
 bool FormCfg::Conferir(const Ajustes& Novos) const {
+  if (EhProgramaDoDos(Selecionado())) {
+    MostrarMensagem(Mensagem::EmuladorDoDos, Selecionado());
+    return false;
+  }
   for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
     const std::string& novo = Novos.*cada.Texto;
     const auto motivo = novo == atuais_.*cada.Texto ? std::nullopt : Impedimento(novo);

@@ -6,6 +6,7 @@
 #include <string_view>
 #include <utility>
 
+#include "autoconfig/programa_dos.h"
 #include "platform/environment.h"
 #include "platform/files.h"
 #include "platform/text.h"
@@ -90,7 +91,8 @@ std::vector<std::string> Procura::Passo() {
   if (!novo) return {};
   std::vector<std::string> achados;
   for (const char* executavel : Executaveis) {
-    if (ArquivoExiste(atual.Diretorio + executavel)) achados.push_back(atual.Diretorio + executavel);
+    const std::string caminho = atual.Diretorio + executavel;
+    if (ArquivoExiste(caminho) && !EhProgramaDoDos(caminho)) achados.push_back(caminho);
   }
   return achados;
 }

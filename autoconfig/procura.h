@@ -26,7 +26,7 @@ class Procura {
 
   bool Terminou() const { return fila_.empty() && faltam_.empty(); }
 
-  // Looks into one more directory. The full paths of the emulators in it, the one made for Windows first.
+  // Looks into one more directory. The full paths of the emulators in it that can be started here, the likelier first.
   std::vector<std::string> Passo();
 
  private:

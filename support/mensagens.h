@@ -42,6 +42,7 @@ enum class Mensagem {
   CaminhoLongo,
   CaminhoEmRede,
   EmuladorComEspacos,
+  EmuladorDoDos,
   ConfiguracaoMaisNova,
   ErroAoGravarConfiguracao,
   ErroAoGravarAjustes,

@@ -3,6 +3,7 @@
 
 #include "autoconfig/FormCfg.h"
 #include "support/mod_Configuracao.h"
+#include "tests/autoconfig/programs.h"
 #include "tests/fresh_machine.h"
 
 namespace {
@@ -13,7 +14,7 @@ const Texts Nothing(5, "-");
 const Texts Defaults = {"\\Roms\\", "\\Saves\\", "\\Imgs\\", "\\ZSNES\\zsnesw.exe", "\\ZSNES\\zsnesw.cfg"};
 
 struct Configurator : FreshMachine {
-  Configurator() { PutFile(Emulator, "MZ"); }
+  Configurator() { PutFile(Emulator, WindowsProgram); }
 
   void Open() {
     form = std::make_unique<FormCfg>();
@@ -47,7 +48,7 @@ TEST_F(Configurator, ShowsWhatItFoundInEachLanguageAndWritesIt) {
   PressKey(form->List1, 13);
   EXPECT_EQ(Stored(), Nothing);
   EXPECT_FALSE(form->IsClosed());
-  PutFile(Emulator, "MZ");
+  PutFile(Emulator, WindowsProgram);
   PutFile("C:\\Tolvaris\\language.ini",
           "[TOLVARIS20]\r\nConfiguração do Tolvaris=Setup\r\nEmuladores encontrados:=Found\r\n"
           "&Procurar outro...=Other\r\n Configuração =Settings\r\nImagens:=Pictures\r\n"
@@ -106,7 +107,7 @@ TEST_F(Configurator, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
     SCOPED_TRACE(name);
     Reset();
     AddDisk('D', 1 << 20);
-    for (const std::string& file : {mine, Emulator, DosEmulator}) PutFile(file, "MZ");
+    for (const std::string& file : {mine, Emulator, DosEmulator}) PutFile(file, WindowsProgram);
     for (std::size_t i = 0; i < before.size(); ++i) {
       if (before[i] != "-") PutText(Key, AjustesDeCaminhos[i].Nome, before[i]);
     }
@@ -148,7 +149,7 @@ TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
     Reset();
     if (!shortNames) KeepNoShortNames();
     SetProgramDirectory(program);
-    PutFile(chosen, "MZ");
+    PutFile(chosen, WindowsProgram);
     Open();
     ChooseOther(chosen);
     Save();
@@ -161,8 +162,9 @@ TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
 
 TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused) {
   const std::string longPath = "C:\\" + std::string(120, 'a') + "\\" + std::string(121, 'b') + "\\";
-  for (const std::string& file : {"C:\\Outro\\zsnes.exe"s, longPath + "z.exe"}) PutFile(file, "MZ");
+  for (const std::string& file : {"C:\\Outro\\zsnes.exe"s, longPath + "z.exe"}) PutFile(file, WindowsProgram);
   PutFile("C:\\Outro\\vazio.exe", "");
+  PutFile("C:\\Outro\\dos.exe", DosProgram);
   OpenAndSearch();
   for (const char* file : {"C:\\Outro\\zsnes.exe", "", "C:\\TOLVARIS\\zsnes\\ZSNESW.EXE"}) ChooseOther(file);
   EXPECT_EQ(form->List1.Count(), 2) << "nothing when it is cancelled, and nothing twice";
@@ -172,6 +174,7 @@ TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRe
   EXPECT_EQ(asked.Title + asked.Filter,
             "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
   for (const auto& [file, message] : {std::pair("C:\\Outro\\vazio.exe"s, Told(Mensagem::EmuladorNaoEncontrado)),
+                                      {"C:\\Outro\\dos.exe", Told(Mensagem::EmuladorDoDos, "C:\\Outro\\dos.exe")},
                                       {longPath + "z.exe", Told(Mensagem::CaminhoLongo, longPath + "zsnesw.cfg")}}) {
     ChooseOther(file);
     Save();
@@ -215,7 +218,7 @@ TEST_F(Configurator, EveryFaultLeavesWholeFilesAndIsSaid) {
   bool closed = false;
   std::size_t open = 0;
   const auto prepare = [this] {
-    PutFile(Emulator, "MZ");
+    PutFile(Emulator, WindowsProgram);
     PutFile(Configuration, Before);
     OpenAndSearch();
     QueueAnswer(Answer::Yes);
