@@ -51,7 +51,7 @@ class FormCfg : public platform::Window {
 
   // Save (FormCfg_gravar.cpp). Each step is false when nothing more is to be written.
   bool Conferir(const Ajustes& Novos) const;
-  bool ConfigurarFormaNova(const Ajustes& Novos) const;
+  bool PrepararConfiguracao(const Ajustes& Novos) const;
 
   Ajustes AjustesEscolhidos() const;
 

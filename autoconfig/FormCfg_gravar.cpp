@@ -2,6 +2,7 @@
 #include "autoconfig/FormCfg.h"
 #include "autoconfig/forma_nova.h"
 #include "autoconfig/programa_dos.h"
+#include "support/gravacao.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
@@ -12,7 +13,7 @@ using platform::Answer;
 void FormCfg::Command1_Click() {
   if (Selecionado().empty()) return;
   const Ajustes novos = AjustesEscolhidos();
-  if (!Conferir(novos) || !ConfigurarFormaNova(novos)) return;
+  if (!Conferir(novos) || !PrepararConfiguracao(novos)) return;
   if (!GravarAjustes(registro_, novos)) {
     MostrarMensagem(Mensagem::ErroAoGravarAjustes);
     return;
@@ -43,12 +44,19 @@ bool FormCfg::Conferir(const Ajustes& Novos) const {
   return true;
 }
 
-bool FormCfg::ConfigurarFormaNova(const Ajustes& Novos) const {
+// Without leave to write it the games start all the same: the person is told, and the settings are saved.
+bool FormCfg::PrepararConfiguracao(const Ajustes& Novos) const {
   const std::string arquivo = CaminhoConfigurado(Novos.EmuCFG);
   const std::string texto = LerArquivo(arquivo);
-  if (!FormaNova(texto)) return true;
-  const auto novo = ComDiretorios(texto, CaminhoConfigurado(Novos.RomDir), CaminhoConfigurado(Novos.SaveDir));
-  if (!novo) return true;
+  const bool nova = FormaNova(texto);
+  const auto novo =
+      nova ? ComDiretorios(texto, CaminhoConfigurado(Novos.RomDir), CaminhoConfigurado(Novos.SaveDir)) : std::nullopt;
+  if (nova && !novo) return true;
+  if (!PodeGravar(arquivo)) {
+    MostrarMensagem(Mensagem::ConfiguracaoProtegida, arquivo);
+    return true;
+  }
+  if (!nova) return true;
   const Answer resposta = MostrarMensagem(Mensagem::ConfiguracaoMaisNova);
   if (resposta != Answer::Yes) return resposta == Answer::No;
   if (GravarArquivo(arquivo, *novo, 1, true) == 1) return true;

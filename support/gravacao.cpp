@@ -140,6 +140,11 @@ bool GravarNoLugar(const std::string& Caminho, const Gravacao& Pedido, Existing 
   return false;
 }
 
+bool PodeGravar(const std::string& Caminho) {
+  if (platform::GetFileAttributesA(Caminho)) return platform::File(Caminho, platform::Access::ReadWrite).IsOpen();
+  return ArquivoAoLado(Caminho).Arquivo().IsOpen();
+}
+
 void ApagarRestos(const std::string& Diretorio) {
   constexpr std::uint32_t umaHora = 3600;  // seconds; no writing takes so long
   if (Diretorio.empty()) return;

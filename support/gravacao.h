@@ -67,6 +67,9 @@ struct Gravacao {
 bool GravarNoLugar(const std::string& Caminho, const Gravacao& Pedido,
                    platform::Existing Existente = platform::Existing::Replace);
 
+// Whether the file can be written: the one that is there, or else one beside it, which is made and deleted.
+bool PodeGravar(const std::string& Caminho);
+
 // Deletes what writing files in this directory (its path ends with a backslash) has left half done: when the program
 // was ended or the power went. What another program may still be writing stays.
 void ApagarRestos(const std::string& Diretorio);

@@ -153,6 +153,16 @@ constexpr DescricaoDeMensagem Tabela[] = {
      "Confirmar",
      YesNoCancel,
      Question},
+    {ConfiguracaoProtegida,
+     "ConfiguracaoProtegida",
+     {"O Windows não deixa o Tolvaris gravar a configuração deste emulador: ele não usará os diretórios do Tolvaris "
+      "nem o "
+      "disquete.",
+      Peca::Linha, "Ponha o emulador em um diretório seu, como C:\\ZSNES, e escolha-o de novo.", Peca::Paragrafo,
+      Peca::Valor},
+     "Informação",
+     Ok,
+     Exclamation},
     {ErroAoGravarConfiguracao,
      "ErroAoGravarConfiguracao",
      {"Erro ao gravar arquivo.", Peca::Paragrafo, Peca::Valor},

@@ -44,6 +44,7 @@ enum class Mensagem {
   EmuladorComEspacos,
   EmuladorDoDos,
   ConfiguracaoMaisNova,
+  ConfiguracaoProtegida,
   ErroAoGravarConfiguracao,
   ErroAoGravarAjustes,
 };

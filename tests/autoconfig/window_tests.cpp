@@ -213,6 +213,36 @@ TEST_F(Configurator, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
   }
 }
 
+TEST_F(Configurator, AnEmulatorWhoseConfigurationCannotBeWrittenIsTakenWithAWarning) {
+  const struct {
+    const char* Name;
+    std::function<void()> Protect;
+    bool Warned;
+  } cases[] = {
+      {"a directory that takes no files", [] { TakeNoNewFiles("C:\\Tolvaris\\ZSNES"); }, true},
+      {"a directory that takes files", [] {}, false},
+      {"a read-only file", [] { PutFile(Configuration, "x", 0x21); }, true},
+      {"a file that the emulator holds", [] { PutFile(Configuration, "x"), LockFile(Configuration); }, true},
+      {"a file that can be written in such a directory",
+       [] { PutFile(Configuration, "x"), TakeNoNewFiles("C:\\Tolvaris\\ZSNES"); }, false},
+      {"a read-only file of the newer form", [] { PutFile(Configuration, Before, 0x21); }, true},
+      {"one of the newer form that is right already", [] { PutFile(Configuration, After, 0x21); }, false},
+  };
+  for (const auto& [name, protect, warned] : cases) {
+    SCOPED_TRACE(name);
+    Renew();
+    PutFile(Emulator, WindowsProgram);
+    protect();
+    const Texts files = AllFiles();
+    OpenAndSearch();
+    Save();
+    EXPECT_EQ(TakeMessages(), warned ? Texts{Told(Mensagem::ConfiguracaoProtegida, Configuration)} : Texts());
+    EXPECT_EQ(Stored(), Defaults);
+    EXPECT_EQ(AllFiles(), files);
+    EXPECT_EQ(WriteCount(Configuration), 0U);
+  }
+}
+
 // Whatever fails: the file is the old or the new one, whole, and what is not as it was asked for has been said.
 TEST_F(Configurator, EveryFaultLeavesWholeFilesAndIsSaid) {
   bool closed = false;
@@ -233,7 +263,9 @@ TEST_F(Configurator, EveryFaultLeavesWholeFilesAndIsSaid) {
     const std::string content = Content(Configuration).value_or("");
     EXPECT_TRUE(content == Before || content == After) << content;
     const Texts messages = TakeMessages();
-    EXPECT_EQ(closed, messages.empty() || messages.back() == Told(Mensagem::ConfiguracaoMaisNova));
+    const bool onlyWarned = messages.empty() || messages.back() == Told(Mensagem::ConfiguracaoMaisNova) ||
+                            messages.back() == Told(Mensagem::ConfiguracaoProtegida, Configuration);
+    EXPECT_EQ(closed, onlyWarned);
     EXPECT_TRUE(Stored() == Defaults || (Stored()[4] == "-" && !closed)) << "configured is only what is complete";
     EXPECT_EQ(open, 0U);
   };

@@ -58,6 +58,8 @@ const ShownMessage Expected[] = {
      "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris não altera ao jogar.\r\nCom ele a opção de usar disquete não tem efeito.\r\n\r\nGravar agora nessa configuração os diretórios de jogos e de salvamentos do Tolvaris ?"_ansi,
      "Confirmar"_ansi, Buttons::YesNoCancel, Icon::Question},
+    {"O Windows não deixa o Tolvaris gravar a configuração deste emulador: ele não usará os diretórios do Tolvaris nem o disquete.\r\nPonha o emulador em um diretório seu, como C:\\ZSNES, e escolha-o de novo.\r\n\r\nValor"_ansi,
+     "Informação"_ansi, Buttons::Ok, Icon::Exclamation},
     {"Erro ao gravar arquivo.\r\n\r\nValor"_ansi, "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"Não foi possível gravar a configuração."_ansi, "Erro"_ansi, Buttons::Ok, Icon::Critical},
 };
