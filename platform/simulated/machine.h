@@ -74,6 +74,7 @@ struct Machine {
 
   std::vector<StartedProcess> Started;
   std::vector<ProcessBehaviour> Behaviours;  // the latest counts
+  std::set<std::string> ForAdministrators;   // programs, by full path in upper case
   std::map<std::intptr_t, RunningProcess> Processes;
 
   std::map<std::string, std::string> Environment;  // by name in upper case

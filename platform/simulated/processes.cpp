@@ -13,6 +13,7 @@ using simulated::Locate;
 using simulated::Place;
 using simulated::ProcessBehaviour;
 using simulated::RunningProcess;
+using simulated::StartedProcess;
 using simulated::TheMachine;
 
 // The file that a program's name stands for, ".exe" added where the name has no extension.
@@ -60,6 +61,18 @@ void End(std::intptr_t process) {
   if (run) run();
 }
 
+// The handle of the started process; 0 when it refuses to start.
+std::intptr_t Start(StartedProcess start, const std::string& program) {
+  const ProcessBehaviour* behaviour = FindBehaviour(start.CommandLine, program);
+  if (behaviour && behaviour->Refuses) return 0;
+  TheMachine().Started.push_back(std::move(start));
+  const std::intptr_t process = ++TheMachine().LastHandle;
+  const int waits = behaviour ? behaviour->Waits : 0;
+  TheMachine().Processes[process] = {!behaviour, false, waits, behaviour ? behaviour->Run : nullptr};
+  if (behaviour && waits == 0) End(process);
+  return process;
+}
+
 }  // namespace
 
 Process CreateProcessA(const std::string& commandLine, std::uint32_t creationFlags, const std::string& directory) {
@@ -68,20 +81,29 @@ Process CreateProcessA(const std::string& commandLine, std::uint32_t creationFla
   const bool cut = commandLine.find('\0') != std::string::npos;
   const std::optional<std::string> program = cut ? std::nullopt : FindProgram(commandLine);
   if (fault || !program || !IsDirectory(directory)) return process;
-  const ProcessBehaviour* behaviour = FindBehaviour(commandLine, *program);
-  if (behaviour && behaviour->Refuses) return process;
-  TheMachine().Started.push_back({commandLine, directory, creationFlags});
-  process.process_ = ++TheMachine().LastHandle;
-  const int waits = behaviour ? behaviour->Waits : 0;
-  TheMachine().Processes[process.process_] = {!behaviour, false, waits, behaviour ? behaviour->Run : nullptr};
-  if (behaviour && waits == 0) End(process.process_);
+  process.needsElevation_ = TheMachine().ForAdministrators.contains(CharUpperBuffA(*program));
+  if (!process.needsElevation_) process.process_ = Start({commandLine, directory, creationFlags, ""}, *program);
   return process;
 }
 
-Process::Process(Process&& other) noexcept : process_(std::exchange(other.process_, 0)) {}
+Process ShellExecuteExA(const std::string& verb, const std::string& file, const std::string& parameters,
+                        const std::string& directory) {
+  Process process;
+  const bool fault = simulated::Fails();
+  const std::string line = file + " " + parameters;
+  const bool cut = (verb + line).find('\0') != std::string::npos;
+  const std::optional<std::string> program = cut ? std::nullopt : ProgramFile(file);
+  if (fault || !program || !IsDirectory(directory)) return process;
+  process.process_ = Start({line, directory, PriorityNormal, verb}, *program);
+  return process;
+}
+
+Process::Process(Process&& other) noexcept
+    : process_(std::exchange(other.process_, 0)), needsElevation_(other.needsElevation_) {}
 
 Process& Process::operator=(Process&& other) noexcept {
   std::swap(process_, other.process_);
+  needsElevation_ = other.needsElevation_;
   return *this;
 }
 
@@ -107,6 +129,10 @@ void OnProcess(const std::string& program, int waits, std::function<void()> run)
 }
 
 void RefuseToStart(const std::string& program) { TheMachine().Behaviours.push_back({program, true, 0, nullptr}); }
+
+void RequireAdministrator(const std::string& program) {
+  TheMachine().ForAdministrators.insert(CharUpperBuffA(program));
+}
 
 const std::vector<StartedProcess>& StartedProcesses() { return TheMachine().Started; }
 

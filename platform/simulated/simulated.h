@@ -85,6 +85,7 @@ bool CallFailed();  // whether the fault has been reached
 struct StartedProcess {
   std::string CommandLine, Directory;
   std::uint32_t CreationFlags;
+  std::string Verb;  // what the shell was asked for; empty: the program was started without it
 };
 const std::vector<StartedProcess>& StartedProcesses();
 
@@ -92,8 +93,9 @@ const std::vector<StartedProcess>& StartedProcesses();
 // for the `waits`-th time (or at its start when 0), and then it has ended. A program that is not a file on a disk does
 // not start; one that is, but was not given a behaviour, runs for ever.
 void OnProcess(const std::string& program, int waits, std::function<void()> run);
-void RefuseToStart(const std::string& program);
-std::size_t HeldProcesses();  // how many Process objects still stand for a started program
+void RefuseToStart(const std::string& program);         // also: the person does not let it run as an administrator
+void RequireAdministrator(const std::string& program);  // the shell alone can start it
+std::size_t HeldProcesses();                            // how many Process objects still stand for a started program
 
 // --- The environment: empty after Reset.
 

@@ -66,6 +66,32 @@ TEST_F(Services, AProgramStartsWithItsPriorityInItsDirectory) {
   EXPECT_EQ(PendingEventRuns(), 0);
 }
 
+TEST_F(Services, AProgramForAdministratorsIsStartedByTheShellAndWaitedForLikeAnyOther) {
+  const std::string program = "C:\\Emu 2\\emu.exe";
+  const std::tuple<const char*, std::string, std::string> cases[] = {
+      {"arguments", "\"" + program + "\" -x \"C:\\Meus Jogos\\Um.smc\"", program + " -x \"C:\\Meus Jogos\\Um.smc\""},
+      {"no argument", "\"" + program + "\"", program + " "},
+      {"no quotes", "C:\\emu.exe C:\\Um.smc", "C:\\emu.exe C:\\Um.smc"},
+  };
+  int ended = 0;
+  std::string directory = "C:\\Emu 2";
+  for (const std::string& each : {program, "C:\\emu.exe"s}) {
+    PutFile(each, "MZ");
+    RequireAdministrator(each);
+    OnProcess(each, 3, [&] { ++ended; });
+  }
+  for (const auto& [name, command, line] : cases) {
+    const int before = ended;
+    ASSERT_TRUE(ExecutarPrograma(command, 500, true, 2, directory)) << name;
+    EXPECT_EQ(ended, before + 1) << name;
+    const StartedProcess& process = StartedProcesses().back();
+    EXPECT_EQ(process.Verb + ": " + process.CommandLine, "runas: " + line) << name;
+    EXPECT_EQ(process.Directory, directory) << name;
+  }
+  RefuseToStart(program);
+  EXPECT_FALSE(ExecutarPrograma("\"" + program + "\"", 500, false, 2, directory)) << "the person does not agree";
+}
+
 TEST_F(Services, WaitingLetsEventsRunInTheRhythmAndOnceWhereNothingStarted) {
   PutFile("C:\\cfg.exe", "MZ");
   bool ended = false, clicked = false;
