@@ -34,14 +34,9 @@ bool FormCfg::Conferir(const Ajustes& Novos) const {
     MostrarMensagem(*motivo, novo);
     return false;
   }
-  if (Novos.EmuExe == atuais_.EmuExe) return true;
-  if (!ArquivoExiste(Selecionado())) {
-    MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
-    return false;
-  }
-  const std::string emulador = CaminhoConfigurado(Novos.EmuExe);
-  if (TemBranco(emulador)) MostrarMensagem(Mensagem::EmuladorComEspacos, emulador);
-  return true;
+  if (Novos.EmuExe == atuais_.EmuExe || ArquivoExiste(Selecionado())) return true;
+  MostrarMensagem(Mensagem::EmuladorNaoEncontrado);
+  return false;
 }
 
 // Without leave to write it the games start all the same: the person is told, and the settings are saved.

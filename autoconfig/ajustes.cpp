@@ -2,7 +2,6 @@
 
 #include <algorithm>
 
-#include "platform/files.h"
 #include "platform/registry.h"
 #include "platform/text.h"
 #include "support/caminhos.h"
@@ -11,15 +10,7 @@
 
 namespace {
 
-constexpr std::size_t MaiorAjuste = 254;     // what is longer cannot be read back
-constexpr std::size_t MaiorCaminho = 32768;  // of any path, its closing NUL included
-
-// The path behind the directory, with a leading backslash; the whole path when it lies elsewhere.
-std::string RelativoA(const std::string& Diretorio, const std::string& Caminho) {
-  const std::string inicio = Caminho.substr(0, Diretorio.size());
-  if (platform::CharUpperBuffA(inicio) != platform::CharUpperBuffA(Diretorio)) return Caminho;
-  return Caminho.substr(Diretorio.size() - 1);
-}
+constexpr std::size_t MaiorAjuste = 254;  // what is longer cannot be read back
 
 std::string LerTexto(const cls_REG& Registro, const char* Nome) {
   return TextoDe(Registro.GetValue(platform::RootCurrentUser, ChaveConfiguracao, Nome));
@@ -45,23 +36,16 @@ Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Out
     novos.*diretorio = ComBarra(novos.*diretorio);
   }
   if (Emulador.empty()) return novos;
-  if (Outro || novos.EmuExe.empty()) novos.EmuExe = AjusteDoEmulador(Emulador);
+  if (Outro || novos.EmuExe.empty()) novos.EmuExe = CaminhoRelativo(Emulador);
   if (Outro || novos.EmuCFG.empty()) novos.EmuCFG = CaminhoRelativo(ConfiguracaoDoEmulador(Emulador));
   return novos;
 }
 
-std::string CaminhoRelativo(const std::string& Caminho) { return RelativoA(DirPrograma, Caminho); }
-
-// Written relative to the program's directory it would still have the blanks of that directory.
-std::string AjusteDoEmulador(const std::string& Emulador) {
-  if (!TemBranco(Emulador)) return CaminhoRelativo(Emulador);
-  const auto curto = platform::GetShortPathNameA(Emulador, MaiorCaminho);
-  if (!curto || TemBranco(*curto)) return CaminhoRelativo(Emulador);
-  if (TemBranco(DirPrograma)) return *curto;
-  return RelativoA(platform::GetShortPathNameA(DirPrograma, MaiorCaminho).value_or(DirPrograma), *curto);
+std::string CaminhoRelativo(const std::string& Caminho) {
+  const std::string inicio = Caminho.substr(0, DirPrograma.size());
+  if (platform::CharUpperBuffA(inicio) != platform::CharUpperBuffA(DirPrograma)) return Caminho;
+  return Caminho.substr(DirPrograma.size() - 1);
 }
-
-bool TemBranco(const std::string& Caminho) { return Caminho.find(' ') != std::string::npos; }
 
 std::string ConfiguracaoDoEmulador(const std::string& Emulador) {
   const std::string diretorio = DiretorioDe(Emulador);

@@ -18,13 +18,6 @@ Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Out
 // A path for the settings: inside the program's directory it is written with the leading backslash.
 std::string CaminhoRelativo(const std::string& Caminho);
 
-// The emulator's path for the settings. The play command begins its command line with it, without quotes: where it has
-// blanks it is written in 8.3 form, if the disk gives one without.
-std::string AjusteDoEmulador(const std::string& Emulador);
-
-// Whether such a command line would end the emulator's path too early.
-bool TemBranco(const std::string& Caminho);
-
 // The configuration file that the emulator reads, in its directory.
 std::string ConfiguracaoDoEmulador(const std::string& Emulador);
 

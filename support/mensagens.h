@@ -41,7 +41,6 @@ enum class Mensagem {
   // The auto-configuration.
   CaminhoLongo,
   CaminhoEmRede,
-  EmuladorComEspacos,
   EmuladorDoDos,
   ConfiguracaoMaisNova,
   ConfiguracaoProtegida,

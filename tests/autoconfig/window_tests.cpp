@@ -124,37 +124,28 @@ TEST_F(Configurator, WhatIsSetStaysAndComesFirstUnlessThePersonChangesIt) {
   }
 }
 
-TEST_F(Configurator, TheEmulatorIsWrittenSoThatAnUnquotedCommandLineStartsIt) {
+TEST_F(Configurator, PathsAreWrittenRelativeToTheProgramOrWhole) {
   const struct {
     const char* Name;
-    bool ShortNames;
     std::string Program, Chosen;    // the program's directory, and the emulator
     std::string Emulator, Setting;  // how it and its configuration file are set
   } cases[] = {
-      {"below the program", true, "C:\\Tolvaris", "C:\\tolvaris\\zsnesw.exe", "\\zsnesw.exe", "\\zsnesw.cfg"},
-      {"below a program in a path with blanks", true, "C:\\Tolvaris da", "C:\\Tolvaris da\\Z\\zsnesw.exe",
-       "C:\\TOLVAR~1\\Z\\zsnesw.exe", "\\Z\\zsnesw.cfg"},
-      {"a blank below the program", true, "C:\\TolvarisX", "C:\\TolvarisX\\Meu Emu\\zsnes.exe", "\\MEUEMU~1\\zsnes.exe",
-       "\\Meu Emu\\zsnes.cfg"},
-      {"a blank beside the program", true, "C:\\Tolvaris", "C:\\Tolvaris 2\\zsnesw.exe", "C:\\TOLVAR~1\\zsnesw.exe",
+      {"below the program", "C:\\Tolvaris", "C:\\tolvaris\\zsnesw.exe", "\\zsnesw.exe", "\\zsnesw.cfg"},
+      {"blanks", "C:\\Tolvaris da", "C:\\Tolvaris da\\Meu Z\\zsnes.exe", "\\Meu Z\\zsnes.exe", "\\Meu Z\\zsnes.cfg"},
+      {"beside the program", "C:\\Tolvaris", "C:\\Tolvaris 2\\ZSNESW15.exe", "C:\\Tolvaris 2\\ZSNESW15.exe",
        "C:\\Tolvaris 2\\zsnesw.cfg"},
-      {"no blank, nothing is shortened", true, "C:\\Tolvaris", "C:\\Comprido9\\ZSNESW15.exe",
-       "C:\\Comprido9\\ZSNESW15.exe", "C:\\Comprido9\\zsnesw.cfg"},
-      {"the program at the root", true, "C:\\", "C:\\Emu\\outro.exe", "\\Emu\\outro.exe", "\\Emu\\zsnesw.cfg"},
-      {"no short names", false, "C:\\Meu Tolvaris", "C:\\Meu Tolvaris\\Z\\zsnes.exe", "\\Z\\zsnes.exe",
-       "\\Z\\zsnes.cfg"},
+      {"the program at the root", "C:\\", "C:\\Emu\\outro.exe", "\\Emu\\outro.exe", "\\Emu\\zsnesw.cfg"},
   };
-  for (const auto& [name, shortNames, program, chosen, emulator, setting] : cases) {
+  for (const auto& [name, program, chosen, emulator, setting] : cases) {
     SCOPED_TRACE(name);
     Reset();
-    if (!shortNames) KeepNoShortNames();
     SetProgramDirectory(program);
     PutFile(chosen, WindowsProgram);
     Open();
     ChooseOther(chosen);
     Save();
     EXPECT_EQ(Stored(), (Texts{"\\Roms\\", "\\Saves\\", "\\Imgs\\", emulator, setting}));
-    EXPECT_EQ(TakeMessages(), shortNames ? Texts() : Texts{Told(Mensagem::EmuladorComEspacos, chosen)});
+    EXPECT_EQ(TakeMessages(), Texts());
   }
   PutFile("C:\\E\\zsnes.cfg", "x");
   EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";

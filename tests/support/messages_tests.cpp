@@ -52,8 +52,6 @@ const ShownMessage Expected[] = {
      Icon::Critical},
     {"O caminho está em uma rede: dê uma letra de unidade a ele.\r\n\r\nValor"_ansi, "Erro"_ansi, Buttons::Ok,
      Icon::Critical},
-    {"O caminho do emulador tem espaços e o disco não tem um nome curto para ele.\r\nSe os jogos não abrirem, mude o emulador para um diretório sem espaços.\r\n\r\nValor"_ansi,
-     "Informação"_ansi, Buttons::Ok, Icon::Exclamation},
     {"Este emulador é um programa do DOS, que o Windows de 64 bits não inicia.\r\nEscolha o emulador feito para o Windows (zsnesw.exe).\r\n\r\nValor"_ansi,
      "Erro"_ansi, Buttons::Ok, Icon::Critical},
     {"Este emulador guarda a configuração em uma forma mais nova, que o Tolvaris não altera ao jogar.\r\nCom ele a opção de usar disquete não tem efeito.\r\n\r\nGravar agora nessa configuração os diretórios de jogos e de salvamentos do Tolvaris ?"_ansi,
