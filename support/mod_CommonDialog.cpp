@@ -41,6 +41,12 @@ bool Listado(const std::string& Caminho) {
   return entrada && platform::CharUpperBuffA(entrada->Name) == platform::CharUpperBuffA(nome);
 }
 
+// Several extensions are given with ";" between them. Some dialogs append the first, others all.
+std::string ComUmaExtensao(const std::string& Caminho, const std::string& Extensoes) {
+  const std::size_t demais = Extensoes.size() - std::min(Extensoes.find(';'), Extensoes.size());
+  return Caminho.ends_with("." + Extensoes) ? Caminho.substr(0, Caminho.size() - demais) : Caminho;
+}
+
 }  // namespace
 
 std::string AbrirArquivo(const platform::Window& Dono, const std::string& DiretorioInicial, const std::string& Titulo,
@@ -65,5 +71,5 @@ std::string SalvarArquivo(const platform::Window& Dono, const std::string& Diret
   pedido.DefaultExtension = ExtensaoPadrao;
   pedido.File = NomeInicial;
   pedido.Flags = Flags;
-  return Perguntar(platform::GetSaveFileNameA, pedido, Filtro);
+  return ComUmaExtensao(Perguntar(platform::GetSaveFileNameA, pedido, Filtro), ExtensaoPadrao);
 }

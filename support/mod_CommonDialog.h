@@ -13,7 +13,8 @@
 std::string AbrirArquivo(const platform::Window& Dono, const std::string& DiretorioInicial, const std::string& Titulo,
                          const std::string& NomeInicial, std::string& Filtro, std::uint8_t Flags);
 
-// Asks under which name a file is to be written. Whether it exists is not asked.
+// Asks under which name a file is to be written. Whether it exists is not asked. `ExtensaoPadrao` may hold several with
+// ";" between them: the first one counts. `NomeInicial` must be one that a file can have, or nothing is asked.
 std::string SalvarArquivo(const platform::Window& Dono, const std::string& DiretorioInicial, const std::string& Titulo,
                           const std::string& ExtensaoPadrao, const std::string& NomeInicial, std::string& Filtro,
                           std::uint8_t Flags);

@@ -151,4 +151,21 @@ TEST_F(Services, DialogsGiveTheChosenPathOrNothing) {
   EXPECT_EQ(save("Jogo"), "C:\\com brancos.tvk");
 }
 
+// Some dialogs append all that they were given.
+TEST_F(Services, ASavedNameEndsWithOneExtension) {
+  const platform::Window owner({"Dono", 1500, 1500});
+  std::string filter;
+  const std::tuple<const char*, const char*, std::string, std::string> cases[] = {
+      {"all of them", "tvk;zip", "C:\\Jogo.tvk;zip", "C:\\Jogo.tvk"},
+      {"the first", "tvk;zip", "C:\\Jogo.tvk", "C:\\Jogo.tvk"},
+      {"the only one", "zip", "C:\\Jogo.zip", "C:\\Jogo.zip"},
+      {"a name of the person's own", "tvk;zip", "C:\\um;dois.zip", "C:\\um;dois.zip"},
+      {"one that ends alike", "tvk;zip", "C:\\stvk;zip", "C:\\stvk;zip"},
+  };
+  for (const auto& [name, extension, chosen, saved] : cases) {
+    QueueFileDialog(chosen);
+    EXPECT_EQ(SalvarArquivo(owner, "", "", extension, "Jogo", filter, 4), saved) << name;
+  }
+}
+
 }  // namespace
