@@ -43,8 +43,8 @@ Oferta TiposOferecidos(const Jogo& Escolhido, bool TemImagem) {
 
 std::string PerguntarDestino(const Form1& Dono, const Jogo& Escolhido, bool TemImagem) {
   Oferta ofertas = TiposOferecidos(Escolhido, TemImagem);
-  return SalvarArquivo(Dono, "", Traduzir(Texto::SalvarComo), ofertas.ExtensaoPadrao, Escolhido.Nome, ofertas.Filtro,
-                       platform::HideReadOnly);
+  return SalvarArquivo(Dono, "", Traduzir(Texto::SalvarComo), ofertas.ExtensaoPadrao, SoDeNomeDeArquivo(Escolhido.Nome),
+                       ofertas.Filtro, platform::HideReadOnly);
 }
 
 // Nothing: the person gave up.

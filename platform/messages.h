@@ -32,7 +32,8 @@ struct OpenFileName {
 inline constexpr std::uint32_t HideReadOnly = 4;  // OFN_HIDEREADONLY
 
 // Shows the dialog. True: `request.File` holds the file buffer up to its first NUL. False: cancelled, or failed, for
-// instance because the path does not fit the buffer.
+// instance because the path does not fit the buffer, or because the buffer at first holds a name that no file can have.
+// What comes back may end with all of DefaultExtension, where that names several.
 bool GetOpenFileNameA(OpenFileName& request);
 bool GetSaveFileNameA(OpenFileName& request);
 

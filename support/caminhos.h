@@ -16,5 +16,8 @@ std::string UltimaParte(const std::string& Caminho);
 // A file name without its last "." and what follows; nothing when it has no ".".
 std::optional<std::string> NomeBase(const std::string& NomeDoArquivo);
 
+// The text without the characters that no file name can have.
+std::string SoDeNomeDeArquivo(const std::string& Texto);
+
 // The last three characters, in upper case: the type that decides how a file is treated.
 std::string TipoDoArquivo(const std::string& Caminho);

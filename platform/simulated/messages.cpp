@@ -1,5 +1,7 @@
 #include "platform/messages.h"
 
+#include <algorithm>
+#include <string_view>
 #include <utility>
 
 #include "platform/simulated/machine.h"
@@ -24,8 +26,19 @@ bool Offers(Buttons buttons, Answer answer) {
 
 Answer AnswerOfClosing(Buttons buttons) { return buttons == Buttons::Ok ? Answer::Ok : Answer::Cancel; }
 
+// A path may be offered as well.
+bool CanNameFile(const std::string& offered) {
+  return std::none_of(offered.begin(), offered.end(),
+                      [](char letter) {
+                        return static_cast<unsigned char>(letter) < ' ' ||
+                               std::string_view("<>\"|?*").find(letter) != std::string::npos;
+                      }) &&
+         offered.find(':', 2) == std::string::npos;
+}
+
 bool ShowFileDialog(OpenFileName& request) {
   TheMachine().Dialogs.push_back(request);
+  if (!CanNameFile(request.File)) return false;
   if (TheMachine().DialogPaths.empty()) return false;
   std::string path = std::move(TheMachine().DialogPaths.front());
   TheMachine().DialogPaths.pop_front();

@@ -176,6 +176,16 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
   }
 }
 
+// Windows does not open the dialog on another one.
+TEST_F(Export, OffersTheNameWithoutWhatNoFileNameCanHold) {
+  const std::string name = "Mundo 2: A <volta>, \"parte\" 3/4\\5 *?\t";
+  PutFile(Home + "tolvaris.dat", "|SUPERJOG=" + name + "|");
+  StartAndPick(name);
+  ChooseFile(form->Command5, "C:\\novo.zip");
+  EXPECT_EQ(TakeMessages(), Texts{Saved});
+  EXPECT_TRUE(ShownFileDialogs().back().File.starts_with("Mundo 2 A volta, parte 345    "));
+}
+
 TEST_F(Export, TakesAwayWhatAnEarlierOneToThatDirectoryHasLeftHalfWritten) {
   PutFile("C:\\x.zip.0f3a99c2.novo~", "half");
   PutFile("C:\\Outros\\x.zip.0f3a99c2.novo~", "half");
