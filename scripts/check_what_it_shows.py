@@ -1,4 +1,6 @@
-"""Checks what is written about the programs' texts against the programs.
+"""Checks what is written about the programs' texts against the programs: check_what_it_shows.py [--write]
+
+With --write the rows of docs/what-it-shows.md get the texts, titles, buttons and icons that the messages have now.
 
 docs/what-it-shows.md: each message has its row, whose text, title, buttons and icon are those of the message; every other
 text stands there; every test that it names exists. LEIAME.md: each message has a row that says what to do.
@@ -30,6 +32,14 @@ def row_of(message):
     return f'| `{message.name}` | {" ".join(pieces)} | "{message.title}", {message.buttons}, {message.icon} | '
 
 
+def rewritten(page, messages):
+    """The page with each message's row beginning as it should."""
+    for message in messages:
+        row = re.compile(rf'^\| `{message.name}` \|[^|]*\|[^|]*\| ', re.MULTILINE)
+        page = row.sub(lambda _, message=message: row_of(message), page)
+    return page
+
+
 def bare(text):
     """Without what the guide writes as it reads best: blanks, full stops and the value."""
     return re.sub(r"[ .…]", "", text)
@@ -41,9 +51,11 @@ def explained(guide):
 
 
 def main():
+    messages, texts = shown()
+    if sys.argv[1:] == ["--write"]:
+        PAGE.write_text(rewritten(PAGE.read_text(encoding="utf-8"), messages), encoding="utf-8")
     page, existing = PAGE.read_text(encoding="utf-8"), set(tests())
     rows = ROW.findall(page)
-    messages, texts = shown()
     faults = [f"{PAGE.name}: {name} does not exist" for name in sorted(set(NAMED.findall(page)) - existing)]
     faults += [f"{PAGE.name}: no test is named: {row.strip()}" for row in rows if not NAMED.search(row)]
     faults += [f"{PAGE.name}: no row begins with {row_of(message)}" for message in messages
