@@ -104,10 +104,9 @@ class Release : public testing::Test {
     window.Play.Click();
     EXPECT_EQ(Answer(program, IDOK).Title, words.Information);
 
-    // The command line has no quotes, so neither path may have blanks.
-    const std::string emulator = ShortPath(Emulator);
-    EXPECT_EQ(emulator.find(' '), std::string::npos);
-    const Call expected = {emulator + " " + ShortPath(directory + Game), emulator.substr(0, emulator.rfind('\\'))};
+    const std::string emulator = Emulator;
+    const Call expected = {'"' + emulator + "\" " + ShortPath(directory + Game),
+                           emulator.substr(0, emulator.rfind('\\'))};
     EXPECT_EQ(NextCall(Emulator), expected);
     window.CloseByUser();
     EXPECT_SOON(program.HasEnded());
