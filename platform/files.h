@@ -85,7 +85,7 @@ bool MoveFileExA(const std::string& from, const std::string& to, Existing existi
 bool CreateDirectoryA(const std::string& path);  // one directory; false when it exists or its parent does not
 
 struct DirectoryEntry {
-  std::string Name;       // as it is written on the disk; for what the code page lacks, a look-alike or "?"
+  std::string Name;       // as it is written on the disk, with "?" for each character that the code page lacks
   std::string ShortName;  // its 8.3 form, where the disk keeps another one; else empty
   bool IsExact = true;    // else the code page lacks the name: a path with it leads to nothing, or to another file
 

@@ -1,4 +1,4 @@
-// Texts of the platform: one byte a character, in the system's ANSI code page.
+// Texts of the platform: in the system's ANSI code page. In 1252 a character is one byte; in others it may be several.
 #pragma once
 
 #include <cstddef>
@@ -7,11 +7,22 @@
 
 namespace platform {
 
-// The text converted from UTF-8. A character that the code page lacks becomes "?".
+// The text converted from UTF-8. A letter that the code page lacks loses its accent; what else it lacks becomes "?".
 std::string FromUtf8(std::string_view utf8);
 
 // The text in upper case by the rules of the user's language. The length stays the same.
 std::string CharUpperBuffA(std::string text);
+
+// Whether a character begins at this position of the text. Those of code page 1252 have one byte each; in others one
+// may have several, the later ones of which may equal plain characters.
+bool CharacterBeginsAt(std::string_view text, std::size_t position);
+
+// The longest beginning of the text that has at most so many bytes and no half character at its end.
+inline std::string_view WholeCharacters(std::string_view text, std::size_t most) {
+  if (text.size() <= most) return text;
+  while (most > 0 && !CharacterBeginsAt(text, most)) --most;
+  return text.substr(0, most);
+}
 
 // Compares as a sorted list box does: by the user's language, without regard to letter case.
 // Negative, zero or positive, as `left` sorts before, with or after `right`.

@@ -23,6 +23,17 @@ struct ParsedPath {
 
 bool IsSeparator(char character) { return character == '\\' || character == '/'; }
 
+// The next separator, or the path's end. The later bytes of a character separate nothing.
+std::size_t EndOfPart(std::string_view path) {
+  std::size_t end = path.find_first_of("\\/");
+  while (!CharacterBeginsAt(path, end)) end = path.find_first_of("\\/", end + 1);
+  return std::min(end, path.size());
+}
+
+bool EndsWithSeparator(std::string_view path) {
+  return !path.empty() && IsSeparator(path.back()) && CharacterBeginsAt(path, path.size() - 1);
+}
+
 // Such names stand for a device in every directory and with any extension.
 bool IsDevice(const std::string& name) {
   std::string base = CharUpperBuffA(name.substr(0, name.find('.')));
@@ -34,15 +45,19 @@ bool IsDevice(const std::string& name) {
 
 bool IsName(const std::string& name) {
   constexpr std::string_view forbidden = "<>:\"|?*";
-  return name.size() <= LongestName && !IsDevice(name) && std::none_of(name.begin(), name.end(), [&](char character) {
-           return static_cast<unsigned char>(character) < 0x20 || forbidden.find(character) != std::string_view::npos;
-         });
+  if (name.size() > LongestName || IsDevice(name)) return false;
+  for (std::size_t i = 0; i < name.size(); ++i) {
+    const bool refused =
+        static_cast<unsigned char>(name[i]) < 0x20 || forbidden.find(name[i]) != std::string_view::npos;
+    if (refused && CharacterBeginsAt(name, i)) return false;
+  }
+  return true;
 }
 
 // Adds the parts of a path; "." and ".." are followed, and dots and blanks at a part's end do not count.
 void AddParts(std::vector<std::string>& parts, std::string_view path) {
   while (!path.empty()) {
-    const auto end = static_cast<std::size_t>(std::find_if(path.begin(), path.end(), IsSeparator) - path.begin());
+    const std::size_t end = EndOfPart(path);
     std::string part(path.substr(0, end));
     path.remove_prefix(std::min(path.size(), end + 1));
     if (part == "..") {
@@ -63,7 +78,7 @@ std::shared_ptr<Disk> DiskOf(char letter) {
 ParsedPath Parse(std::string_view path) {
   const std::string& home = TheMachine().ProgramDirectory;
   ParsedPath parsed;
-  parsed.EndsWithBackslash = !path.empty() && IsSeparator(path.back());
+  parsed.EndsWithBackslash = EndsWithSeparator(path);
   const bool drive = path.size() >= 2 && path[1] == ':';
   const std::string_view rest = drive ? path.substr(2) : path;
   parsed.Where = DiskOf(drive ? path[0] : home[0]);
@@ -84,7 +99,7 @@ std::shared_ptr<Entry> Find(const Entry& folder, const std::string& name) {
 }
 
 void Append(std::string& path, const std::string& name) {
-  if (path.back() != '\\') path += '\\';
+  if (!EndsWithSeparator(path)) path += '\\';
   path += name;
 }
 

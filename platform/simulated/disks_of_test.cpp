@@ -18,7 +18,8 @@ Place Demand(const std::string& path) {
 }
 
 void PutParents(const std::string& path) {
-  const std::size_t end = path.find_last_of('\\', path.size() - 2);
+  std::size_t end = path.find_last_of('\\', path.size() - 2);
+  while (!CharacterBeginsAt(path, end)) end = path.find_last_of('\\', end - 1);
   if (end != std::string::npos && end > 2) PutDirectory(path.substr(0, end));
 }
 

@@ -90,7 +90,9 @@ std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_
   std::string shortPath;
   std::size_t start = 0;
   while (start < path.size()) {
-    const std::size_t end = std::min(path.find('\\', start), path.size());
+    std::size_t end = path.find('\\', start);
+    while (!CharacterBeginsAt(path, end)) end = path.find('\\', end + 1);
+    end = std::min(end, path.size());
     const std::optional<Place> part = Locate(path.substr(0, end));
     const bool named = part && part->Found && part->Folder && end > start;
     const std::string written = path.substr(start, end - start);

@@ -59,6 +59,7 @@ struct Machine {
   std::map<char, std::shared_ptr<Disk>> Disks;
   std::string ProgramDirectory = "C:\\";
   bool ShortNames = true;
+  unsigned CodePage = 1252;
   std::map<std::intptr_t, OpenFile> OpenFiles;
   std::map<std::string, std::uint64_t> Writes;  // by full path in upper case
   std::uint64_t WritesEver = 0;

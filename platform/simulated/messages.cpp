@@ -1,10 +1,10 @@
 #include "platform/messages.h"
 
-#include <algorithm>
 #include <string_view>
 #include <utility>
 
 #include "platform/simulated/machine.h"
+#include "platform/text.h"
 
 namespace platform {
 namespace {
@@ -28,12 +28,13 @@ Answer AnswerOfClosing(Buttons buttons) { return buttons == Buttons::Ok ? Answer
 
 // A path may be offered as well.
 bool CanNameFile(const std::string& offered) {
-  return std::none_of(offered.begin(), offered.end(),
-                      [](char letter) {
-                        return static_cast<unsigned char>(letter) < ' ' ||
-                               std::string_view("<>\"|?*").find(letter) != std::string::npos;
-                      }) &&
-         offered.find(':', 2) == std::string::npos;
+  constexpr std::string_view never = "<>\"|?*";
+  for (std::size_t i = 0; i < offered.size(); ++i) {
+    const bool refused = static_cast<unsigned char>(offered[i]) < ' ' || never.find(offered[i]) != std::string::npos ||
+                         (offered[i] == ':' && i != 1);
+    if (refused && CharacterBeginsAt(offered, i)) return false;
+  }
+  return true;
 }
 
 bool ShowFileDialog(OpenFileName& request) {

@@ -97,6 +97,12 @@ void RefuseToStart(const std::string& program);         // also: the person does
 void RequireAdministrator(const std::string& program);  // the shell alone can start it
 std::size_t HeldProcesses();                            // how many Process objects still stand for a started program
 
+// --- The code page: 1252 after Reset.
+
+// 932 or 65001 from now on, of which the machine knows where a character begins, and the ASCII letters. Files and texts
+// are taken to be in it.
+void SetCodePage(unsigned page);
+
 // --- The environment: empty after Reset.
 
 void SetEnvironment(const std::string& name, const std::string& value);

@@ -1,14 +1,20 @@
-// The machine's code page is 1252, its language Portuguese.
+// The machine's code page is 1252 as a rule, its language Portuguese.
 #include "platform/text.h"
 
 #include <algorithm>
 #include <cstdint>
 #include <iterator>
 
+#include "platform/letters.h"
+#include "platform/simulated/machine.h"
 #include "platform/simulated/text_order.h"
 
 namespace platform {
 namespace {
+
+constexpr unsigned Western = 1252, Utf8 = 65001;  // else: 932
+
+unsigned Page() { return simulated::TheMachine().CodePage; }
 
 // What stands at 0x80 to 0x9F; everywhere else the page's numbers are those of Unicode.
 constexpr std::uint16_t Upper32[32] = {0x20AC, 0x81,   0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
@@ -17,9 +23,12 @@ constexpr std::uint16_t Upper32[32] = {0x20AC, 0x81,   0x201A, 0x0192, 0x201E, 0
                                        0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x9D,   0x017E, 0x0178};
 
 char ToCodePage(char32_t character) {
-  if (character < 0x80 || (character >= 0xA0 && character <= 0xFF)) return static_cast<char>(character);
+  if (character < 0x80) return static_cast<char>(character);
+  if (Page() != Western) return WithoutAccent(character);
+  if (character >= 0xA0 && character <= 0xFF) return static_cast<char>(character);
   const auto* found = std::find(std::begin(Upper32), std::end(Upper32), character);
-  return found == std::end(Upper32) ? '?' : static_cast<char>(0x80 + (found - std::begin(Upper32)));
+  return found == std::end(Upper32) ? WithoutAccent(character)
+                                    : static_cast<char>(0x80 + (found - std::begin(Upper32)));
 }
 
 // Length in bytes of the sequence that starts with this byte; 0: none does.
@@ -46,8 +55,15 @@ char32_t TakeCharacter(std::string_view& utf8) {
   return character;
 }
 
+// In code page 932.
+bool IsFirstOfTwo(char byte) {
+  const auto code = static_cast<unsigned char>(byte);
+  return (code >= 0x81 && code <= 0x9F) || (code >= 0xE0 && code <= 0xFC);
+}
+
 char ToUpper(char character) {
   const auto code = static_cast<unsigned char>(character);
+  if (code >= 0x80 && Page() != Western) return character;
   if ((code >= 'a' && code <= 'z') || (code >= 0xE0 && code <= 0xFE && code != 0xF7)) {
     return static_cast<char>(code - 0x20);
   }
@@ -58,14 +74,25 @@ char ToUpper(char character) {
 }  // namespace
 
 std::string FromUtf8(std::string_view utf8) {
+  if (Page() == Utf8) return std::string(utf8);
   std::string text;
   text.reserve(utf8.size());
   while (!utf8.empty()) text += ToCodePage(TakeCharacter(utf8));
   return text;
 }
 
+bool CharacterBeginsAt(std::string_view text, std::size_t position) {
+  if (position >= text.size() || Page() == Western) return true;
+  if (Page() == Utf8) return (static_cast<unsigned char>(text[position]) & 0xC0) != 0x80;
+  bool begins = true;
+  while (position-- > 0 && IsFirstOfTwo(text[position])) begins = !begins;
+  return begins;
+}
+
 std::string CharUpperBuffA(std::string text) {
-  std::transform(text.begin(), text.end(), text.begin(), ToUpper);
+  for (std::size_t i = 0; i < text.size(); ++i) {
+    if (CharacterBeginsAt(text, i)) text[i] = ToUpper(text[i]);
+  }
   return text;
 }
 
@@ -74,3 +101,9 @@ int CompareStringA(std::string_view left, std::string_view right) {
 }
 
 }  // namespace platform
+
+namespace platform::simulated {
+
+void SetCodePage(unsigned page) { TheMachine().CodePage = page; }
+
+}  // namespace platform::simulated

@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "platform/messages.h"
+#include "platform/text.h"
 #include "platform/windows/events.h"
 #include "platform/windows/system_library.h"
 #include "platform/windows/window.h"
@@ -33,7 +34,7 @@ const char* OrNull(const std::string& text) { return text.empty() ? nullptr : te
 // The file buffer as it is first shown: as much of the name as leaves room for the closing zero. Blanks behind a name
 // are no part of it; Wine's dialog would take them into the path, and ends the program when that becomes too long.
 std::string FileBuffer(const OpenFileName& request) {
-  std::string buffer = request.File.substr(0, request.FileSize - 1);
+  std::string buffer(WholeCharacters(request.File, request.FileSize - 1));
   buffer.resize(buffer.find_last_not_of(' ') + 1);
   buffer.resize(request.FileSize, '\0');
   return buffer;

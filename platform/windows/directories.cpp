@@ -41,7 +41,7 @@ bool FindNext(const FindHandle& find, WIN32_FIND_DATAW& data) {
 
 // The wide structure holds every name, where that of ANSI has 260 bytes and fails at a longer one.
 DirectoryEntry EntryOf(const WIN32_FIND_DATAW& data) {
-  DirectoryEntry entry{ToAnsi(data.cFileName), ToAnsi(data.cAlternateFileName)};
+  DirectoryEntry entry{NameToAnsi(data.cFileName), NameToAnsi(data.cAlternateFileName)};
   entry.IsExact = ToWide(entry.Name) == data.cFileName;
   if (ToWide(entry.ShortName) != data.cAlternateFileName) entry.ShortName.clear();
   return entry;
@@ -74,8 +74,9 @@ bool IsSubdirectory(const WIN32_FIND_DATAW& data) {
 }
 
 bool HasWildcard(const std::string& path) {
-  const std::size_t name = path.find_last_of("\\/:") + 1;          // 0 when there is none
-  return path.find_first_of("*?<>\"", name) != std::string::npos;  // the last three are wildcards inside Windows
+  const std::wstring wide = ToWide(path);
+  const std::size_t name = wide.find_last_of(L"\\/:") + 1;           // 0 when there is none
+  return wide.find_first_of(L"*?<>\"", name) != std::wstring::npos;  // the last three are wildcards inside Windows
 }
 
 }  // namespace
@@ -86,7 +87,7 @@ std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const st
   const std::string wanted = CharUpperBuffA(patterns);
   return Collect(directory, [&](const WIN32_FIND_DATAW& data) {
     return (data.dwFileAttributes & NotListed) == 0 &&
-           MatchesAnyPattern(CharUpperBuffA(ToAnsi(data.cFileName)), wanted);
+           MatchesAnyPattern(CharUpperBuffA(NameToAnsi(data.cFileName)), wanted);
   });
 }
 

@@ -52,7 +52,9 @@ std::string ProgramDirectory() {
     path.resize(2 * path.size());  // a result that fills the whole buffer was cut
   }
   path.resize(length);
-  const std::size_t backslash = path.rfind('\\');
+  std::size_t backslash = path.rfind('\\');
+  while (backslash != std::string::npos && !CharacterBeginsAt(path, backslash))
+    backslash = path.rfind('\\', backslash - 1);
   if (backslash == std::string::npos) return "";
   const bool root = backslash == 2 && path[1] == ':';
   return path.substr(0, root ? backslash + 1 : backslash);

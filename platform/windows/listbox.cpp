@@ -13,7 +13,7 @@ namespace {
 
 // A list is a window of wide texts: Wine's conversion of an entry's text, between such a list and one who asks for
 // ANSI, has room for 512 characters, and does not look.
-std::string TextOf(HWND list, int index) {
+std::string NativeText(HWND list, int index) {
   const LRESULT length = ::SendMessageW(list, LB_GETTEXTLEN, static_cast<WPARAM>(index), 0);
   if (index < 0 || length <= 0) return {};
   std::wstring text(static_cast<std::size_t>(length) + 1, L'\0');  // with the closing zero
@@ -25,8 +25,10 @@ std::string TextOf(HWND list, int index) {
 
 // What LB_FINDSTRINGEXACT finds, for the list of a closed window.
 int FindExactIn(const std::vector<std::string>& texts, const std::string& text) {
+  const std::wstring wanted = ToShown(text);
   const auto same = [&](const std::string& entry) {
-    return ::CompareStringA(LOCALE_USER_DEFAULT, NORM_IGNORECASE, entry.c_str(), -1, text.c_str(), -1) == CSTR_EQUAL;
+    return ::CompareStringW(LOCALE_USER_DEFAULT, NORM_IGNORECASE, ToShown(entry).c_str(), -1, wanted.c_str(), -1) ==
+           CSTR_EQUAL;
   };
   const auto found = std::find_if(texts.begin(), texts.end(), same);
   return found == texts.end() ? -1 : static_cast<int>(found - texts.begin());
@@ -69,12 +71,28 @@ struct ListBoxState : ControlState {
     for (int i = 0, count = Object.Count(); i < count; ++i) LastTexts.push_back(Object.Text(i));
   }
 
+  // The text as it was given, which an entry's data leads to where what is shown would not give it back.
+  std::string TextOf(int index) const {
+    const LRESULT kept = ::SendMessageW(Handle, LB_GETITEMDATA, static_cast<WPARAM>(index), 0);
+    if (kept > 0 && kept <= std::ssize(Foreign)) return Foreign[static_cast<std::size_t>(kept - 1)];
+    return NativeText(Handle, index);
+  }
+
+  void Put(UINT message, WPARAM place, const std::string& text) {
+    const std::wstring shown = ToShown(text);
+    const LRESULT index = ::SendMessageW(Handle, message, place, reinterpret_cast<LPARAM>(shown.c_str()));
+    if (!HasLongCharacters() || ToAnsi(shown) == text) return;
+    Foreign.push_back(text);
+    ::SendMessageW(Handle, LB_SETITEMDATA, static_cast<WPARAM>(index), std::ssize(Foreign));
+  }
+
   const ListBox& Object;
+  std::vector<std::string> Foreign;    // in the order in which they came
   std::vector<std::string> LastTexts;  // once the window is closed
   int LastSelected = -1;
 };
 
-const ListBoxState& StateOf(const ListBox& list) { return static_cast<const ListBoxState&>(list.State()); }
+ListBoxState& StateOf(const ListBox& list) { return static_cast<ListBoxState&>(list.State()); }
 
 }  // namespace
 
@@ -84,9 +102,7 @@ ListBox::ListBox(const Container& container, const Bounds& bounds, Order order) 
                 {"LISTBOX", WS_TABSTOP | WS_VSCROLL | LBS_NOTIFY | LBS_NOINTEGRALHEIGHT | sorted, WS_EX_CLIENTEDGE});
 }
 
-void ListBox::Add(const std::string& text) {
-  ::SendMessageW(state_->Handle, LB_ADDSTRING, 0, reinterpret_cast<LPARAM>(ToWide(text).c_str()));
-}
+void ListBox::Add(const std::string& text) { StateOf(*this).Put(LB_ADDSTRING, 0, text); }
 
 // The room for all texts is made at once. Texts that are in the list's own order already need no place looked up for
 // them, which would be most of the work. A list with a scroll bar that is drawn anew for each entry takes a hundred
@@ -98,14 +114,16 @@ void ListBox::Fill(const std::vector<std::string>& texts) {
   Clear();
   ::SendMessageA(state_->Handle, LB_INITSTORAGE, texts.size(), static_cast<LPARAM>(BytesOf(texts)));
   for (const std::string* text : AsListed(texts, sorted)) {
-    ::SendMessageW(state_->Handle, LB_INSERTSTRING, static_cast<WPARAM>(-1),
-                   reinterpret_cast<LPARAM>(ToWide(*text).c_str()));
+    StateOf(*this).Put(LB_INSERTSTRING, static_cast<WPARAM>(-1), *text);
   }
   ::SendMessageA(state_->Handle, WM_SETREDRAW, TRUE, 0);
   ::InvalidateRect(state_->Handle, nullptr, TRUE);
 }
 
-void ListBox::Clear() { ::SendMessageA(state_->Handle, LB_RESETCONTENT, 0, 0); }
+void ListBox::Clear() {
+  ::SendMessageA(state_->Handle, LB_RESETCONTENT, 0, 0);
+  StateOf(*this).Foreign.clear();
+}
 
 int ListBox::Count() const {
   if (state_->Handle == nullptr) return static_cast<int>(StateOf(*this).LastTexts.size());
@@ -113,7 +131,7 @@ int ListBox::Count() const {
 }
 
 std::string ListBox::Text(int index) const {
-  if (state_->Handle != nullptr) return TextOf(state_->Handle, index);
+  if (state_->Handle != nullptr) return StateOf(*this).TextOf(index);
   return index >= 0 && index < Count() ? StateOf(*this).LastTexts[static_cast<std::size_t>(index)] : std::string();
 }
 
@@ -127,7 +145,7 @@ void ListBox::Select(int index) { ::SendMessageA(state_->Handle, LB_SETCURSEL, s
 int ListBox::FindExact(const std::string& text) const {
   if (state_->Handle == nullptr) return FindExactIn(StateOf(*this).LastTexts, text);
   return static_cast<int>(::SendMessageW(state_->Handle, LB_FINDSTRINGEXACT, static_cast<WPARAM>(-1),
-                                         reinterpret_cast<LPARAM>(ToWide(text).c_str())));
+                                         reinterpret_cast<LPARAM>(ToShown(text).c_str())));
 }
 
 }  // namespace platform

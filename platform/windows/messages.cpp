@@ -1,6 +1,7 @@
 #include "platform/messages.h"
 
 #include "platform/windows/events.h"
+#include "platform/windows/wide.h"
 #include "platform/windows/window.h"
 
 namespace platform {
@@ -36,7 +37,8 @@ Answer MessageBoxA(const std::string& text, const std::string& title, Buttons bu
   const HWND owner = OwnerForModal();
   const OwnEventLoop loop;
   const UINT modality = owner == nullptr ? MB_TASKMODAL : MB_APPLMODAL;
-  switch (::MessageBoxA(owner, text.c_str(), title.c_str(), StyleOf(buttons) | StyleOf(icon) | modality)) {
+  switch (::MessageBoxW(owner, ToShown(text).c_str(), ToShown(title).c_str(),
+                        StyleOf(buttons) | StyleOf(icon) | modality)) {
     case IDYES:
       return Answer::Yes;
     case IDNO:

@@ -7,19 +7,24 @@
 #include <numeric>
 #include <string_view>
 
+#include "platform/windows/wide.h"
+
 namespace platform {
 namespace {
 
-int Map(const std::string& text, char* buffer, int room) {
+// A sort key is bytes, also where the text is wide.
+int Map(const std::wstring& text, char* buffer, int room) {
   constexpr DWORD flags = LCMAP_SORTKEY | NORM_IGNORECASE;
-  return ::LCMapStringA(LOCALE_USER_DEFAULT, flags, text.data(), static_cast<int>(text.size()), buffer, room);
+  return ::LCMapStringW(LOCALE_USER_DEFAULT, flags, text.data(), static_cast<int>(text.size()),
+                        reinterpret_cast<wchar_t*>(buffer), room);
 }
 
 // Bytes that compare as the texts do in CompareStringA, all in one piece of memory. They take one call a text, where
 // comparing the texts themselves would take one a comparison.
 class SortKeys {
  public:
-  void Add(const std::string& text) {
+  void Add(const std::string& added) {
+    const std::wstring text = ToShown(added);
     std::array<char, 512> enough;  // for all names but the longest
     const std::size_t start = bytes_.size();
     if (const int length = Map(text, enough.data(), static_cast<int>(enough.size())); length > 0) {

@@ -2,43 +2,54 @@
 
 #include <windows.h>
 
+#include "platform/windows/wide.h"
+
 namespace platform {
 namespace {
 
-std::wstring WideFromUtf8(std::string_view utf8) {
-  const int length = static_cast<int>(utf8.size());
-  std::wstring wide(utf8.size(), L'\0');  // no character is longer in UTF-16 than in UTF-8
-  const int converted = ::MultiByteToWideChar(CP_UTF8, 0, utf8.data(), length, wide.data(), length);
-  wide.resize(static_cast<std::size_t>(converted));
-  return wide;
+// In the code pages whose characters can have several bytes Windows promises neither that the length stays nor what
+// becomes of bytes that are no character. A letter whose other case is as long is changed, and nothing else.
+void RaiseFirst(char* text, std::size_t length) {
+  if (static_cast<unsigned char>(*text) < 0x80) {
+    if (*text >= 'a' && *text <= 'z') *text = static_cast<char>(*text - 'a' + 'A');
+    return;
+  }
+  std::wstring letter = Decode(CP_ACP, MB_ERR_INVALID_CHARS, {text, length});
+  ::CharUpperBuffW(letter.data(), static_cast<DWORD>(letter.size()));
+  const std::string raised = NameToAnsi(letter);
+  if (raised.size() == length && raised != "?") raised.copy(text, length);
 }
-
-// The pointer of an empty view may be null, which Windows takes for an error.
-const char* Pointer(std::string_view text) { return text.empty() ? "" : text.data(); }
 
 }  // namespace
 
 std::string FromUtf8(std::string_view utf8) {
-  if (utf8.empty() || ::GetACP() == CP_UTF8) return std::string(utf8);
-  const std::wstring wide = WideFromUtf8(utf8);
-  const int length = static_cast<int>(wide.size());
-  // Without "best fits": a letter that only looks like the one meant would name another file.
-  const auto convert = [&](char* buffer, int room) {
-    return ::WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, wide.data(), length, buffer, room, "?", nullptr);
-  };
-  std::string text(static_cast<std::size_t>(convert(nullptr, 0)), '\0');
-  convert(text.data(), static_cast<int>(text.size()));
-  return text;
+  return ::GetACP() == CP_UTF8 ? std::string(utf8) : ToAnsi(Decode(CP_UTF8, 0, utf8));
+}
+
+bool CharacterBeginsAt(std::string_view text, std::size_t position) {
+  if (position >= text.size() || !HasLongCharacters()) return true;
+  if (::GetACP() == CP_UTF8) return (static_cast<unsigned char>(text[position]) & 0xC0) != 0x80;
+  bool begins = true;  // behind a byte that begins none; from there on they come in pairs
+  while (position-- > 0 && ::IsDBCSLeadByte(static_cast<BYTE>(text[position]))) begins = !begins;
+  return begins;
 }
 
 std::string CharUpperBuffA(std::string text) {
-  ::CharUpperBuffA(text.data(), static_cast<DWORD>(text.size()));
+  if (!HasLongCharacters()) {
+    ::CharUpperBuffA(text.data(), static_cast<DWORD>(text.size()));
+    return text;
+  }
+  for (std::size_t i = 0, length = 0; i < text.size(); i += length) {
+    length = LengthOfFirst(std::string_view(text).substr(i));
+    RaiseFirst(text.data() + i, length);
+  }
   return text;
 }
 
 int CompareStringA(std::string_view left, std::string_view right) {
-  const int result = ::CompareStringA(LOCALE_USER_DEFAULT, NORM_IGNORECASE, Pointer(left),
-                                      static_cast<int>(left.size()), Pointer(right), static_cast<int>(right.size()));
+  const std::wstring first = ToShown(left), second = ToShown(right);
+  const int result = ::CompareStringW(LOCALE_USER_DEFAULT, NORM_IGNORECASE, first.data(),
+                                      static_cast<int>(first.size()), second.data(), static_cast<int>(second.size()));
   return result == 0 ? left.compare(right) : result - CSTR_EQUAL;
 }
 
