@@ -13,6 +13,7 @@
 #include "platform/wildcards.h"
 #include "support/brancos.h"
 #include "support/caminhos.h"
+#include "support/caracteres.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Globais.h"
 

@@ -2,6 +2,8 @@
 
 #include <string>
 
+#include "support/caracteres.h"
+
 std::optional<std::string_view> BuscarNome(std::string_view Dados, std::string_view Chave) {
   const std::size_t barra = Dados.find("|" + std::string(Chave) + "=");
   if (barra == std::string_view::npos) return std::nullopt;
@@ -16,11 +18,11 @@ std::optional<std::string_view> BuscarChave(std::string_view Dados, std::string_
 
 std::string_view NomeEm(std::string_view Dados, std::size_t Inicio) {
   const std::string_view resto = Dados.substr(Inicio);
-  return resto.substr(0, resto.find('|'));
+  return resto.substr(0, AcharCaractere(resto, '|'));
 }
 
 std::string_view ChaveAntesDe(std::string_view Dados, std::size_t Igual) {
-  const std::size_t barra = Dados.substr(0, Igual).rfind('|');
+  const std::size_t barra = AcharUltimo(Dados.substr(0, Igual), '|');
   const std::size_t inicio = barra == std::string_view::npos ? 0 : barra + 1;
   return Dados.substr(inicio, Igual - inicio);
 }

@@ -3,6 +3,7 @@
 #include "mainwindow/configuracao_emulador.h"
 #include "platform/events.h"
 #include "platform/registry.h"
+#include "support/caracteres.h"
 #include "support/gravacao.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
@@ -102,7 +103,7 @@ void Form1::GravarPartida(const std::string& UltimoJogo) {
 
 // The short form of the ROM's path has no blanks where the disk keeps short names; the long one may need quotes.
 void Form1::IniciarEmulador(const Jogo& Escolhido) {
-  const auto barra = ArquivoEmulador.rfind('\\');
+  const auto barra = AcharUltimo(ArquivoEmulador, '\\');
   if (barra == std::string::npos) return;
   std::string diretorio = ArquivoEmulador.substr(0, barra);
   ExecutarPrograma(Argumento(ArquivoEmulador) + " " + Argumento(Escolhido.ArquivoCurto), 100, false, 2, diretorio);

@@ -2,6 +2,7 @@
 #include <array>
 
 #include "package/pacote.h"
+#include "platform/text.h"
 
 namespace {
 
@@ -12,6 +13,8 @@ constexpr std::array<std::string_view, 8> Dispositivos = {"CON",    "PRN",     "
 
 // A superscript 1, 2 or 3 of the code page (B9, B2, B3) numbers a port as well.
 constexpr std::string_view NumerosDePorta = "0123456789\xB9\xB2\xB3";
+
+constexpr std::string_view SaidaDoDiretorio = "\\/:";
 
 char Maiuscula(char Letra) { return Letra >= 'a' && Letra <= 'z' ? static_cast<char>(Letra - 'a' + 'A') : Letra; }
 
@@ -28,8 +31,9 @@ bool NomeiaDispositivo(std::string_view Nome) {
 }  // namespace
 
 bool NomeSeguro(std::string_view Nome) {
-  const auto levaFora = [](char Letra) {
-    return static_cast<unsigned char>(Letra) < ' ' || Letra == '\\' || Letra == '/' || Letra == ':';
-  };
-  return std::ranges::none_of(Nome, levaFora) && !NomeiaDispositivo(Nome);
+  for (std::size_t i = 0; i < Nome.size(); ++i) {
+    if (static_cast<unsigned char>(Nome[i]) < ' ') return false;
+    if (SaidaDoDiretorio.find(Nome[i]) != std::string_view::npos && platform::CharacterBeginsAt(Nome, i)) return false;
+  }
+  return !NomeiaDispositivo(Nome);
 }

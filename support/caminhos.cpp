@@ -3,14 +3,15 @@
 #include <string_view>
 
 #include "platform/text.h"
+#include "support/caracteres.h"
 
-std::string DiretorioDe(const std::string& Caminho) { return Caminho.substr(0, Caminho.rfind('\\') + 1); }
+std::string DiretorioDe(const std::string& Caminho) { return Caminho.substr(0, AcharUltimo(Caminho, '\\') + 1); }
 
 std::string ComBarra(const std::string& Diretorio) {
-  return Diretorio.ends_with('\\') || Diretorio.ends_with('/') ? Diretorio : Diretorio + '\\';
+  return TerminaCom(Diretorio, '\\') || Diretorio.ends_with('/') ? Diretorio : Diretorio + '\\';
 }
 
-std::string UltimaParte(const std::string& Caminho) { return Caminho.substr(Caminho.rfind('\\') + 1); }
+std::string UltimaParte(const std::string& Caminho) { return Caminho.substr(AcharUltimo(Caminho, '\\') + 1); }
 
 std::optional<std::string> NomeBase(const std::string& NomeDoArquivo) {
   const auto ponto = NomeDoArquivo.rfind('.');
@@ -21,8 +22,10 @@ std::optional<std::string> NomeBase(const std::string& NomeDoArquivo) {
 std::string SoDeNomeDeArquivo(const std::string& Texto) {
   constexpr std::string_view proibidos = "<>:\"/\\|?*";
   std::string nome;
-  for (const char letra : Texto) {
-    if (static_cast<unsigned char>(letra) >= ' ' && proibidos.find(letra) == std::string_view::npos) nome += letra;
+  for (std::size_t i = 0; i < Texto.size(); ++i) {
+    const bool proibido =
+        static_cast<unsigned char>(Texto[i]) < ' ' || proibidos.find(Texto[i]) != std::string_view::npos;
+    if (!proibido || !platform::CharacterBeginsAt(Texto, i)) nome += Texto[i];
   }
   return nome;
 }

@@ -5,6 +5,7 @@
 #include <new>
 
 #include "platform/files.h"
+#include "support/caracteres.h"
 #include "support/gravacao.h"
 
 namespace {
@@ -133,7 +134,8 @@ bool DiretorioExiste(const std::string& Caminho) {
 void CriarDiretorio(const std::string& Caminho) { platform::CreateDirectoryA(Caminho); }
 
 void CriarCaminho(const std::string& Caminho) {
-  for (auto barra = Caminho.find('\\'); barra != std::string::npos; barra = Caminho.find('\\', barra + 1)) {
+  for (auto barra = AcharCaractere(Caminho, '\\'); barra != std::string::npos;
+       barra = AcharCaractere(Caminho, '\\', barra + 1)) {
     const std::string trecho = Caminho.substr(0, barra + 1);
     if (!DiretorioExiste(trecho)) CriarDiretorio(trecho);
   }

@@ -2,11 +2,12 @@
 
 #include "platform/files.h"
 #include "platform/registry.h"
+#include "support/caracteres.h"
 #include "support/mod_Arquivos.h"
 
 void DefinirDirPrograma() {
   DirPrograma = platform::ProgramDirectory();
-  if (!DirPrograma.ends_with('\\')) DirPrograma += '\\';
+  if (!TerminaCom(DirPrograma, '\\')) DirPrograma += '\\';
 }
 
 void EscolherIdioma() {

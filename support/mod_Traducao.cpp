@@ -3,6 +3,7 @@
 #include <array>
 
 #include "platform/profile.h"
+#include "support/caracteres.h"
 #include "support/mod_Globais.h"
 
 namespace {
@@ -16,7 +17,9 @@ std::string Traduzir(const std::string& Texto) {
   if (ArquivoIdioma.empty()) return Texto;
   std::string traducao = LerIni(Secao20, Texto);
   if (traducao.empty()) return Texto;
-  std::erase(traducao, '|');
+  for (auto barra = AcharUltimo(traducao, '|'); barra != std::string::npos; barra = AcharUltimo(traducao, '|')) {
+    traducao.erase(barra, 1);
+  }
   return traducao;
 }
 
@@ -24,7 +27,7 @@ std::string Traduzir(const std::string& Texto) {
 std::string LerIni(const std::string& Secao, const std::string& Chave) {
   std::string valor = platform::GetPrivateProfileStringA(Secao, Chave, "", TamanhoBuffer, ArquivoIdioma);
   if (valor.starts_with('|')) valor.erase(0, 1);
-  if (valor.ends_with('|')) valor.pop_back();
+  if (TerminaCom(valor, '|')) valor.pop_back();
   return valor;
 }
 
