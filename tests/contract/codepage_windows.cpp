@@ -2,6 +2,7 @@
 // byte or two, and 65001.
 #include <windows.h>
 
+#include <cstdlib>
 #include <map>
 
 #include "platform/profile.h"
@@ -17,7 +18,11 @@ constexpr UINT Western = 1252, Japanese = 932, Utf8 = CP_UTF8;
 
 class CodePage : public Machine {
  protected:
-  CodePage() { EXPECT_TRUE(page_ == Western || page_ == Japanese || page_ == Utf8) << page_; }
+  // What runs these tests once more says under which one.
+  CodePage() {
+    const char* const wanted = std::getenv("TOLVARIS_CODE_PAGE");
+    EXPECT_EQ(page_, wanted != nullptr ? static_cast<UINT>(std::atoi(wanted)) : Western);
+  }
 
   const UINT page_ = ::GetACP();
 };
