@@ -15,6 +15,9 @@ if(TOLVARIS_FUZZ)
 endif()
 if(WIN32)
   target_compile_options(tolvaris_options INTERFACE $<$<COMPILE_LANGUAGE:CXX>:-ffunction-sections -fdata-sections>)
+  # For Windows 7 and later: it tells a program for an older one other sizes of its frames than they have.
+  target_link_options(tolvaris_options INTERFACE
+    -Wl,--major-subsystem-version,6,--minor-subsystem-version,1,--major-os-version,6,--minor-os-version,1)
   # The same sources give the same programs: no time of the build goes into them.
   target_link_options(tolvaris_options INTERFACE -static -Wl,--gc-sections,--no-insert-timestamp
     $<$<NOT:$<CONFIG:Debug>>:-s>)

@@ -36,7 +36,8 @@ struct WindowStyle {
   int Background = 0;  // picture resource drawn from the client area's top left corner at 15 twips a pixel; 0: none
 };
 
-// A top-level window that cannot be resized. It is hidden until it is shown, and centred on the primary monitor.
+// A top-level window that cannot be resized. It is hidden until it is shown, and centred on the monitor of the
+// program's first window; that one itself on the primary monitor.
 // One that the platform cannot make is closed from the beginning.
 class Window {
  public:

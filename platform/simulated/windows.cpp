@@ -12,6 +12,18 @@ using simulated::WindowFacts;
 
 constexpr int FrameWidth = 90, FrameHeight = 375;  // twips that the frame adds to the client area
 
+// The primary one while there is no main window, or where it stands on none.
+Bounds MonitorOfMainWindow() {
+  const auto& main = TheMachine().MainWindow;
+  if (!main || main->Closed) return TheMachine().PrimaryMonitor;
+  for (const Bounds& each : TheMachine().OtherMonitors) {
+    const int right = main->Left + main->Width / 2 - each.Left;
+    const int below = main->Top + main->Height / 2 - each.Top;
+    if (right >= 0 && right < each.Width && below >= 0 && below < each.Height) return each;
+  }
+  return TheMachine().PrimaryMonitor;
+}
+
 }  // namespace
 
 Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>()) {
@@ -21,8 +33,9 @@ Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(
   facts->Caption = style.Caption;
   facts->Width = style.ClientWidth + FrameWidth;
   facts->Height = style.ClientHeight + FrameHeight;
-  facts->Left = (ScreenWidth() - facts->Width) / 2;
-  facts->Top = (ScreenHeight() - facts->Height) / 2;
+  const Bounds monitor = MonitorOfMainWindow();
+  facts->Left = monitor.Left + (monitor.Width - facts->Width) / 2;
+  facts->Top = monitor.Top + (monitor.Height - facts->Height) / 2;
   facts->Handle = static_cast<std::int32_t>(++TheMachine().LastHandle);
   if (!TheMachine().MainWindow) TheMachine().MainWindow = facts;
   TheMachine().Windows.push_back(facts);

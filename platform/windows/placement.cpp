@@ -20,8 +20,15 @@ SIZE WindowSize(const WindowStyle& style, int dpi) {
   return {area.right - area.left, area.bottom - area.top};
 }
 
-POINT CentredCorner(const SIZE& size) {
-  return {(::GetSystemMetrics(SM_CXSCREEN) - size.cx) / 2, (::GetSystemMetrics(SM_CYSCREEN) - size.cy) / 2};
+POINT CentredCorner(const WindowState& window, const SIZE& size) {
+  const HWND first = AllWindows().front() == &window ? nullptr : AllWindows().front()->Handle;
+  MONITORINFO monitor{};
+  monitor.cbSize = sizeof monitor;
+  if (first == nullptr || !::GetMonitorInfoA(::MonitorFromWindow(first, MONITOR_DEFAULTTOPRIMARY), &monitor)) {
+    monitor.rcMonitor = {0, 0, ::GetSystemMetrics(SM_CXSCREEN), ::GetSystemMetrics(SM_CYSCREEN)};
+  }
+  const RECT& place = monitor.rcMonitor;
+  return {(place.left + place.right - size.cx) / 2, (place.top + place.bottom - size.cy) / 2};
 }
 
 void PlaceWindow(WindowState& window, int left, int top) {

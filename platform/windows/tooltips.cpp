@@ -37,7 +37,15 @@ TTTOOLINFOA PlaceTool(const ControlState& control) {
   return tool;
 }
 
+// Their class is registered by none but this call where the controls have no visual styles.
+void RegisterToolTips() {
+  const INITCOMMONCONTROLSEX wanted = {sizeof wanted, ICC_BAR_CLASSES};  // tool tips are among these
+  static const BOOL registered = ::InitCommonControlsEx(&wanted);
+  static_cast<void>(registered);
+}
+
 HWND CreateToolTips(HWND window) {
+  RegisterToolTips();
   return ::CreateWindowExA(WS_EX_TOPMOST, TOOLTIPS_CLASSA, nullptr, WS_POPUP | TTS_NOPREFIX | TTS_ALWAYSTIP,
                            CW_USEDEFAULT, CW_USEDEFAULT, CW_USEDEFAULT, CW_USEDEFAULT, window, nullptr,
                            ::GetModuleHandleA(nullptr), nullptr);

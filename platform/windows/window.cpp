@@ -13,7 +13,7 @@ namespace {
 void Create(WindowState& window) {
   window.Dpi = DpiOfScreen();
   const SIZE size = WindowSize(window.Style, window.Dpi);
-  const POINT corner = CentredCorner(size);
+  const POINT corner = CentredCorner(window, size);
   ::CreateWindowExA(0, WindowClass, window.Style.Caption.c_str(), NativeStyle(window.Style), corner.x, corner.y,
                     size.cx, size.cy, nullptr, nullptr, ::GetModuleHandleA(nullptr), &window);
 }
@@ -21,7 +21,7 @@ void Create(WindowState& window) {
 // The monitor may have another resolution than the screen as a whole.
 void FitToMonitor(WindowState& window) {
   window.Dpi = DpiOfWindow(window.Handle);
-  const POINT corner = CentredCorner(WindowSize(window.Style, window.Dpi));
+  const POINT corner = CentredCorner(window, WindowSize(window.Style, window.Dpi));
   PlaceWindow(window, corner.x, corner.y);
 }
 

@@ -5,7 +5,10 @@
 #include "platform/screen.h"
 #include "platform/windows/control.h"
 #include "tests/contract/hand.h"
+#include "tests/contract/replaced_import.h"
 #include "tests/contract/small_pictures.h"
+
+extern void* importOfGetMonitorInfoA asm("__imp_GetMonitorInfoA");
 
 namespace {
 
@@ -33,6 +36,24 @@ TEST_F(NativeWindow, StandsWhereItWouldWithoutATaskbar) {
   EXPECT_EQ(std::pair(other.Left(), other.Top()), std::pair(window.Left(), window.Top()));
   EXPECT_EQ(ScreenWidth() / 15 * GetDpiForSystem() / 96, static_cast<unsigned>(::GetSystemMetrics(SM_CXSCREEN)));
   ::SystemParametersInfoA(SPI_SETWORKAREA, 0, &before, 0);
+}
+
+// As if the main window stood on a monitor at the right.
+BOOL WINAPI AtTheRight(HMONITOR, LPMONITORINFO monitor) {
+  monitor->rcMonitor = {2000, 100, 3000, 900};
+  monitor->rcWork = {2000, 100, 3000, 850};
+  return TRUE;
+}
+
+TEST_F(NativeWindow, OpensOnTheMonitorOfTheMainWindow) {
+  RECT place = {};
+  {
+    const ReplacedImport monitors(importOfGetMonitorInfoA, AtTheRight);
+    const Window other(window.State().Style);
+    ::GetWindowRect(other.State().Handle, &place);
+  }
+  EXPECT_NEAR((place.left + place.right) / 2, 2500, 1);
+  EXPECT_NEAR((place.top + place.bottom) / 2, 500, 1);
 }
 
 TEST_F(NativeWindow, IsLaidOutAgainAtAnotherResolutionAndStaysWhereItWasPut) {
@@ -89,6 +110,7 @@ TEST_F(NativeWindow, HasToolTipsOnceTheMouseComesToAControlWithOne) {
   };
   EXPECT_EQ(tips(list), nullptr);
   EXPECT_NE(tips(image), nullptr);
+  ::SetCursorPos(0, 0);  // the next window comes to the same place
 }
 
 TEST_F(NativeWindow, PictureIsDecodedOnceNoInputWaits) {

@@ -23,6 +23,16 @@ TEST_F(Executable, IsSmallAndHasNoConsole) {
   EXPECT_NE(HIWORD(type), 0);
 }
 
+// A program for an older one is told other sizes of its frames than they have.
+TEST_F(Executable, IsForWindows7AndAsksForTheCommonControls) {
+  const std::string content = ContentOf(Home + "tolvaris.exe");
+  const auto* const start = reinterpret_cast<const IMAGE_DOS_HEADER*>(content.data());
+  const auto* const headers = reinterpret_cast<const IMAGE_NT_HEADERS64*>(content.data() + start->e_lfanew);
+  EXPECT_EQ(headers->OptionalHeader.MajorSubsystemVersion, 6);
+  EXPECT_EQ(headers->OptionalHeader.MinorSubsystemVersion, 1);
+  EXPECT_NE(content.find("InitCommonControlsEx"), std::string::npos) << "else there are no tool tips to be made";
+}
+
 // Everything on the disk with its length and time of change, and everything in the user's registry.
 std::set<std::string> Everything() {
   std::set<std::string> all = Registry("HKCU");
