@@ -59,27 +59,37 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
   "Tolvaris in English. Without this it speaks Portuguese."
 !insertmacro TEXTO ABERTO "O Tolvaris está aberto. Feche-o e tente de novo." \
   "Tolvaris is open. Close it and try again."
+!insertmacro TEXTO PROTEGIDO \
+  "Este arquivo está protegido contra gravação. Tire a proteção, nas propriedades dele, e tente de novo." \
+  "This file is write-protected. Take the protection away, in its properties, and try again."
 !insertmacro TEXTO APAGAR_AJUSTES \
   "Apagar também as configurações do Tolvaris ?$\r$\n$\r$\nOs jogos, as figuras, os salvamentos e o catálogo ficam." \
   "Delete the settings of Tolvaris too?$\r$\n$\r$\nThe games, pictures, saves and the catalogue stay."
 
-; A program that runs can be neither replaced nor deleted. Nothing else has been touched when the person gives up.
-!macro ESPERAR_FECHADO ARQUIVO
+; A program that runs can be neither replaced nor deleted, nor can one that is write-protected. Nothing else has been
+; touched when the person gives up.
+!macro ESPERAR_LIVRE ARQUIVO
   ${DoWhile} ${FileExists} "${ARQUIVO}"
-    ClearErrors
-    FileOpen $0 "${ARQUIVO}" a
-    ${IfNot} ${Errors}
-      FileClose $0
-      ${ExitDo}
+    ${GetFileAttributes} "${ARQUIVO}" "READONLY" $0
+    ${If} $0 == 1
+      StrCpy $1 "$(PROTEGIDO)$\r$\n$\r$\n${ARQUIVO}"
+    ${Else}
+      StrCpy $1 "$(ABERTO)"
+      ClearErrors
+      FileOpen $0 "${ARQUIVO}" a
+      ${IfNot} ${Errors}
+        FileClose $0
+        ${ExitDo}
+      ${EndIf}
     ${EndIf}
-    ${If} ${Cmd} `MessageBox MB_RETRYCANCEL|MB_ICONEXCLAMATION "$(ABERTO)" /SD IDCANCEL IDCANCEL`
-      Abort "$(ABERTO)"
+    ${If} ${Cmd} `MessageBox MB_RETRYCANCEL|MB_ICONEXCLAMATION "$1" /SD IDCANCEL IDCANCEL`
+      Abort "$1"
     ${EndIf}
   ${Loop}
 !macroend
-!macro ESPERAR_PROGRAMAS_FECHADOS
-  !insertmacro ESPERAR_FECHADO "$INSTDIR\tolvaris.exe"
-  !insertmacro ESPERAR_FECHADO "$INSTDIR\tolvariscfg.exe"
+!macro ESPERAR_PROGRAMAS_LIVRES
+  !insertmacro ESPERAR_LIVRE "$INSTDIR\tolvaris.exe"
+  !insertmacro ESPERAR_LIVRE "$INSTDIR\tolvariscfg.exe"
 !macroend
 
 ; A translation that we did not install is the user's.
@@ -93,7 +103,7 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
 Section "$(PROGRAMA)" SECAO_PROGRAMA
   SectionIn RO
   SetOutPath "$INSTDIR"
-  !insertmacro ESPERAR_PROGRAMAS_FECHADOS
+  !insertmacro ESPERAR_PROGRAMAS_LIVRES
   !insertmacro APAGAR_NOSSA_TRADUCAO
   File "${ARQUIVOS}/tolvaris.exe"
   File "${ARQUIVOS}/tolvariscfg.exe"
@@ -104,6 +114,7 @@ Section "$(PROGRAMA)" SECAO_PROGRAMA
 
   WriteRegStr HKCU "${CHAVE}" "DisplayName" "Tolvaris"
   WriteRegStr HKCU "${CHAVE}" "DisplayVersion" "${VERSAO}"
+  WriteRegStr HKCU "${CHAVE}" "Publisher" "Tolvaris"
   WriteRegStr HKCU "${CHAVE}" "DisplayIcon" "$INSTDIR\tolvaris.exe"
   WriteRegStr HKCU "${CHAVE}" "InstallLocation" "$INSTDIR"
   WriteRegStr HKCU "${CHAVE}" "UninstallString" '"${DESINSTALADOR}"'
@@ -147,7 +158,7 @@ FunctionEnd
 
 ; What we installed goes; a directory goes only when it is empty.
 Section "Uninstall"
-  !insertmacro ESPERAR_PROGRAMAS_FECHADOS
+  !insertmacro ESPERAR_PROGRAMAS_LIVRES
   !insertmacro APAGAR_NOSSA_TRADUCAO
   Delete "$INSTDIR\tolvaris.exe"
   Delete "$INSTDIR\tolvariscfg.exe"

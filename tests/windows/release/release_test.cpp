@@ -57,6 +57,20 @@ void UninstallWithTheSettings(const std::string& directory) {
   EXPECT_SOON(program.HasEnded());
 }
 
+// The person is told what hinders, and gives up.
+void RefuseWriteProtected(const std::string& directory) {
+  const std::string file = directory + "tolvaris.exe";
+  SetFileAttributesA(file.c_str(), FILE_ATTRIBUTE_READONLY);
+  const Program program("\"" + directory + "desinstalar.exe\" _?=" + directory.substr(0, directory.size() - 1));
+  const auto button = [&](int id) { return Window(GetDlgItem(FindMessage(program).Handle(), id)); };
+  ASSERT_SOON(button(IDOK).Visible());
+  button(IDOK).Click();
+  ASSERT_SOON(button(IDRETRY));
+  const std::string told = Answer(program, IDCANCEL).Text;
+  EXPECT_TRUE(told.starts_with("This file is write-protected.") && told.ends_with(file)) << told;
+  SetFileAttributesA(file.c_str(), FILE_ATTRIBUTE_NORMAL);
+}
+
 // What a person reads from the first start to the first game.
 struct Words {
   std::string Configuration, Frame, Save, Controller, Close, Play, Information;
@@ -120,6 +134,7 @@ TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
                                               "tolvariscfg.exe"};
   ASSERT_EQ(NamesIn(directory), installed);
   EXPECT_EQ(Registered(UninstallKey, "InstallLocation") + "\\", directory);
+  EXPECT_EQ(Registered(UninstallKey, "Publisher"), "Tolvaris");
   EXPECT_NE(ContentOf(Shortcut()), "");
   PlayFirstGame(directory, Portuguese);
   {
@@ -129,6 +144,7 @@ TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
     RunToItsEnd("\"" + directory + "desinstalar.exe\" /S _?=" + directory.substr(0, directory.size() - 1));
     EXPECT_EQ(NamesIn(directory), before) << "nothing goes while the program is open";
   }
+  RefuseWriteProtected(directory);
   PutFile(directory + "Imgs\\Corrida das Nuvens.gif", "figura");
   PutFile(directory + "language.ini", "[TOLVARIS20]\r\n");
   Uninstall();
