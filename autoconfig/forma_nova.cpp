@@ -1,6 +1,7 @@
 #include "autoconfig/forma_nova.h"
 
 #include "platform/text.h"
+#include "support/caracteres.h"
 
 namespace {
 
@@ -28,7 +29,7 @@ std::size_t FimDoValor(std::string_view Texto, std::size_t Inicio) {
 
 // The directory as the emulator writes it: without its last backslash, but for that of a disk's root.
 std::string ValorDe(std::string Diretorio) {
-  if (Diretorio.ends_with('\\') && !Diretorio.ends_with(":\\")) Diretorio.pop_back();
+  if (TerminaCom(Diretorio, '\\') && !Diretorio.ends_with(":\\")) Diretorio.pop_back();
   std::string valor = "\"";
   for (const char caractere : Diretorio) valor.append(caractere == '\\' ? 2 : 1, caractere);
   return valor + '"';
