@@ -8,7 +8,7 @@ declare checked= check_log= checking= # the check that start_check has started
 # another prefix, for what may run at the same time: prepare_test_machine [NAME]
 prepare_test_machine() {
   start_display
-  prepare_prefix "build/prefixes/${1:-tests}"
+  prepare_prefix "${TOLVARIS_PREFIXES:-build/prefixes}/${1:-tests}"
   mount_floppy "$WINEPREFIX/drive_c/Disquete1440" || say "No floppy-sized disk can be mounted here"
   # A disk is in drive A: while a test has made this directory.
   set_drive a "$WINEPREFIX/drive_c/Disquete1440/Disco"

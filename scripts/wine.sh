@@ -1,9 +1,9 @@
 # shellcheck shell=bash
 # Wine as this project uses it. Sourced, never run; needs processes.sh and, of packages.sh, "${wine_packages[@]}".
 
-# The 64-bit loader itself: Debian's wrapper "wine" asks for the 32-bit one.
-wine=/usr/lib/wine/wine64
-wineserver=/usr/lib/wine/wineserver
+# The 64-bit loader itself: Debian's wrapper "wine" asks for the 32-bit one. scripts/other-wine sets another Wine.
+wine=${TOLVARIS_WINE:-/usr/lib/wine}/wine64
+wineserver=${TOLVARIS_WINE:-/usr/lib/wine}/wineserver64
 
 # Makes the directory the Wine prefix that everything after uses (exports WINEPREFIX), and makes it first if it is not
 # there yet, which takes about 15 s. Wine's processes there end with the script: prepare_prefix DIRECTORY
@@ -23,6 +23,10 @@ prepare_prefix() {
 }
 
 make_prefix() {
+  # Another Wine than the installed one finds the libraries that it needs beside its own only here.
+  if [[ -n ${TOLVARIS_WINE:-} ]]; then
+    install -D -t "$WINEPREFIX/drive_c/windows/system32" "$TOLVARIS_WINE"/../../x86_64-w64-mingw32/lib/*.dll
+  fi
   # Without a display, Wine prepares just as well.
   run_wine wineboot.exe --init >/dev/null 2>&1 || fail "Wine could not prepare $WINEPREFIX"
   # Without a window manager a managed window takes 2 s to close; a crash would wait for a debugger.

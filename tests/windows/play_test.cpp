@@ -72,7 +72,7 @@ TEST_F(Play, ReachesAGameByItsShortNameWhereTheCodePageLacksTheLongOne) {
   const std::string shortName = FromWide(found.cAlternateFileName);
   ASSERT_NE(shortName, "");
   Start();
-  ClickEntry(window->List, "Alan", 2);
+  ClickEntry(window->List, "?lan", 2);
   EXPECT_EQ(NextCall(Emulator), (Call{Emulator + " " + Home + "Roms\\" + shortName, Home + "Emulador"}));
 }
 
