@@ -2,13 +2,24 @@
 #pragma once
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace platform {
 
 // The text converted from UTF-8. A letter that the code page lacks loses its accent; what else it lacks becomes "?".
 std::string FromUtf8(std::string_view utf8);
+
+// The text converted to UTF-8.
+std::string ToUtf8(std::string_view text);
+
+// The text converted from UTF-8; nothing when the code page lacks one of its characters, or it is no UTF-8.
+inline std::optional<std::string> FromUtf8Exactly(std::string_view utf8) {
+  std::string text = FromUtf8(utf8);
+  return ToUtf8(text) == utf8 ? std::optional(std::move(text)) : std::nullopt;
+}
 
 // The text in upper case by the rules of the user's language. The length stays the same.
 std::string CharUpperBuffA(std::string text);

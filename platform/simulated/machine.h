@@ -10,6 +10,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/console.h"
 #include "platform/files.h"
 #include "platform/messages.h"
 #include "platform/simulated/disks.h"
@@ -79,6 +80,11 @@ struct Machine {
   std::map<std::intptr_t, RunningProcess> Processes;
 
   std::map<std::string, std::string> Environment;  // by name in upper case
+
+  std::vector<Argument> Arguments;
+  std::map<Stream, std::string> Streams;  // what was written
+  bool HasConsole = false;
+  std::uint64_t Ticks = 0;  // milliseconds
 
   std::deque<QueuedAnswer> Answers;
   std::vector<ShownMessage> Messages;

@@ -11,6 +11,7 @@
 #include <string_view>
 #include <vector>
 
+#include "platform/console.h"
 #include "platform/controls.h"
 #include "platform/messages.h"
 
@@ -76,7 +77,7 @@ enum class Fault {
 };
 
 // The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry, initialisation files,
-// pictures and processes. A write that fails has written half of its bytes. 0: none. Reset by Reset().
+// pictures, processes, hashes and streams. A write that fails has written half of its bytes. 0: none. Reset by Reset().
 void FailCall(int n, Fault fault = Fault::Once);
 bool CallFailed();  // whether the fault has been reached
 
@@ -106,6 +107,12 @@ void SetCodePage(unsigned page);
 // --- The environment: empty after Reset.
 
 void SetEnvironment(const std::string& name, const std::string& value);
+
+// --- The console: after Reset there are no arguments, and the streams are redirected.
+
+void SetArguments(const std::vector<std::string>& utf8);
+void UseConsole();                      // both streams go to one
+std::string TakeStream(Stream stream);  // what was written since the last call, UTF-8
 
 // --- The user.
 

@@ -31,6 +31,20 @@ char ToCodePage(char32_t character) {
                                     : static_cast<char>(0x80 + (found - std::begin(Upper32)));
 }
 
+void AppendUtf8(std::string& utf8, std::uint32_t character) {
+  if (character < 0x80) {
+    utf8 += static_cast<char>(character);
+    return;
+  }
+  if (character < 0x800) {
+    utf8 += static_cast<char>(0xC0 | character >> 6);
+  } else {
+    utf8 += static_cast<char>(0xE0 | character >> 12);
+    utf8 += static_cast<char>(0x80 | (character >> 6 & 0x3F));
+  }
+  utf8 += static_cast<char>(0x80 | (character & 0x3F));
+}
+
 // Length in bytes of the sequence that starts with this byte; 0: none does.
 std::size_t SequenceLength(unsigned char first) {
   if (first < 0x80) return 1;
@@ -87,6 +101,17 @@ bool CharacterBeginsAt(std::string_view text, std::size_t position) {
   bool begins = true;
   while (position-- > 0 && IsFirstOfTwo(text[position])) begins = !begins;
   return begins;
+}
+
+// Of code page 932 the machine knows only which bytes belong together.
+std::string ToUtf8(std::string_view text) {
+  if (Page() == Utf8) return std::string(text);
+  std::string utf8;
+  for (const char character : text) {
+    const auto code = static_cast<unsigned char>(character);
+    AppendUtf8(utf8, code >= 0x80 && code < 0xA0 ? Upper32[code - 0x80] : code);
+  }
+  return utf8;
 }
 
 std::string CharUpperBuffA(std::string text) {

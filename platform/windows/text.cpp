@@ -26,6 +26,8 @@ std::string FromUtf8(std::string_view utf8) {
   return ::GetACP() == CP_UTF8 ? std::string(utf8) : ToAnsi(Decode(CP_UTF8, 0, utf8));
 }
 
+std::string ToUtf8(std::string_view text) { return ::GetACP() == CP_UTF8 ? std::string(text) : Utf8Of(ToWide(text)); }
+
 bool CharacterBeginsAt(std::string_view text, std::size_t position) {
   if (position >= text.size() || !HasLongCharacters()) return true;
   if (::GetACP() == CP_UTF8) return (static_cast<unsigned char>(text[position]) & 0xC0) != 0x80;

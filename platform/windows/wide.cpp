@@ -89,4 +89,14 @@ std::string NameToAnsi(std::wstring_view wide) {
   return Convert(wide, [](char32_t) { return '?'; });
 }
 
+std::string Utf8Of(std::wstring_view wide) {
+  if (wide.empty()) return {};
+  const int length = static_cast<int>(wide.size());
+  std::string utf8(3 * wide.size(), '\0');  // the most that a unit of UTF-16 takes
+  const int room = static_cast<int>(utf8.size());
+  const int converted = ::WideCharToMultiByte(CP_UTF8, 0, wide.data(), length, utf8.data(), room, nullptr, nullptr);
+  utf8.resize(static_cast<std::size_t>(converted));
+  return utf8;
+}
+
 }  // namespace platform

@@ -31,4 +31,7 @@ std::string ToAnsi(std::wstring_view wide);
 // meant would name another file.
 std::string NameToAnsi(std::wstring_view wide);
 
+// To UTF-8; half a character becomes the replacement character.
+std::string Utf8Of(std::wstring_view wide);
+
 }  // namespace platform

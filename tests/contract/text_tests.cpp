@@ -20,6 +20,14 @@ TEST(Text, IsInCodePage1252WhoseEveryLetterHasItsUpperCase) {
   }
 }
 
+TEST(Text, GoesToUtf8AndBackWhereTheCodePageHasIt) {
+  std::string all;
+  for (int code = 0; code < 256; ++code) all += static_cast<char>(code);
+  EXPECT_EQ(FromUtf8Exactly(ToUtf8(all)), all);
+  EXPECT_EQ(ToUtf8("Não €"_ansi), "Não €");
+  for (const char* lacking : {"日", "Ā", "a\xFF", "\xC3"}) EXPECT_FALSE(FromUtf8Exactly(lacking)) << lacking;
+}
+
 TEST(Text, SortsAsAListDoes) {
   // Ascending: signs, digits, letters; accents count after all letters, as do hyphens and apostrophes.
   const std::string ascending[] = {"",        "!ola",     "_x",       "1",     "10",       "2",      "a",    "Ab",
