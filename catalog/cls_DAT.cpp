@@ -70,16 +70,14 @@ std::string cls_DAT::DefineDOSName(const std::string& Nome) const {
   return chave ? std::string(*chave) : Nome;
 }
 
-void cls_DAT::RegistrarRom(const std::string& Nome, const std::string& DOSName) {
+bool cls_DAT::RegistrarRom(const std::string& Nome, const std::string& DOSName) {
   const std::string entrada = "|" + platform::CharUpperBuffA(DOSName) + "=" + Nome + "|";
-  if (dados_.find(entrada) != std::string::npos) return;
+  if (dados_.find(entrada) != std::string::npos) return true;
   const std::int64_t fim = numArquivo_.Size();
-  if (fim < 0) return;
-  if (numArquivo_.Write(fim, entrada)) {
-    numArquivo_.Flush();
-  } else {
-    numArquivo_.SetSize(fim);  // half an entry would change the lookups of the ones that follow it
-  }
+  if (fim < 0) return false;
+  if (numArquivo_.Write(fim, entrada)) return numArquivo_.Flush();
+  numArquivo_.SetSize(fim);  // half an entry would change the lookups of the ones that follow it
+  return false;
 }
 
 cls_DAT& Catalogo() {

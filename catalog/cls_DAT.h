@@ -37,8 +37,8 @@ class cls_DAT {
   std::string DefineDOSName(const std::string& Nome) const;
 
   // Appends an entry to the file, unless the catalogue as last read has the very same. Lookups find it after the next
-  // Atualizar. An entry that cannot be written whole leaves the file as it was.
-  void RegistrarRom(const std::string& Nome, const std::string& DOSName);
+  // Atualizar. An entry that cannot be written whole leaves the file as it was. False: it may not be on the disk.
+  bool RegistrarRom(const std::string& Nome, const std::string& DOSName);
 
  private:
   void AbrirLeitura(const std::string& Caminho);

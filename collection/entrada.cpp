@@ -1,5 +1,7 @@
 #include "collection/entrada.h"
 
+#include "catalog/cls_DAT.h"
+#include "collection/jogo.h"
 #include "package/cls_CRC.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
@@ -41,6 +43,20 @@ Entrada PorRom(const std::string& Caminho, const EntrePassos& Pausa) {
   Pausa();
   const std::string destino = DirRoms + UltimaParte(Caminho);
   return GravarArquivo(destino, conteudo, 1, true) == 1 ? Entrada::Feita : Entrada::NaoGravada;
+}
+
+Entrada PorJogo(const Pacote& Novo, bool NaLista, const std::function<bool()>& Substituir, const EntrePassos& Pausa) {
+  const Encontro encontrado = NaLista ? Encontro::OutraRom : OQueEncontra(Novo);
+  if (encontrado == Encontro::OutraRom && !Substituir()) return Entrada::Negada;
+  const Entrada fim = PorPacote(Novo, encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace, Pausa);
+  if (fim != Entrada::Feita || NaLista) return fim;
+  return Catalogo().RegistrarRom(Novo.Nome, Novo.DOSName) ? Entrada::Feita : Entrada::SemCatalogo;
+}
+
+bool JaEsta(const Pacote& Novo) {
+  Booleano encontrado = Falso;
+  const bool catalogado = Catalogo().DefineNome(Novo.DOSName, encontrado) == Novo.Nome && encontrado != Falso;
+  return catalogado && LerArquivo(ArquivoDaRom(Novo)) == Novo.Rom && LerArquivo(ImagemDoJogo(Novo.Nome)) == Novo.Imagem;
 }
 
 Encontro OQueEncontra(const Pacote& Novo) {

@@ -24,9 +24,11 @@ Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurt
   return jogo;
 }
 
-std::string ImagemDoJogo(const std::string& Nome) {
+std::string ImagemDoJogo(const std::string& Nome) { return ImagemEm(DirImgs, Nome); }
+
+std::string ImagemEm(const std::string& Diretorio, const std::string& Nome) {
   for (const char* extensao : ExtensoesDeImagem) {
-    std::string caminho = DirImgs + Nome + extensao;
+    std::string caminho = Diretorio + Nome + extensao;
     if (platform::FileSize(caminho).value_or(0) != 0) return caminho;
   }
   return "";

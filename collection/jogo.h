@@ -18,6 +18,12 @@ struct Jogo {
 // name: asking the disk again, file by file, costs milliseconds each in a large directory.
 Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto);
 
+// The files of the ROM directory that are games, as a listing takes it.
+inline constexpr const char* PadraoRoms = "*.zip;*.smc";
+
 // The picture file of the game of this name, or the empty text: the first one of ".gif", ".bmp", ".jpg", ".png" that is
 // there and not empty, or of which that cannot be told.
 std::string ImagemDoJogo(const std::string& Nome);
+
+// The same in any directory, whose path ends with a backslash or is empty.
+std::string ImagemEm(const std::string& Diretorio, const std::string& Nome);

@@ -1,5 +1,4 @@
 // The import command: asks for a file, and whether a game may be replaced, and tells what became of it.
-#include "catalog/cls_DAT.h"
 #include "collection/entrada.h"
 #include "mainwindow/Form1.h"
 #include "package/pacote.h"
@@ -12,7 +11,6 @@
 
 namespace {
 
-using platform::Existing;
 using platform::RunPendingEvents;
 
 struct Importacao {
@@ -31,13 +29,10 @@ Importacao ImportarPacote(const Form1& Lista, const std::string& Caminho) {
   const auto novo = LerPacote(conteudo);
   if (!novo) return {Entrada::NaoLida};
   RunPendingEvents();
-  const bool naLista = Lista.InList1(novo->Nome);
-  const Encontro encontrado = naLista ? Encontro::OutraRom : OQueEncontra(*novo);
-  if (encontrado == Encontro::OutraRom && MostrarMensagem(Mensagem::JogoJaExiste) != platform::Answer::Yes) return {};
-  const Existing existente = encontrado == Encontro::Nada ? Existing::Keep : Existing::Replace;
-  const Entrada fim = PorPacote(*novo, existente, RunPendingEvents);
-  if (fim == Entrada::Feita && !naLista) Catalogo().RegistrarRom(novo->Nome, novo->DOSName);
-  return {fim, novo->Nome};
+  const auto substituir = [] { return MostrarMensagem(Mensagem::JogoJaExiste) == platform::Answer::Yes; };
+  const Entrada fim = PorJogo(*novo, Lista.InList1(novo->Nome), substituir, RunPendingEvents);
+  if (fim == Entrada::Negada) return {};
+  return {fim == Entrada::SemCatalogo ? Entrada::Feita : fim, novo->Nome};  // listed by its file's name
 }
 
 Importacao Importar(const Form1& Lista, const std::string& Caminho) {

@@ -15,8 +15,6 @@
 
 namespace {
 
-constexpr char PadraoRoms[] = "*.zip;*.smc";
-
 void CriarDiretoriosQueFaltam() {
   for (const std::string* diretorio : {&DirRoms, &DirSaves, &DirImgs}) {
     if (!DiretorioExiste(*diretorio)) CriarCaminho(*diretorio);

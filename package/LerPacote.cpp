@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <limits>
 #include <utility>
+#include <variant>
 
 #include "package/pacote.h"
 #include "platform/text.h"
@@ -59,23 +60,37 @@ std::string_view Bloco(std::string_view Conteudo, std::size_t FimCabecalho, std:
   return Conteudo.substr(static_cast<std::size_t>(inicio), static_cast<std::size_t>(Tamanho));
 }
 
-}  // namespace
+using Leitura = std::variant<DefeitoDoPacote, Pacote>;
 
-std::optional<Pacote> LerPacote(std::string_view Conteudo) {
+Leitura Ler(std::string_view Conteudo) {
   const std::optional<Cabecalho> cabecalho = AcharCabecalho(Conteudo);
-  if (!cabecalho) return std::nullopt;
+  if (!cabecalho) return DefeitoDoPacote::SemCabecalho;
   std::array<std::string_view, Chaves.size()> valores;
   for (std::size_t i = 0; i < Chaves.size(); ++i) {
     const std::optional<std::string_view> valor = AcharValor(*cabecalho, Chaves[i]);
-    if (!valor) return std::nullopt;
+    if (!valor) return DefeitoDoPacote::SemChave;
     valores[i] = *valor;
   }
   const auto& [nome, dosName, crc, iImg, tImg, iRom, tRom] = valores;
-  if (!NomeSeguro(nome) || !NomeSeguro(dosName)) return std::nullopt;
+  if (!NomeSeguro(nome) || !NomeSeguro(dosName)) return DefeitoDoPacote::NomeInseguro;
   const auto inicioImagem = LerNumero(iImg), tamanhoImagem = LerNumero(tImg);
   const auto inicioRom = LerNumero(iRom), tamanhoRom = LerNumero(tRom);
-  if (!inicioImagem || !tamanhoImagem || !inicioRom || !tamanhoRom) return std::nullopt;
+  if (!inicioImagem || !tamanhoImagem || !inicioRom || !tamanhoRom) return DefeitoDoPacote::NumeroErrado;
   const std::size_t fim = cabecalho->Original.size();
   return Pacote{std::string(nome), std::string(dosName), std::string(crc),
                 Bloco(Conteudo, fim, *inicioImagem, *tamanhoImagem), Bloco(Conteudo, fim, *inicioRom, *tamanhoRom)};
+}
+
+}  // namespace
+
+std::optional<Pacote> LerPacote(std::string_view Conteudo) {
+  Leitura lido = Ler(Conteudo);
+  auto* pacote = std::get_if<Pacote>(&lido);
+  return pacote != nullptr ? std::optional(std::move(*pacote)) : std::nullopt;
+}
+
+DefeitoDoPacote DefeitoDe(std::string_view Conteudo) {
+  const Leitura lido = Ler(Conteudo);
+  const auto* defeito = std::get_if<DefeitoDoPacote>(&lido);
+  return defeito != nullptr ? *defeito : DefeitoDoPacote::Nenhum;
 }

@@ -30,6 +30,16 @@ std::optional<Pacote> LerPacote(std::string_view Conteudo);
 template <std::same_as<std::string> Passageiro>
 std::optional<Pacote> LerPacote(Passageiro&& Conteudo) = delete;
 
+// Why LerPacote gives nothing for a content.
+enum class DefeitoDoPacote {
+  Nenhum,
+  SemCabecalho,  // not the first word of a package, or no marker within the length that a header may have
+  SemChave,
+  NumeroErrado,
+  NomeInseguro
+};
+DefeitoDoPacote DefeitoDe(std::string_view Conteudo);
+
 // Whether this name and an extension make the name of a plain file in whichever directory they are appended to. False
 // for what would lead elsewhere: a path separator, a drive or stream (":"), a control character, a device (CON, NUL,
 // COM1, ...). True for the empty name, and for what the platform refuses by itself when the file is created.

@@ -88,8 +88,9 @@ TEST_F(Catalogue, RegistrarRomAppendsOneEntryInOneWriteWholeOrNotAtAll) {
     Names.Fechar();
     Names.Carregar();
   };
-  const auto add = [&] { Names.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
-  const auto check = [&] { EXPECT_TRUE(Content(File) == old || Content(File) == old + entry); };
+  bool told = false;
+  const auto add = [&] { told = Names.RegistrarRom("Maçã"_ansi, "maçã"_ansi); };
+  const auto check = [&] { EXPECT_TRUE(Content(File) == old + entry || (Content(File) == old && !told)); };
   EXPECT_GE(WithEachFault(Fault::Once, prepare, add, check), 2);
   const auto writes = WriteCount(File);
   add();
