@@ -3,9 +3,10 @@
 
 # What each kind of work needs, as lists for install_packages.
 # shellcheck disable=SC2034  # the scripts that source this file use them
-native_packages=(g++ cmake ninja-build libgtest-dev)
+native_packages=(g++ cmake ninja-build libgtest-dev zlib1g-dev)
 # shellcheck disable=SC2034
-windows_packages=(g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 cmake ninja-build googletest)
+windows_packages=(g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 cmake ninja-build googletest
+  libz-mingw-w64-dev)
 # shellcheck disable=SC2034
 release_packages=(libc-bin nsis zip)
 # shellcheck disable=SC2034

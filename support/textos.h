@@ -1,6 +1,8 @@
-// The texts that the windows show beside their messages and the captions of their controls: as data, like those.
+// The texts that the windows and tvk show beside their messages and the captions of their controls: as data, like
+// those.
 #pragma once
 
+#include <initializer_list>
 #include <span>
 #include <string>
 #include <string_view>
@@ -24,6 +26,94 @@ enum class Texto {
   ProcurarEmulador,
   EmuladorZsnes,
   Programas,
+  // tvk: the help.
+  TvkResumo,
+  TvkUso,
+  TvkCriar,
+  TvkListar,
+  TvkVerificar,
+  TvkExtrair,
+  TvkInstalar,
+  TvkAjudaDeVerbo,
+  TvkArquivos,
+  TvkListas,
+  TvkEstado,
+  OpcaoNome,
+  OpcaoDOS,
+  OpcaoFigura,
+  OpcaoSaida,
+  OpcaoDeInstalacao,
+  OpcaoLista,
+  OpcaoCsv,
+  OpcaoEmInstalacao,
+  OpcaoSubstituir,
+  // tvk: wrong use.
+  VejaAAjuda,
+  FaltaOVerbo,
+  VerboDesconhecido,
+  OpcaoDesconhecida,
+  OpcaoRepetida,
+  FaltaOValor,
+  FaltamArquivos,
+  FontesDemais,
+  SoParaUmJogo,
+  // tvk: what it tells.
+  QuantosFeitos,
+  PacotesFeitos,
+  PacotesVerificados,
+  ColunaDOS,
+  ColunaFigura,
+  ColunaJogo,
+  ColunaSoma,
+  ColunaNome,
+  // tvk: why something is refused.
+  ForaDaPaginaDeCodigo,
+  NenhumArquivo,
+  NenhumPacote,
+  NenhumJogo,
+  NaoExiste,
+  EhUmDiretorio,
+  NaoEhDiretorio,
+  EstaVazio,
+  GrandeDemais,
+  NaoPodeSerLido,
+  NaoPodeSerGravado,
+  JaExisteOutro,
+  SemMemoria,
+  NaoEhPacote,
+  CabecalhoIncompleto,
+  NumeroErrado,
+  NomeInseguro,
+  CortadoAntesDaFigura,
+  CortadoAntesDoJogo,
+  SemSoma,
+  OutraSoma,
+  NomeErrado,
+  NomeDOSErrado,
+  NomeVazio,
+  NomeLongo,
+  NomeDOSLongo,
+  NomeComCaractere,
+  NomeComPonta,
+  NomeDeDispositivo,
+  NomeDeOutro,
+  NomeDOSDeOutro,
+  NomeRepetido,
+  NomeDOSRepetido,
+  SemNomeDOS,
+  NaoEhJogo,
+  ZipDanificado,
+  FiguraNaoServe,
+  SemFigura,
+  ErroNaFigura,
+  FaltaAColuna,
+  FaltaOCampo,
+  CamposDemais,
+  AspasErradas,
+  SemMenu,
+  JaHaOutroJogo,
+  CatalogoNaoGravado,
+  NaoPodeSerInstalado,
 };
 
 // All of them, UTF-8, in the order of their names above.
@@ -31,3 +121,6 @@ std::span<const std::string_view> TodosOsTextos();
 
 // In the ANSI code page, translated.
 std::string Traduzir(Texto Qual);
+
+// The same with these values, one after the other, in the place of each "%".
+std::string Traduzir(Texto Qual, std::initializer_list<std::string> Valores);

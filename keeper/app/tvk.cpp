@@ -1,0 +1,3 @@
+#include "keeper/tvk.h"
+
+int main() { return Tvk(); }

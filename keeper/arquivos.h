@@ -1,0 +1,27 @@
+// Files as tvk reads and writes them.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "platform/files.h"
+
+// Longer files are refused unread: no game is so long, and it bounds the memory that one file takes.
+inline constexpr std::int64_t MaiorArquivo = 256 << 20;  // bytes
+
+struct Leitura {
+  std::string Conteudo;
+  std::string Falta;  // why it could not be read; empty when it was
+};
+
+// All bytes of a file.
+Leitura LerTudo(const std::string& Caminho);
+
+enum class Escrita { Feita, Igual, Outro, Falhou };  // Outro: with Keep, the file is there with another content
+
+// Makes the text a file's content, unless it is already, and then writes nothing. The directories on its way are
+// created.
+Escrita GravarSeMuda(const std::string& Caminho, std::string_view Conteudo, platform::Existing Existente);
+
+// True for a directory, whatever other attributes it has.
+bool EhDiretorio(const std::string& Caminho);

@@ -1,0 +1,55 @@
+#include "keeper/motivos.h"
+
+#include <optional>
+
+#include "package/cls_CRC.h"
+#include "package/nomes.h"
+#include "platform/text.h"
+#include "support/textos.h"
+
+namespace {
+
+using Tipo = FaltaNoNome::Tipo;
+
+std::string EmPalavras(const FaltaNoNome& falta, Texto longo) {
+  switch (falta.Qual) {
+    case Tipo::Vazio:
+      return Traduzir(Texto::NomeVazio);
+    case Tipo::Longo:
+      return Traduzir(longo);
+    case Tipo::Caractere:
+      return Traduzir(Texto::NomeComCaractere, {platform::FromUtf8(falta.Caractere)});
+    case Tipo::Ponta:
+      return Traduzir(Texto::NomeComPonta);
+    default:
+      return Traduzir(Texto::NomeDeDispositivo);
+  }
+}
+
+}  // namespace
+
+Motivos MotivosDoConteudo(const Pacote& Lido) {
+  Motivos motivos;
+  if (Lido.Imagem.empty()) motivos.push_back(Traduzir(Texto::CortadoAntesDaFigura));
+  const auto soma = cls_CRC().CRC(Lido.Rom);
+  if (Lido.Rom.empty()) {
+    motivos.push_back(Traduzir(Texto::CortadoAntesDoJogo));
+  } else if (!soma) {
+    motivos.push_back(Traduzir(Texto::SemSoma));
+  } else if (TextoCRC(*soma) != Lido.CRC) {
+    motivos.push_back(Traduzir(Texto::OutraSoma));
+  }
+  return motivos;
+}
+
+Motivos MotivosDosNomes(const std::string& Nome, const std::string& NomeDOS) {
+  Motivos motivos;
+  const FaltaNoNome nome = ConferirNome(platform::ToUtf8(Nome)), dos = ConferirNomeDOS(platform::ToUtf8(NomeDOS));
+  if (nome.Qual != Tipo::Nenhuma) {
+    motivos.push_back(Traduzir(Texto::NomeErrado, {Nome, EmPalavras(nome, Texto::NomeLongo)}));
+  }
+  if (dos.Qual != Tipo::Nenhuma) {
+    motivos.push_back(Traduzir(Texto::NomeDOSErrado, {NomeDOS, EmPalavras(dos, Texto::NomeDOSLongo)}));
+  }
+  return motivos;
+}

@@ -1,0 +1,13 @@
+// Why packages and names are refused, in words.
+#pragma once
+
+#include <string>
+
+#include "keeper/pacotes.h"
+#include "package/pacote.h"
+
+// What keeps a package's content from being put into a collection.
+Motivos MotivosDoConteudo(const Pacote& Lido);
+
+// What is wrong with its names, where they are to be given on.
+Motivos MotivosDosNomes(const std::string& Nome, const std::string& NomeDOS);

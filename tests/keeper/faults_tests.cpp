@@ -1,0 +1,69 @@
+// The verbs that write, with each call of the platform failing in turn.
+#include "tests/keeper/keeper.h"
+
+namespace {
+
+struct Faults : Keeper {};
+
+// Each file is old or new, whole, and what is not done is told.
+TEST_F(Faults, LeaveOldOrNewFilesAndAreTold) {
+  const struct {
+    const char* Name;
+    Texts Arguments;
+    Texts Directories;
+  } verbs[] = {
+      {"criar",
+       {"criar", "--saida", "C:\\saida", "C:\\jogos\\Super Jogo.smc", "C:\\jogos\\outro.smc"},
+       {"C:\\saida\\"}},
+      {"criar --lista", {"criar", "--saida", "C:\\saida", "--lista", "C:\\jogos\\l.csv"}, {"C:\\saida\\"}},
+      {"criar --instalacao", {"criar", "--saida", "C:\\saida", "--instalacao", "C:\\T"}, {"C:\\saida\\"}},
+      {"extrair", {"extrair", "--saida", "C:\\saida", "C:\\p.tvk"}, {"C:\\saida\\"}},
+      {"instalar",
+       {"instalar", "--instalacao", "C:\\T", "--substituir", "C:\\p.tvk"},
+       {"C:\\T\\Roms\\", "C:\\T\\Imgs\\"}},
+  };
+  for (const auto& [name, arguments, directories] : verbs) {
+    SCOPED_TRACE(name);
+    Files before, after;
+    Outcome told{};
+    const auto prepare = [&] {
+      for (const char* game : {"Super Jogo", "outro"}) {
+        PutFile("C:\\jogos\\"s + game + ".smc", Rom);
+        PutFile("C:\\jogos\\"s + game + ".gif", Picture);
+      }
+      PutFile("C:\\jogos\\l.csv", "arquivo\nSuper Jogo.smc\n");
+      PutFile("C:\\p.tvk", Package("Super Jogo", "SUPER"));
+      PutFile("C:\\saida\\Super Jogo.tvk", "old");
+      PutFile("C:\\T\\tolvaris.dat", "|X=Outro|");
+      PutFile("C:\\T\\Roms\\SUPER.zip", "old rom" + std::string(32'761, 'x'));
+      PutFile("C:\\T\\Imgs\\SUPER.gif", Picture);
+      PutFile("C:\\T\\Imgs\\Super Jogo.gif", Picture);
+      before = Standing();
+    };
+    const auto operate = [&] { told = RunTvk(arguments); };
+    const auto check = [&] {
+      const bool done = Standing() == after;
+      EXPECT_TRUE(done || told.Status == 1) << "not told";
+      EXPECT_EQ(OpenFiles(), 0U);
+      EXPECT_EQ(Leftovers(directories), Texts{});
+      for (const bool cut : {false, true}) {
+        if (cut) CutPower();
+        for (const auto& [path, content] : Standing()) {
+          const bool broken = path == "C:\\T\\tolvaris.dat" && after[path].starts_with(content);
+          EXPECT_TRUE((before.contains(path) && content == before[path]) ||
+                      (after.contains(path) && content == after[path]) || broken)
+              << path;
+        }
+        for (const auto& [path, content] : before) EXPECT_TRUE(Content(path)) << path << " is gone";
+      }
+    };
+    Renew();
+    prepare();
+    operate();
+    after = Standing();
+    EXPECT_EQ(told.Status, 0) << told.Errors;
+    EXPECT_GT(WithEachFault(prepare, operate, check), 5);
+  }
+}
+
+}  // namespace
