@@ -46,7 +46,7 @@ class Oficina {
     if (motivos.empty()) motivos = Repetidos(encomenda.Nome, *nomeDOS);
     if (!EhRom(encomenda.Rom)) motivos.push_back(Traduzir(Texto::NaoEhJogo));
     if (!motivos.empty()) return motivos;
-    const FiguraPronta figura = PrepararFigura(encomenda.Figura);
+    const FiguraPronta figura = PrepararFigura(encomenda.Figura, encomenda.Nome);
     if (!figura.Falta.empty()) return {figura.Falta};
     return Montar(encomenda, *nomeDOS, figura.Conteudo);
   }
@@ -122,7 +122,7 @@ bool FazSentido(const Pedido& feito, Relato& onde) {
 void Criar(const Pedido& Feito, Relato& Onde) {
   if (!FazSentido(Feito, Onde)) return;
   const std::string saida = ComoDiretorio(Feito.Valor("--saida"));
-  ApagarRestos(saida);
+  ApagarRestos(saida.empty() ? ".\\" : saida);
   const auto encomendas = LerEncomendas(Feito, Onde);
   Oficina oficina(saida, Onde);
   Onde.Comecar(encomendas.size());

@@ -38,6 +38,6 @@ Motivos ExtrairUm(const Pacote& pacote, const std::string& saida, Relato& onde) 
 
 void Extrair(const Pedido& Feito, Relato& Onde) {
   const std::string saida = ComoDiretorio(Feito.Valor("--saida"));
-  ApagarRestos(saida);
+  ApagarRestos(saida.empty() ? ".\\" : saida);
   ParaCadaPacote(Feito, Onde, [&](const PacoteLido& lido) { return ExtrairUm(lido.Conteudo, saida, Onde); });
 }

@@ -1,21 +1,28 @@
 #include "keeper/figuras.h"
 
 #include <cstddef>
+#include <optional>
+#include <utility>
 
 #include "keeper/arquivos.h"
 #include "platform/picture_file.h"
+#include "platform/picture_maker.h"
 #include "support/textos.h"
 
 namespace {
 
-constexpr int MaiorLargura = 400, MaiorAltura = 346;       // pixels: twice the place where the menu shows it
+constexpr platform::PixelSize MaiorTamanho = {400, 346};   // twice the place where the menu shows it
 constexpr std::size_t MaiorFigura = std::size_t{1} << 20;  // bytes
 
 // Whether a package may carry the file as it is.
 bool Serve(std::string_view conteudo) {
   const auto figura = platform::ReadPictureFile(conteudo);
-  return figura && figura->Format != platform::PictureFormat::Png && figura->Width <= MaiorLargura &&
-         figura->Height <= MaiorAltura && conteudo.size() <= MaiorFigura;
+  return figura && figura->Format != platform::PictureFormat::Png && figura->Width <= MaiorTamanho.Width &&
+         figura->Height <= MaiorTamanho.Height && conteudo.size() <= MaiorFigura;
+}
+
+FiguraPronta Feita(std::optional<std::string> figura, const std::string& senao) {
+  return figura ? FiguraPronta{std::move(*figura), ""} : FiguraPronta{"", senao};
 }
 
 }  // namespace
@@ -35,10 +42,10 @@ std::string_view TipoDaFigura(std::string_view Conteudo) {
   }
 }
 
-FiguraPronta PrepararFigura(const std::string& Arquivo) {
-  if (Arquivo.empty()) return {"", Traduzir(Texto::SemFigura)};
+FiguraPronta PrepararFigura(const std::string& Arquivo, const std::string& NomeDoJogo) {
+  if (Arquivo.empty()) return Feita(platform::DrawJpeg(NomeDoJogo, MaiorTamanho), Traduzir(Texto::FiguraNaoDesenhada));
   Leitura lida = LerTudo(Arquivo);
   if (!lida.Falta.empty()) return {"", Traduzir(Texto::ErroNaFigura, {Arquivo, lida.Falta})};
-  if (!Serve(lida.Conteudo)) return {"", Traduzir(Texto::FiguraNaoServe, {Arquivo})};
-  return {std::move(lida.Conteudo), ""};
+  if (Serve(lida.Conteudo)) return {std::move(lida.Conteudo), ""};
+  return Feita(platform::MakeJpeg(lida.Conteudo, MaiorTamanho), Traduzir(Texto::FiguraNaoServe, {Arquivo}));
 }

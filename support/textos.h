@@ -104,7 +104,7 @@ enum class Texto {
   NaoEhJogo,
   ZipDanificado,
   FiguraNaoServe,
-  SemFigura,
+  FiguraNaoDesenhada,
   ErroNaFigura,
   FaltaAColuna,
   FaltaOCampo,

@@ -108,6 +108,18 @@ PICTURE_WORDS = [
     b"IHDR", b"IDAT", b"IEND", b"!\xf9", b",", b"\xff\xff", b"\xff\xff\xff\x7f", b"\0\0\0\x80",
 ]
 
+ZIP = (b"PK\3\4" + bytes(26) + b"a" + b"PK\1\2" + bytes(42) + b"a" + b"PK\5\6" + bytes(4) + b"\1\0\1\0"
+       + struct.pack("<IIH", 47, 31, 0))
+TABLES = {
+    "commas": b"arquivo,nome\r\na.smc,\"Um, dois\"\r\n",
+    "semicolons": b"\xef\xbb\xbfarquivo;nome\n\n\"a\"\"b\r\nc\";\r;\n",
+    "broken": b"a,b\n\"x\"y,\nz\"",
+    "fields": b"a\nb,c\n\"\nd;\r\n\"",
+    "archive": ZIP,
+    "archive-comment": ZIP[:-2] + b"\3\0oi!",
+}
+TABLE_WORDS = [b"\"", b"\"\"", b",", b";", b"\r\n", b"\n", b"\r", b"PK\1\2", b"PK\3\4", b"PK\5\6", b"\xff\xff\xff\xff"]
+
 # By target: the first inputs, the words, and the longest input.
 TARGETS = {
     "package": (PACKAGES, PACKAGE_WORDS, 12000),
@@ -116,6 +128,7 @@ TARGETS = {
     "emulator_configuration": (EMULATOR_CONFIGURATIONS, EMULATOR_WORDS, 1000),
     "picture": (PICTURES, PICTURE_WORDS, 600),
     "newer_configuration": (NEWER_CONFIGURATIONS, NEWER_WORDS, 1000),
+    "keeper_table": (TABLES, TABLE_WORDS, 300),
 }
 
 

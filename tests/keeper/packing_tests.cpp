@@ -1,4 +1,5 @@
 #include "keeper/zip.h"
+#include "platform/picture_file.h"
 #include "tests/keeper/keeper.h"
 
 namespace {
@@ -91,11 +92,41 @@ TEST_F(Packing, OptionsAndListsSayWhatTheGamesAre) {
             "C:\\jogos\\l.csv:6: falta o campo arquivo\n"
             "C:\\jogos\\l.csv:7: tem mais campos que a primeira linha\n"
             "C:\\jogos\\l.csv:10: tem aspas sem fim, ou no meio de um campo\n"
-            "C:\\jogos\\l.csv:4: não há figura para este jogo\n"
+            "C:\\jogos\\l.csv:4: C:\\jogos\\c.smc: não existe\n"
             "C:\\jogos\\l.csv:8: o nome 'ação' já é de outro destes jogos\n"
             "C:\\jogos\\l.csv:8: o nome DOS 'B' já é de outro destes jogos\n"
             "C:\\jogos\\l.csv:9: o nome 'D?' não pode ter o caractere ?\n");
   EXPECT_EQ(RomOf("p\\Um; outro.tvk", "Um; outro", "B"), FazerZip("b.smc", Rom));
+}
+
+TEST_F(Packing, APictureThatFitsStaysAndAnyOtherBecomesAJpegThatDoes) {
+  const std::string fits = contract::SmallGif({400, 346}), slow = Picture + std::string(1 << 20, 'x');
+  const struct {
+    const char *Name, *File;
+    std::string Content, Kept;  // the latter empty: it is made a JPEG
+    int Width, Height;
+  } cases[] = {
+      {"the largest that fits", "jogo.gif", fits, fits, 400, 346},
+      {"too wide", "jogo.gif", contract::SmallGif({800, 100}), "", 400, 50},
+      {"too high", "jogo.gif", contract::SmallGif({401, 692}), "", 201, 346},
+      {"of too many bytes", "jogo.gif", slow, "", 2, 2},
+      {"of a type that no package carries", "jogo.png", contract::SmallPng(), "", 2, 2},
+      {"none: it is drawn", "outro.gif", Picture, "", 400, 346},
+  };
+  for (const auto& [name, file, content, kept, width, height] : cases) {
+    SCOPED_TRACE(name);
+    Renew();
+    PutFile(Home + "jogo.smc", Rom);
+    PutFile(Home + file, content);
+    EXPECT_EQ(RunTvk({"criar", "jogo.smc"}).Errors, "");
+    const std::string package = Content(Home + "jogo.tvk").value_or("");
+    const auto read = LerPacote(package);
+    ASSERT_TRUE(read);
+    const auto picture = platform::ReadPictureFile(read->Imagem);
+    ASSERT_TRUE(picture);
+    EXPECT_EQ(std::make_pair(picture->Width, picture->Height), std::make_pair(width, height));
+    EXPECT_TRUE(kept.empty() ? picture->Format == platform::PictureFormat::Jpeg : read->Imagem == kept);
+  }
 }
 
 TEST_F(Packing, AnInstallationGivesItsNamesAndPictures) {
@@ -134,8 +165,8 @@ TEST_F(Packing, RefusesWhatCannotBePackedAndPacksTheRest) {
             "texto.txt: não é um arquivo .zip, .smc nem .sfc\n"
             "X=Y.smc: o nome 'X=Y' não pode ter o caractere =\n"
             "pasta.smc: é um diretório\n"
-            "falta.smc: não há figura para este jogo\n"
-            "ruim.smc: a figura ruim.gif não é .gif, .bmp nem .jpg de até 400 x 346 pontos e 1 MiB\n"
+            "falta.smc: não existe\n"
+            "ruim.smc: a figura ruim.gif não é uma que o Windows mostre\n"
             "bom.smc: bom.tvk não pode ser gravado\n");
 }
 
