@@ -18,46 +18,46 @@ using platform::Argument;
 constexpr std::string_view FimDasOpcoes = "--";
 
 // The lines of a list, without the blanks around them and without the empty ones.
-std::vector<Argument> LinhasDe(std::string_view utf8) {
+std::vector<Argument> LinhasDe(std::string_view Utf8) {
   std::vector<Argument> linhas;
-  while (!utf8.empty()) {
-    const std::size_t fim = std::min(utf8.find('\n'), utf8.size());
-    const std::string linha(SemBrancos(utf8.substr(0, fim), " \t\r"));
-    utf8.remove_prefix(std::min(fim + 1, utf8.size()));
+  while (!Utf8.empty()) {
+    const std::size_t fim = std::min(Utf8.find('\n'), Utf8.size());
+    const std::string linha(SemBrancos(Utf8.substr(0, fim), " \t\r"));
+    Utf8.remove_prefix(std::min(fim + 1, Utf8.size()));
     if (!linha.empty()) linhas.push_back({linha, platform::FromUtf8Exactly(linha)});
   }
   return linhas;
 }
 
-std::vector<Argument> ArgumentosDe(const Argument& nome, Relato& onde) {
-  if (!nome.Ansi) return {nome};  // said where all are looked at
-  const Leitura lista = LerTudo(ComBarras(nome.Ansi->substr(1)));
-  if (!lista.Falta.empty()) onde.Recusar(nome.Ansi->substr(1), lista.Falta);
+std::vector<Argument> ArgumentosDe(const Argument& Nome, Relato& Onde) {
+  if (!Nome.Ansi) return {Nome};  // said where all are looked at
+  const Leitura lista = LerTudo(CaminhoDoWindows(Nome.Ansi->substr(1)));
+  if (!lista.Falta.empty()) Onde.Recusar(Nome.Ansi->substr(1), lista.Falta);
   return LinhasDe(EmUtf8(lista.Conteudo));
 }
 
-bool TemCuringa(const std::string& caminho) { return UltimaParte(caminho).find_first_of("*?") != std::string::npos; }
+bool TemCuringa(const std::string& Caminho) { return UltimaParte(Caminho).find_first_of("*?") != std::string::npos; }
 
 // A ";" would part two patterns.
-std::string ComoPadrao(std::string nome) {
-  std::ranges::replace(nome, ';', '?');
-  return nome;
+std::string ComoPadrao(std::string Nome) {
+  std::ranges::replace(Nome, ';', '?');
+  return Nome;
 }
 
-void AcrescentarArquivos(std::vector<std::string>& arquivos, const std::string& caminho, Relato& onde) {
-  if (!TemCuringa(caminho)) {
-    arquivos.push_back(caminho);
+void AcrescentarArquivos(std::vector<std::string>& Arquivos, const std::string& Caminho, Relato& Onde) {
+  if (!TemCuringa(Caminho)) {
+    Arquivos.push_back(Caminho);
     return;
   }
-  AcrescentarListados(arquivos, DiretorioDe(caminho), ComoPadrao(UltimaParte(caminho)), caminho, Texto::NenhumArquivo,
-                      onde);
+  AcrescentarListados(Arquivos, DiretorioDe(Caminho), ComoPadrao(UltimaParte(Caminho)), Caminho, Texto::NenhumArquivo,
+                      Onde);
 }
 
 // Goes through the arguments of a verb.
 class Leitor {
  public:
-  Leitor(std::span<const Argument> argumentos, std::span<const Opcao> opcoes, Relato& onde)
-      : argumentos_(argumentos), opcoes_(opcoes), onde_(onde) {}
+  Leitor(std::span<const Argument> Argumentos, std::span<const Opcao> Opcoes, Relato& Onde)
+      : argumentos_(Argumentos), opcoes_(Opcoes), onde_(Onde) {}
 
   Pedido Ler() {
     while (atual_ < argumentos_.size()) LerUm(argumentos_[atual_++]);
@@ -65,27 +65,27 @@ class Leitor {
   }
 
  private:
-  void LerUm(const Argument& argumento) {
-    if (!argumento.Ansi) {
-      onde_.RecusarUtf8(argumento.Utf8, Traduzir(Texto::ForaDaPaginaDeCodigo));
-    } else if (!soArquivos_ && *argumento.Ansi == FimDasOpcoes) {
+  void LerUm(const Argument& Argumento) {
+    if (!Argumento.Ansi) {
+      onde_.RecusarUtf8(Argumento.Utf8, Traduzir(Texto::ForaDaPaginaDeCodigo));
+    } else if (!soArquivos_ && *Argumento.Ansi == FimDasOpcoes) {
       soArquivos_ = true;
-    } else if (!soArquivos_ && argumento.Ansi->size() > 1 && argumento.Ansi->starts_with('-')) {
-      LerOpcao(*argumento.Ansi);
+    } else if (!soArquivos_ && Argumento.Ansi->size() > 1 && Argumento.Ansi->starts_with('-')) {
+      LerOpcao(*Argumento.Ansi);
     } else {
-      AcrescentarArquivos(pedido_.Arquivos, ComBarras(*argumento.Ansi), onde_);
+      AcrescentarArquivos(pedido_.Arquivos, CaminhoDoWindows(*Argumento.Ansi), onde_);
     }
   }
 
-  void LerOpcao(const std::string& nome) {
-    const auto opcao = std::ranges::find(opcoes_, nome, &Opcao::Nome);
-    if (opcao == opcoes_.end()) return onde_.UsoErrado(Traduzir(Texto::OpcaoDesconhecida, {nome}));
-    if (pedido_.Tem(nome)) return onde_.UsoErrado(Traduzir(Texto::OpcaoRepetida, {nome}));
+  void LerOpcao(const std::string& Nome) {
+    const auto opcao = std::ranges::find(opcoes_, Nome, &Opcao::Nome);
+    if (opcao == opcoes_.end()) return onde_.UsoErrado(Traduzir(Texto::OpcaoDesconhecida, {Nome}));
+    if (pedido_.Tem(Nome)) return onde_.UsoErrado(Traduzir(Texto::OpcaoRepetida, {Nome}));
     std::string& valor = pedido_.Opcoes[opcao->Nome];
     if (opcao->Valor.empty()) return;
-    if (atual_ == argumentos_.size()) return onde_.UsoErrado(Traduzir(Texto::FaltaOValor, {nome}));
+    if (atual_ == argumentos_.size()) return onde_.UsoErrado(Traduzir(Texto::FaltaOValor, {Nome}));
     const Argument& dado = argumentos_[atual_++];
-    if (!dado.Ansi) return onde_.UsoErrado(nome + ": " + Traduzir(Texto::ForaDaPaginaDeCodigo));
+    if (!dado.Ansi) return onde_.UsoErrado(Nome + ": " + Traduzir(Texto::ForaDaPaginaDeCodigo));
     valor = *dado.Ansi;
   }
 
@@ -123,13 +123,12 @@ Pedido LerPedido(std::span<const Argument> Argumentos, std::span<const Opcao> Op
   return Leitor(Argumentos, Opcoes, Onde).Ler();
 }
 
-// A listing has a "?", which no name has, where the code page lacks a character.
 void AcrescentarListados(std::vector<std::string>& Arquivos, const std::string& Diretorio, const std::string& Padrao,
                          const std::string& Nomeado, Texto SeNenhum, Relato& Onde) {
   const auto achados = platform::ListDirectory(Diretorio.empty() ? ".\\" : Diretorio, Padrao);
   if (achados.empty()) Onde.Recusar(Nomeado, Traduzir(SeNenhum));
   for (const auto& cada : achados) {
-    if (cada.Name.find('?') == std::string::npos) {
+    if (cada.IsExact) {
       Arquivos.push_back(Diretorio + cada.Name);
     } else {
       Onde.Recusar(Diretorio + cada.Name, Traduzir(Texto::ForaDaPaginaDeCodigo));
@@ -137,13 +136,12 @@ void AcrescentarListados(std::vector<std::string>& Arquivos, const std::string& 
   }
 }
 
-std::string ComBarras(std::string Caminho) {
+std::string CaminhoDoWindows(std::string Caminho) {
   std::ranges::replace(Caminho, '/', '\\');
   return Caminho;
 }
 
 std::string ComoDiretorio(const std::string& Caminho) {
-  const std::string diretorio = ComBarras(Caminho);
-  const bool inteiro = diretorio.empty() || diretorio.ends_with('\\') || diretorio.ends_with(':');
-  return inteiro ? diretorio : diretorio + '\\';
+  const std::string diretorio = CaminhoDoWindows(Caminho);
+  return diretorio.empty() || diretorio.ends_with(':') ? diretorio : ComBarra(diretorio);
 }

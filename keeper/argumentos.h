@@ -38,5 +38,5 @@ void AcrescentarListados(std::vector<std::string>& Arquivos, const std::string& 
                          const std::string& Nomeado, Texto SeNenhum, Relato& Onde);
 
 // A path with backslashes in place of slashes; the same as a directory, with a backslash at its end.
-std::string ComBarras(std::string Caminho);
+std::string CaminhoDoWindows(std::string Caminho);
 std::string ComoDiretorio(const std::string& Caminho);

@@ -12,13 +12,13 @@
 namespace {
 
 // Compared piece by piece, so that only one of the two is in memory.
-bool TemConteudo(const std::string& caminho, std::string_view conteudo) {
+bool TemConteudo(const std::string& Caminho, std::string_view Conteudo) {
   using Pedaco = std::array<char, 65'536>;
-  platform::File arquivo(caminho, platform::Access::Read);
-  if (arquivo.Size() != static_cast<std::int64_t>(conteudo.size())) return false;
+  platform::File arquivo(Caminho, platform::Access::Read);
+  if (arquivo.Size() != static_cast<std::int64_t>(Conteudo.size())) return false;
   const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
-  for (std::size_t posicao = 0; posicao < conteudo.size(); posicao += pedaco->size()) {
-    const std::string_view parte = conteudo.substr(posicao, pedaco->size());
+  for (std::size_t posicao = 0; posicao < Conteudo.size(); posicao += pedaco->size()) {
+    const std::string_view parte = Conteudo.substr(posicao, pedaco->size());
     const std::int64_t lidos = arquivo.Read(static_cast<std::int64_t>(posicao), pedaco->data(), parte.size());
     if (lidos != static_cast<std::int64_t>(parte.size())) return false;
     if (!std::equal(parte.begin(), parte.end(), pedaco->begin())) return false;
@@ -26,7 +26,7 @@ bool TemConteudo(const std::string& caminho, std::string_view conteudo) {
   return true;
 }
 
-Leitura Falta(Texto qual) { return {"", Traduzir(qual)}; }
+Leitura Falta(Texto Qual) { return {"", Traduzir(Qual)}; }
 
 }  // namespace
 

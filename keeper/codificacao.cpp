@@ -9,21 +9,21 @@ namespace {
 constexpr std::string_view Marca = "\xEF\xBB\xBF";
 
 // Bytes of the character that begins with this one; 0: none does.
-std::size_t TamanhoDe(unsigned char primeiro) {
-  if (primeiro < 0x80) return 1;
-  if (primeiro >= 0xC2 && primeiro < 0xE0) return 2;
-  if (primeiro >= 0xE0 && primeiro < 0xF0) return 3;
-  return primeiro >= 0xF0 && primeiro < 0xF5 ? 4 : 0;
+std::size_t TamanhoDe(unsigned char Primeiro) {
+  if (Primeiro < 0x80) return 1;
+  if (Primeiro >= 0xC2 && Primeiro < 0xE0) return 2;
+  if (Primeiro >= 0xE0 && Primeiro < 0xF0) return 3;
+  return Primeiro >= 0xF0 && Primeiro < 0xF5 ? 4 : 0;
 }
 
-bool EhUtf8(std::string_view texto) {
-  while (!texto.empty()) {
-    const std::size_t tamanho = TamanhoDe(static_cast<unsigned char>(texto[0]));
-    if (tamanho == 0 || tamanho > texto.size()) return false;
+bool EhUtf8(std::string_view Texto) {
+  while (!Texto.empty()) {
+    const std::size_t tamanho = TamanhoDe(static_cast<unsigned char>(Texto[0]));
+    if (tamanho == 0 || tamanho > Texto.size()) return false;
     for (std::size_t i = 1; i < tamanho; ++i) {
-      if ((texto[i] & 0xC0) != 0x80) return false;
+      if ((Texto[i] & 0xC0) != 0x80) return false;
     }
-    texto.remove_prefix(tamanho);
+    Texto.remove_prefix(tamanho);
   }
   return true;
 }

@@ -21,15 +21,15 @@ namespace {
 // Packs one game after the other; of those that are done it keeps the names.
 class Oficina {
  public:
-  Oficina(std::string saida, Relato& onde) : saida_(std::move(saida)), onde_(onde) {}
+  Oficina(std::string Saida, Relato& Onde) : saida_(std::move(Saida)), onde_(Onde) {}
 
   // Whatever goes wrong unexpectedly is a want of memory.
-  void Fazer(const Encomenda& encomenda) {
+  void Fazer(const Encomenda& Pedida) {
     lidos_ = 0;
     try {
-      for (const std::string& motivo : Empacotar(encomenda)) onde_.Recusar(encomenda.Onde, motivo);
+      for (const std::string& motivo : Empacotar(Pedida)) onde_.Recusar(Pedida.Onde, motivo);
     } catch (...) {
-      onde_.Recusar(encomenda.Onde, Traduzir(Texto::SemMemoria));
+      onde_.Recusar(Pedida.Onde, Traduzir(Texto::SemMemoria));
     }
     onde_.Andar(lidos_);
   }
@@ -39,64 +39,64 @@ class Oficina {
   }
 
  private:
-  Motivos Empacotar(const Encomenda& encomenda) {
-    const auto nomeDOS = NomeDOSDe(encomenda);
+  Motivos Empacotar(const Encomenda& Pedida) {
+    const auto nomeDOS = NomeDOSDe(Pedida);
     if (!nomeDOS) return {Traduzir(Texto::SemNomeDOS)};
-    Motivos motivos = MotivosDosNomes(encomenda.Nome, *nomeDOS);
-    if (motivos.empty()) motivos = Repetidos(encomenda.Nome, *nomeDOS);
-    if (!EhRom(encomenda.Rom)) motivos.push_back(Traduzir(Texto::NaoEhJogo));
+    Motivos motivos = MotivosDosNomes(Pedida.Nome, *nomeDOS);
+    if (motivos.empty()) motivos = Repetidos(Pedida.Nome, *nomeDOS);
+    if (!EhRom(Pedida.Rom)) motivos.push_back(Traduzir(Texto::NaoEhJogo));
     if (!motivos.empty()) return motivos;
-    const FiguraPronta figura = PrepararFigura(encomenda.Figura, encomenda.Nome);
+    const FiguraPronta figura = PrepararFigura(Pedida.Figura, Pedida.Nome);
     if (!figura.Falta.empty()) return {figura.Falta};
-    return Montar(encomenda, *nomeDOS, figura.Conteudo);
+    return Montar(Pedida, *nomeDOS, figura.Conteudo);
   }
 
-  Motivos Montar(const Encomenda& encomenda, const std::string& nomeDOS, const std::string& figura) {
-    Leitura lida = LerTudo(encomenda.Rom);
-    if (!lida.Falta.empty()) return {ComArquivo(encomenda, lida.Falta)};
+  Motivos Montar(const Encomenda& Pedida, const std::string& NomeDOS, const std::string& Figura) {
+    Leitura lida = LerTudo(Pedida.Rom);
+    if (!lida.Falta.empty()) return {ComArquivo(Pedida, lida.Falta)};
     lidos_ = static_cast<std::int64_t>(lida.Conteudo.size());
-    const RomPronta rom = PrepararRom(encomenda.Rom, std::move(lida.Conteudo));
-    if (!rom.Falta.empty()) return {ComArquivo(encomenda, rom.Falta)};
+    const RomPronta rom = PrepararRom(Pedida.Rom, std::move(lida.Conteudo));
+    if (!rom.Falta.empty()) return {ComArquivo(Pedida, rom.Falta)};
     const auto soma = cls_CRC().CRC(rom.Zip);
     if (!soma) return {Traduzir(Texto::SemSoma)};
-    return Gravar(encomenda.Nome, nomeDOS,
-                  MontarPacote(encomenda.Nome, nomeDOS, TextoCRC(*soma), std::ssize(figura), std::ssize(rom.Zip),
-                               figura, rom.Zip));
+    return Gravar(
+        Pedida.Nome, NomeDOS,
+        MontarPacote(Pedida.Nome, NomeDOS, TextoCRC(*soma), std::ssize(Figura), std::ssize(rom.Zip), Figura, rom.Zip));
   }
 
-  Motivos Gravar(const std::string& nome, const std::string& nomeDOS, const std::string& pacote) {
-    const std::string arquivo = saida_ + nome + ".tvk";
-    switch (GravarSeMuda(arquivo, pacote, platform::Existing::Replace)) {
+  Motivos Gravar(const std::string& Nome, const std::string& NomeDOS, const std::string& Pacote) {
+    const std::string arquivo = saida_ + Nome + ".tvk";
+    switch (GravarSeMuda(arquivo, Pacote, platform::Existing::Replace)) {
       case Escrita::Igual:
         ++iguais_;
         return {};
       case Escrita::Feita:
         ++gravados_;
-        onde_.Linha(EmColunaDOS(nomeDOS) + arquivo);
+        onde_.Linha(EmColunaDOS(NomeDOS) + arquivo);
         return {};
       default:
         return {Traduzir(Texto::NaoPodeSerGravado, {arquivo})};
     }
   }
 
-  static std::optional<std::string> NomeDOSDe(const Encomenda& encomenda) {
-    if (!encomenda.NomeDOS.empty()) return platform::CharUpperBuffA(encomenda.NomeDOS);
-    const std::string nome = UltimaParte(encomenda.Rom);
+  static std::optional<std::string> NomeDOSDe(const Encomenda& Pedida) {
+    if (!Pedida.NomeDOS.empty()) return platform::CharUpperBuffA(Pedida.NomeDOS);
+    const std::string nome = UltimaParte(Pedida.Rom);
     return FazerNomeDOS(NomeBase(nome).value_or(nome));
   }
 
-  Motivos Repetidos(const std::string& nome, const std::string& nomeDOS) {
+  Motivos Repetidos(const std::string& Nome, const std::string& NomeDOS) {
     Motivos motivos;
-    if (!nomes_.insert(platform::CharUpperBuffA(nome)).second) {
-      motivos.push_back(Traduzir(Texto::NomeRepetido, {nome}));
+    if (!nomes_.insert(platform::CharUpperBuffA(Nome)).second) {
+      motivos.push_back(Traduzir(Texto::NomeRepetido, {Nome}));
     }
-    if (!nomesDOS_.insert(nomeDOS).second) motivos.push_back(Traduzir(Texto::NomeDOSRepetido, {nomeDOS}));
+    if (!nomesDOS_.insert(NomeDOS).second) motivos.push_back(Traduzir(Texto::NomeDOSRepetido, {NomeDOS}));
     return motivos;
   }
 
   // A list's line does not say by itself which file is meant.
-  static std::string ComArquivo(const Encomenda& encomenda, const std::string& falta) {
-    return encomenda.Onde == encomenda.Rom ? falta : encomenda.Rom + ": " + falta;
+  static std::string ComArquivo(const Encomenda& Pedida, const std::string& Falta) {
+    return Pedida.Onde == Pedida.Rom ? Falta : Pedida.Rom + ": " + Falta;
   }
 
   std::string saida_;
@@ -107,11 +107,11 @@ class Oficina {
 };
 
 // The options that say something of one game, and those that name games, do not go together.
-bool FazSentido(const Pedido& feito, Relato& onde) {
-  const bool deUm = feito.Tem("--nome") || feito.Tem("--dos") || feito.Tem("--figura");
-  const int fontes = feito.Tem("--instalacao") + feito.Tem("--lista") + !feito.Arquivos.empty();
-  if (fontes > 1 || (deUm && feito.Arquivos.size() != 1)) {
-    onde.UsoErrado(Traduzir(fontes > 1 ? Texto::FontesDemais : Texto::SoParaUmJogo));
+bool FazSentido(const Pedido& Feito, Relato& Onde) {
+  const bool deUm = Feito.Tem("--nome") || Feito.Tem("--dos") || Feito.Tem("--figura");
+  const int fontes = Feito.Tem("--instalacao") + Feito.Tem("--lista") + !Feito.Arquivos.empty();
+  if (fontes > 1 || (deUm && Feito.Arquivos.size() != 1)) {
+    Onde.UsoErrado(Traduzir(fontes > 1 ? Texto::FontesDemais : Texto::SoParaUmJogo));
     return false;
   }
   return true;

@@ -2,9 +2,9 @@
 
 namespace {
 
-char SeparadorDe(std::string_view conteudo) {
+char SeparadorDe(std::string_view Conteudo) {
   bool entreAspas = false;
-  for (const char letra : conteudo) {
+  for (const char letra : Conteudo) {
     if (letra == '"') entreAspas = !entreAspas;
     if (entreAspas) continue;
     if (letra == ';' || letra == ',') return letra;
@@ -13,9 +13,9 @@ char SeparadorDe(std::string_view conteudo) {
   return ',';
 }
 
-std::string EntreAspas(std::string_view campo) {
+std::string EntreAspas(std::string_view Campo) {
   std::string texto = "\"";
-  for (const char letra : campo) {
+  for (const char letra : Campo) {
     if (letra == '"') texto += '"';
     texto += letra;
   }

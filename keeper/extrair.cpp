@@ -11,26 +11,26 @@
 namespace {
 
 // A file that is there with another content stays: it may be the person's own.
-void Por(const std::string& caminho, std::string_view conteudo, Motivos& motivos, Relato& onde) {
-  switch (GravarSeMuda(caminho, conteudo, platform::Existing::Keep)) {
+void Por(const std::string& Caminho, std::string_view Conteudo, Motivos& Faltas, Relato& Onde) {
+  switch (GravarSeMuda(Caminho, Conteudo, platform::Existing::Keep)) {
     case Escrita::Feita:
-      return onde.Linha(caminho);
+      return Onde.Linha(Caminho);
     case Escrita::Outro:
-      return motivos.push_back(Traduzir(Texto::JaExisteOutro, {caminho}));
+      return Faltas.push_back(Traduzir(Texto::JaExisteOutro, {Caminho}));
     case Escrita::Falhou:
-      return motivos.push_back(Traduzir(Texto::NaoPodeSerGravado, {caminho}));
+      return Faltas.push_back(Traduzir(Texto::NaoPodeSerGravado, {Caminho}));
     default:
       return;
   }
 }
 
-Motivos ExtrairUm(const Pacote& pacote, const std::string& saida, Relato& onde) {
-  Motivos motivos = MotivosDoConteudo(pacote);
-  if (pacote.DOSName.empty() || pacote.Nome.empty()) motivos.push_back(Traduzir(Texto::NomeVazio));
+Motivos ExtrairUm(const Pacote& Lido, const std::string& Saida, Relato& Onde) {
+  Motivos motivos = MotivosDoConteudo(Lido);
+  if (Lido.DOSName.empty() || Lido.Nome.empty()) motivos.push_back(Traduzir(Texto::NomeVazio));
   if (!motivos.empty()) return motivos;
-  const std::string_view tipo = TipoDaFigura(pacote.Imagem);
-  Por(saida + pacote.DOSName + (PareceZip(pacote.Rom) ? ".zip" : ".smc"), pacote.Rom, motivos, onde);
-  Por(saida + pacote.Nome + "." + std::string(tipo == "?" ? "gif" : tipo), pacote.Imagem, motivos, onde);
+  const std::string_view tipo = TipoDaFigura(Lido.Imagem);
+  Por(Saida + Lido.DOSName + (PareceZip(Lido.Rom) ? ".zip" : ".smc"), Lido.Rom, motivos, Onde);
+  Por(Saida + Lido.Nome + "." + std::string(tipo == "?" ? "gif" : tipo), Lido.Imagem, motivos, Onde);
   return motivos;
 }
 
@@ -39,5 +39,5 @@ Motivos ExtrairUm(const Pacote& pacote, const std::string& saida, Relato& onde) 
 void Extrair(const Pedido& Feito, Relato& Onde) {
   const std::string saida = ComoDiretorio(Feito.Valor("--saida"));
   ApagarRestos(saida.empty() ? ".\\" : saida);
-  ParaCadaPacote(Feito, Onde, [&](const PacoteLido& lido) { return ExtrairUm(lido.Conteudo, saida, Onde); });
+  ParaCadaPacote(Feito, Onde, [&](const PacoteLido& Lido) { return ExtrairUm(Lido.Conteudo, saida, Onde); });
 }

@@ -15,14 +15,14 @@ constexpr platform::PixelSize MaiorTamanho = {400, 346};   // twice the place wh
 constexpr std::size_t MaiorFigura = std::size_t{1} << 20;  // bytes
 
 // Whether a package may carry the file as it is.
-bool Serve(std::string_view conteudo) {
-  const auto figura = platform::ReadPictureFile(conteudo);
+bool Serve(std::string_view Conteudo) {
+  const auto figura = platform::ReadPictureFile(Conteudo);
   return figura && figura->Format != platform::PictureFormat::Png && figura->Width <= MaiorTamanho.Width &&
-         figura->Height <= MaiorTamanho.Height && conteudo.size() <= MaiorFigura;
+         figura->Height <= MaiorTamanho.Height && Conteudo.size() <= MaiorFigura;
 }
 
-FiguraPronta Feita(std::optional<std::string> figura, const std::string& senao) {
-  return figura ? FiguraPronta{std::move(*figura), ""} : FiguraPronta{"", senao};
+FiguraPronta Feita(std::optional<std::string> Figura, const std::string& Senao) {
+  return Figura ? FiguraPronta{std::move(*Figura), ""} : FiguraPronta{"", Senao};
 }
 
 }  // namespace

@@ -31,31 +31,31 @@ class Colecao {
   Colecao(const Colecao&) = delete;
   Colecao& operator=(const Colecao&) = delete;
 
-  bool Mostra(const std::string& nome) const { return nomes_.contains(platform::CharUpperBuffA(nome)); }
+  bool Mostra(const std::string& Nome) const { return nomes_.contains(platform::CharUpperBuffA(Nome)); }
 
   // The catalogue is read again only where an entry of this run may be asked for.
-  bool Tem(const Pacote& pacote) {
-    if (mudou_ && Mostra(pacote.Nome)) {
+  bool Tem(const Pacote& Novo) {
+    if (mudou_ && Mostra(Novo.Nome)) {
       Catalogo().Atualizar();
       mudou_ = false;
     }
-    return JaEsta(pacote);
+    return JaEsta(Novo);
   }
 
-  void Ganhou(const Pacote& pacote) {
-    Acrescentar(pacote.Nome);
+  void Ganhou(const Pacote& Novo) {
+    Acrescentar(Novo.Nome);
     mudou_ = true;
   }
 
  private:
-  void Acrescentar(const std::string& nome) { nomes_.insert(platform::CharUpperBuffA(nome)); }
+  void Acrescentar(const std::string& Nome) { nomes_.insert(platform::CharUpperBuffA(Nome)); }
 
   std::set<std::string> nomes_;
   bool mudou_ = false;
 };
 
-Motivos MotivosDe(Entrada fim) {
-  switch (fim) {
+Motivos MotivosDe(Entrada Fim) {
+  switch (Fim) {
     case Entrada::Feita:
       return {};
     case Entrada::Negada:
@@ -69,14 +69,14 @@ Motivos MotivosDe(Entrada fim) {
   }
 }
 
-Motivos InstalarUm(const Pacote& pacote, bool substituir, Colecao& colecao, Relato& onde) {
-  Motivos motivos = MotivosDoConteudo(pacote);
-  if (!motivos.empty() || colecao.Tem(pacote)) return motivos;
+Motivos InstalarUm(const Pacote& Novo, bool Substituir, Colecao& Destino, Relato& Onde) {
+  Motivos motivos = MotivosDoConteudo(Novo);
+  if (!motivos.empty() || Destino.Tem(Novo)) return motivos;
   const Entrada fim = PorJogo(
-      pacote, colecao.Mostra(pacote.Nome), [&] { return substituir; }, [] {});
+      Novo, Destino.Mostra(Novo.Nome), [Substituir] { return Substituir; }, [] {});
   if (fim == Entrada::Feita) {
-    colecao.Ganhou(pacote);
-    onde.Linha(EmColunaDOS(pacote.DOSName) + pacote.Nome);
+    Destino.Ganhou(Novo);
+    Onde.Linha(EmColunaDOS(Novo.DOSName) + Novo.Nome);
   }
   return MotivosDe(fim);
 }
@@ -89,5 +89,5 @@ void Instalar(const Pedido& Feito, Relato& Onde) {
   Colecao colecao;
   const bool substituir = Feito.Tem("--substituir");
   ParaCadaPacote(Feito, Onde,
-                 [&](const PacoteLido& lido) { return InstalarUm(lido.Conteudo, substituir, colecao, Onde); });
+                 [&](const PacoteLido& Lido) { return InstalarUm(Lido.Conteudo, substituir, colecao, Onde); });
 }

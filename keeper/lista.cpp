@@ -12,20 +12,20 @@
 
 namespace {
 
-using Colunas = std::vector<std::string>;
+using NomesDeColunas = std::vector<std::string>;
 
-std::string EmMinusculas(std::string texto) {
-  for (char& letra : texto) {
+std::string EmMinusculas(std::string Texto) {
+  for (char& letra : Texto) {
     if (letra >= 'A' && letra <= 'Z') letra = static_cast<char>(letra - 'A' + 'a');
   }
-  return texto;
+  return Texto;
 }
 
-std::string Lugar(const std::string& arquivo, std::size_t linha) { return arquivo + ":" + std::to_string(linha); }
+std::string Lugar(const std::string& Arquivo, std::size_t Linha) { return Arquivo + ":" + std::to_string(Linha); }
 
-Colunas LerColunas(LeitorCsv& tabela) {
-  const auto primeira = tabela.Proxima();
-  Colunas colunas;
+NomesDeColunas LerColunas(LeitorCsv& Tabela) {
+  const auto primeira = Tabela.Proxima();
+  NomesDeColunas colunas;
   if (primeira) {
     for (const std::string& nome : primeira->Campos)
       colunas.push_back(EmMinusculas(std::string(SemBrancos(nome, " \t"))));
@@ -34,26 +34,27 @@ Colunas LerColunas(LeitorCsv& tabela) {
 }
 
 // Why a line cannot be used; the empty text when it can, and its fields are in `lida`.
-std::string LerCampos(const std::vector<std::string>& utf8, const Colunas& colunas, LinhaDaLista& lida) {
-  if (utf8.size() > colunas.size()) return Traduzir(Texto::CamposDemais);
-  for (std::size_t i = 0; i < utf8.size(); ++i) {
-    const auto campo = platform::FromUtf8Exactly(SemBrancos(utf8[i], " \t"));
-    if (!campo) return colunas[i] + ": " + Traduzir(Texto::ForaDaPaginaDeCodigo);
-    lida.Campos[colunas[i]] = *campo;
+std::string LerCampos(const std::vector<std::string>& Utf8, const NomesDeColunas& Colunas, LinhaDaLista& Lida) {
+  if (Utf8.size() > Colunas.size()) return Traduzir(Texto::CamposDemais);
+  for (std::size_t i = 0; i < Utf8.size(); ++i) {
+    const auto campo = platform::FromUtf8Exactly(SemBrancos(Utf8[i], " \t"));
+    if (!campo) return Colunas[i] + ": " + Traduzir(Texto::ForaDaPaginaDeCodigo);
+    Lida.Campos[Colunas[i]] = *campo;
   }
   return "";
 }
 
-std::string FaltaExigida(const LinhaDaLista& lida, const Colunas& exigidas) {
-  const auto vazia = std::ranges::find_if(exigidas, [&](const auto& nome) { return lida.Campo(nome).empty(); });
-  return vazia == exigidas.end() ? "" : Traduzir(Texto::FaltaOCampo, {*vazia});
+std::string FaltaExigida(const LinhaDaLista& Lida, const NomesDeColunas& Exigidas) {
+  const auto vazia = std::ranges::find_if(Exigidas, [&](const auto& Nome) { return Lida.Campo(Nome).empty(); });
+  return vazia == Exigidas.end() ? "" : Traduzir(Texto::FaltaOCampo, {*vazia});
 }
 
-bool TemColunas(const std::string& arquivo, const Colunas& colunas, const Colunas& exigidas, Relato& onde) {
+bool TemColunas(const std::string& Arquivo, const NomesDeColunas& Colunas, const NomesDeColunas& Exigidas,
+                Relato& Onde) {
   const auto falta = std::ranges::find_if(
-      exigidas, [&](const auto& nome) { return std::ranges::find(colunas, nome) == colunas.end(); });
-  if (falta == exigidas.end()) return true;
-  onde.Recusar(Lugar(arquivo, 1), Traduzir(Texto::FaltaAColuna, {*falta}));
+      Exigidas, [&](const auto& Nome) { return std::ranges::find(Colunas, Nome) == Colunas.end(); });
+  if (falta == Exigidas.end()) return true;
+  Onde.Recusar(Lugar(Arquivo, 1), Traduzir(Texto::FaltaAColuna, {*falta}));
   return false;
 }
 
@@ -72,7 +73,7 @@ std::vector<LinhaDaLista> LerLista(const std::string& Arquivo, const std::vector
   }
   const std::string utf8 = EmUtf8(lida.Conteudo);
   LeitorCsv tabela(utf8);
-  const Colunas colunas = LerColunas(tabela);
+  const NomesDeColunas colunas = LerColunas(tabela);
   std::vector<LinhaDaLista> linhas;
   if (tabela.LinhaErrada() == 0 && !TemColunas(Arquivo, colunas, Exigidas, Onde)) return {};
   while (const auto linha = tabela.Proxima()) {

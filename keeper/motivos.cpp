@@ -11,14 +11,14 @@ namespace {
 
 using Tipo = FaltaNoNome::Tipo;
 
-std::string EmPalavras(const FaltaNoNome& falta, Texto longo) {
-  switch (falta.Qual) {
+std::string EmPalavras(const FaltaNoNome& Falta, Texto Longo) {
+  switch (Falta.Qual) {
     case Tipo::Vazio:
       return Traduzir(Texto::NomeVazio);
     case Tipo::Longo:
-      return Traduzir(longo);
+      return Traduzir(Longo);
     case Tipo::Caractere:
-      return Traduzir(Texto::NomeComCaractere, {platform::FromUtf8(falta.Caractere)});
+      return Traduzir(Texto::NomeComCaractere, {platform::FromUtf8(Falta.Caractere)});
     case Tipo::Ponta:
       return Traduzir(Texto::NomeComPonta);
     default:

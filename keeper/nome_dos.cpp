@@ -5,43 +5,46 @@
 #include "package/nomes.h"
 #include "package/pacote.h"
 #include "platform/hash.h"
+#include "platform/letters.h"
 #include "platform/text.h"
 
 namespace {
 
-// The letters of U+00C0 to U+00FF without their accents; a blank where there is no such letter.
-constexpr std::string_view SemAcento = "AAAAAAACEEEEIIIIDNOOOOO OUUUUYTSAAAAAAACEEEEIIIIDNOOOOO OUUUUYTY";
-static_assert(SemAcento.size() == 64);
-
-char LetraDOS(unsigned char letra) {
-  if (letra >= 'a' && letra <= 'z') return static_cast<char>(letra - 'a' + 'A');
-  return (letra >= 'A' && letra <= 'Z') || (letra >= '0' && letra <= '9') ? static_cast<char>(letra) : ' ';
+// The letter or digit of a DOS name, or a blank.
+char LetraDOS(char Letra) {
+  if (Letra >= 'a' && Letra <= 'z') return static_cast<char>(Letra - 'a' + 'A');
+  return (Letra >= 'A' && Letra <= 'Z') || (Letra >= '0' && Letra <= '9') ? Letra : ' ';
 }
 
-std::string Letras(std::string_view utf8) {
-  constexpr unsigned char antesDeC0 = 0xC3;  // the first byte of U+00C0 to U+00FF
+// The letter of two bytes, of which the second one is the last of its character.
+char SemAcento(char Primeiro, char Segundo) {
+  return platform::WithoutAccent((static_cast<unsigned char>(Primeiro) & 0x1FU) << 6 |
+                                 (static_cast<unsigned char>(Segundo) & 0x3FU));
+}
+
+std::string Letras(std::string_view Utf8) {
   constexpr std::size_t quantas = 4;
   std::string letras;
-  for (std::size_t i = 0; i < utf8.size() && letras.size() < quantas; ++i) {
-    const auto byte = static_cast<unsigned char>(utf8[i]);
-    const bool acentuada = byte == antesDeC0 && i + 1 < utf8.size();
-    const char letra = acentuada ? SemAcento[static_cast<unsigned char>(utf8[++i]) & 0x3F] : LetraDOS(byte);
+  for (std::size_t i = 0; i < Utf8.size() && letras.size() < quantas; ++i) {
+    const bool deDoisBytes = (Utf8[i] & 0xE0) == 0xC0 && i + 1 < Utf8.size();
+    const char letra = LetraDOS(deDoisBytes ? SemAcento(Utf8[i], Utf8[i + 1]) : Utf8[i]);
+    if (deDoisBytes) ++i;
     if (letra != ' ') letras += letra;
   }
   return letras;
 }
 
-std::string Digitos(const platform::Sha256Value& soma) {
+std::string Digitos(const platform::Sha256Value& Soma) {
   constexpr std::string_view alfabeto = "ABCDEFGHIJKLMNOPQRSTUVWXYZ234567";
-  const unsigned bits = static_cast<unsigned>(soma[0] << 16 | soma[1] << 8 | soma[2]) >> 4;
+  const unsigned bits = static_cast<unsigned>(Soma[0] << 16 | Soma[1] << 8 | Soma[2]) >> 4;
   return {alfabeto[bits >> 15 & 31], alfabeto[bits >> 10 & 31], alfabeto[bits >> 5 & 31], alfabeto[bits & 31]};
 }
 
-std::string EmMaiusculas(std::string texto) {
-  for (char& letra : texto) {
+std::string EmMaiusculas(std::string Texto) {
+  for (char& letra : Texto) {
     if (letra >= 'a' && letra <= 'z') letra = static_cast<char>(letra - 'a' + 'A');
   }
-  return texto;
+  return Texto;
 }
 
 }  // namespace

@@ -5,16 +5,16 @@
 
 namespace {
 
-void AcrescentarPacotes(std::vector<std::string>& pacotes, const std::string& argumento, Relato& onde) {
-  if (!EhDiretorio(argumento)) {
-    pacotes.push_back(argumento);
+void AcrescentarPacotes(std::vector<std::string>& Pacotes, const std::string& Argumento, Relato& Onde) {
+  if (!EhDiretorio(Argumento)) {
+    Pacotes.push_back(Argumento);
     return;
   }
-  AcrescentarListados(pacotes, ComoDiretorio(argumento), "*.tvk", argumento, Texto::NenhumPacote, onde);
+  AcrescentarListados(Pacotes, ComoDiretorio(Argumento), "*.tvk", Argumento, Texto::NenhumPacote, Onde);
 }
 
-Texto MotivoDe(DefeitoDoPacote defeito) {
-  switch (defeito) {
+Texto MotivoDe(DefeitoDoPacote Defeito) {
+  switch (Defeito) {
     case DefeitoDoPacote::SemChave:
       return Texto::CabecalhoIncompleto;
     case DefeitoDoPacote::NumeroErrado:
@@ -26,19 +26,19 @@ Texto MotivoDe(DefeitoDoPacote defeito) {
   }
 }
 
-Motivos LerEFazer(const std::string& arquivo, std::int64_t& tamanho, const ComPacote& fazer) {
-  const Leitura lido = LerTudo(arquivo);
-  tamanho = static_cast<std::int64_t>(lido.Conteudo.size());
+Motivos LerEFazer(const std::string& Arquivo, std::int64_t& Tamanho, const ComPacote& Fazer) {
+  const Leitura lido = LerTudo(Arquivo);
+  Tamanho = static_cast<std::int64_t>(lido.Conteudo.size());
   if (!lido.Falta.empty()) return {lido.Falta};
   const auto pacote = LerPacote(lido.Conteudo);
   if (!pacote) return {Traduzir(MotivoDe(DefeitoDe(lido.Conteudo)))};
-  return fazer({arquivo, tamanho, *pacote});
+  return Fazer({Arquivo, Tamanho, *pacote});
 }
 
 // Whatever goes wrong unexpectedly is a want of memory.
-Motivos SemExcecao(const std::string& arquivo, std::int64_t& tamanho, const ComPacote& fazer) {
+Motivos SemExcecao(const std::string& Arquivo, std::int64_t& Tamanho, const ComPacote& Fazer) {
   try {
-    return LerEFazer(arquivo, tamanho, fazer);
+    return LerEFazer(Arquivo, Tamanho, Fazer);
   } catch (...) {
     return {Traduzir(Texto::SemMemoria)};
   }

@@ -12,8 +12,8 @@ using platform::Stream;
 constexpr std::string_view FimDeLinha = "\r\n";
 
 // "12.3" of bytes and milliseconds; nothing is so fast that it takes no time.
-std::string MegabytesPorSegundo(std::int64_t bytes, std::uint64_t milissegundos) {
-  const auto decimos = bytes / 100 / static_cast<std::int64_t>(std::max<std::uint64_t>(milissegundos, 1));
+std::string MegabytesPorSegundo(std::int64_t Bytes, std::uint64_t Milissegundos) {
+  const auto decimos = Bytes / 100 / static_cast<std::int64_t>(std::max<std::uint64_t>(Milissegundos, 1));
   return std::to_string(decimos / 10) + "." + std::to_string(decimos % 10);
 }
 

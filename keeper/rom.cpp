@@ -11,13 +11,13 @@ namespace {
 constexpr std::size_t SemSoma = 1'048'576;  // bytes; a multiple of it has no checksum
 
 // Memory chips have sizes of many KiB; some copiers put 512 bytes before them.
-bool PareceRom(std::string_view conteudo) {
+bool PareceRom(std::string_view Conteudo) {
   constexpr std::size_t bloco = 32'768, cabecalho = 512;
-  return conteudo.size() % bloco == 0 || conteudo.size() % bloco == cabecalho;
+  return Conteudo.size() % bloco == 0 || Conteudo.size() % bloco == cabecalho;
 }
 
-std::string NomeDentro(const std::string& arquivo) {
-  const std::string nome = UltimaParte(arquivo);
+std::string NomeDentro(const std::string& Arquivo) {
+  const std::string nome = UltimaParte(Arquivo);
   const std::string dentro = TipoDoArquivo(nome) == "SMC" ? nome : NomeBase(nome).value_or(nome) + ".smc";
   return platform::ToUtf8(dentro);
 }

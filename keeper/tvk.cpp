@@ -61,65 +61,65 @@ constexpr Verbo Verbos[] = {
 };
 
 // A word and what it means.
-std::string Explicada(std::string_view palavra, std::size_t largura, Texto descricao) {
+std::string Explicada(std::string_view Palavra, std::size_t Largura, Texto Descricao) {
   std::string linha(Coluna, ' ');
-  linha += palavra;
-  linha.resize(std::max(linha.size() + 1, Coluna + largura), ' ');
-  return linha + Traduzir(descricao);
+  linha += Palavra;
+  linha.resize(std::max(linha.size() + 1, Coluna + Largura), ' ');
+  return linha + Traduzir(Descricao);
 }
 
-void AjudarComTudo(Relato& onde) {
-  onde.Linha(Traduzir(Texto::TvkResumo));
-  onde.Linha("");
-  onde.Linha(Traduzir(Texto::TvkUso));
-  onde.Linha("");
-  for (const Verbo& verbo : Verbos) onde.Linha(Explicada(verbo.Nome, LarguraVerbos, verbo.Descricao));
-  onde.Linha("");
+void AjudarComTudo(Relato& Onde) {
+  Onde.Linha(Traduzir(Texto::TvkResumo));
+  Onde.Linha("");
+  Onde.Linha(Traduzir(Texto::TvkUso));
+  Onde.Linha("");
+  for (const Verbo& verbo : Verbos) Onde.Linha(Explicada(verbo.Nome, LarguraVerbos, verbo.Descricao));
+  Onde.Linha("");
   for (const Texto texto : {Texto::TvkAjudaDeVerbo, Texto::TvkArquivos, Texto::TvkListas, Texto::TvkEstado}) {
-    onde.Linha(Traduzir(texto));
+    Onde.Linha(Traduzir(texto));
   }
 }
 
-void AjudarComVerbo(const Verbo& verbo, Relato& onde) {
-  for (const std::string_view uso : verbo.Usos) {
-    if (!uso.empty()) onde.Linha(std::string(uso));
+void AjudarComVerbo(const Verbo& Qual, Relato& Onde) {
+  for (const std::string_view uso : Qual.Usos) {
+    if (!uso.empty()) Onde.Linha(std::string(uso));
   }
-  onde.Linha("");
-  onde.Linha(Explicada(verbo.Nome, LarguraOpcoes, verbo.Descricao));
-  for (const Opcao& opcao : verbo.Opcoes) {
-    onde.Linha(Explicada(std::string(opcao.Nome) + " " + std::string(opcao.Valor), LarguraOpcoes, opcao.Descricao));
+  Onde.Linha("");
+  Onde.Linha(Explicada(Qual.Nome, LarguraOpcoes, Qual.Descricao));
+  for (const Opcao& opcao : Qual.Opcoes) {
+    Onde.Linha(Explicada(std::string(opcao.Nome) + " " + std::string(opcao.Valor), LarguraOpcoes, opcao.Descricao));
   }
 }
 
-bool PedeAjuda(std::span<const Argument> argumentos) {
-  for (const Argument& cada : argumentos) {
+bool PedeAjuda(std::span<const Argument> Argumentos) {
+  for (const Argument& cada : Argumentos) {
     if (cada.Utf8 == "--") return false;
     if (cada.Utf8 == "--ajuda") return true;
   }
   return false;
 }
 
-bool TemFonte(const Verbo& verbo, const Pedido& feito) {
-  const bool naOpcao = feito.Tem("--lista") || feito.Tem("--instalacao");
-  return !feito.Arquivos.empty() || (verbo.SemArquivos && naOpcao);
+bool TemFonte(const Verbo& Qual, const Pedido& Feito) {
+  const bool naOpcao = Feito.Tem("--lista") || Feito.Tem("--instalacao");
+  return !Feito.Arquivos.empty() || (Qual.SemArquivos && naOpcao);
 }
 
-void FazerVerbo(const Verbo& verbo, std::span<const Argument> argumentos, Relato& onde) {
-  if (PedeAjuda(argumentos)) return AjudarComVerbo(verbo, onde);
-  const Pedido feito = LerPedido(argumentos, verbo.Opcoes, onde);
-  if (onde.Estado() == 2) return;
-  if (TemFonte(verbo, feito)) return verbo.Fazer(feito, onde);
-  if (onde.Estado() == 0) onde.UsoErrado(Traduzir(Texto::FaltamArquivos));  // else all were refused
+void FazerVerbo(const Verbo& Qual, std::span<const Argument> Argumentos, Relato& Onde) {
+  if (PedeAjuda(Argumentos)) return AjudarComVerbo(Qual, Onde);
+  const Pedido feito = LerPedido(Argumentos, Qual.Opcoes, Onde);
+  if (Onde.Estado() == 2) return;
+  if (TemFonte(Qual, feito)) return Qual.Fazer(feito, Onde);
+  if (Onde.Estado() == 0) Onde.UsoErrado(Traduzir(Texto::FaltamArquivos));  // else all were refused
 }
 
-void Fazer(std::span<const Argument> argumentos, Relato& onde) {
-  if (argumentos.empty()) return onde.UsoErrado(Traduzir(Texto::FaltaOVerbo));
-  const std::string& primeiro = argumentos[0].Utf8;
-  if (primeiro == "--ajuda" || primeiro == "/?") return AjudarComTudo(onde);
-  if (primeiro == "--versao") return onde.Linha("tvk " TOLVARIS_VERSION);
+void Fazer(std::span<const Argument> Argumentos, Relato& Onde) {
+  if (Argumentos.empty()) return Onde.UsoErrado(Traduzir(Texto::FaltaOVerbo));
+  const std::string& primeiro = Argumentos[0].Utf8;
+  if (primeiro == "--ajuda" || primeiro == "/?") return AjudarComTudo(Onde);
+  if (primeiro == "--versao") return Onde.Linha("tvk " TOLVARIS_VERSION);
   const auto* const verbo = std::ranges::find(Verbos, primeiro, &Verbo::Nome);
-  if (verbo == std::end(Verbos)) return onde.UsoErrado(Traduzir(Texto::VerboDesconhecido, {primeiro}));
-  FazerVerbo(*verbo, argumentos.subspan(1), onde);
+  if (verbo == std::end(Verbos)) return Onde.UsoErrado(Traduzir(Texto::VerboDesconhecido, {primeiro}));
+  FazerVerbo(*verbo, Argumentos.subspan(1), Onde);
 }
 
 }  // namespace

@@ -16,8 +16,8 @@ namespace {
 class NomesVistos {
  public:
   // The file that had it before, or the empty text.
-  std::string Ver(const std::string& nome, const std::string& arquivo) {
-    const auto [visto, novo] = vistos_.emplace(platform::CharUpperBuffA(nome), arquivo);
+  std::string Ver(const std::string& Nome, const std::string& Arquivo) {
+    const auto [visto, novo] = vistos_.emplace(platform::CharUpperBuffA(Nome), Arquivo);
     return novo ? "" : visto->second;
   }
 
@@ -27,13 +27,13 @@ class NomesVistos {
 
 class Conferencia {
  public:
-  Motivos Conferir(const PacoteLido& lido) {
-    const Pacote& pacote = lido.Conteudo;
+  Motivos Conferir(const PacoteLido& Lido) {
+    const Pacote& pacote = Lido.Conteudo;
     Motivos motivos = MotivosDoConteudo(pacote);
     std::ranges::move(MotivosDosNomes(pacote.Nome, pacote.DOSName), std::back_inserter(motivos));
-    const std::string mesmoNome = nomes_.Ver(pacote.Nome, lido.Arquivo);
+    const std::string mesmoNome = nomes_.Ver(pacote.Nome, Lido.Arquivo);
     if (!mesmoNome.empty()) motivos.push_back(Traduzir(Texto::NomeDeOutro, {pacote.Nome, mesmoNome}));
-    const std::string mesmoDOS = nomesDOS_.Ver(pacote.DOSName, lido.Arquivo);
+    const std::string mesmoDOS = nomesDOS_.Ver(pacote.DOSName, Lido.Arquivo);
     if (!mesmoDOS.empty()) motivos.push_back(Traduzir(Texto::NomeDOSDeOutro, {pacote.DOSName, mesmoDOS}));
     return motivos;
   }
@@ -42,9 +42,9 @@ class Conferencia {
   NomesVistos nomes_, nomesDOS_;
 };
 
-void PorLinhas(const std::string& arquivo, const Motivos& porque, Relato& onde) {
-  if (porque.empty()) onde.Linha(LinhaCsv({arquivo, "ok", ""}));
-  for (const std::string& motivo : porque) onde.Linha(LinhaCsv({arquivo, "recusado", motivo}));
+void PorLinhas(const std::string& Arquivo, const Motivos& Porque, Relato& Onde) {
+  if (Porque.empty()) Onde.Linha(LinhaCsv({Arquivo, "ok", ""}));
+  for (const std::string& motivo : Porque) Onde.Linha(LinhaCsv({Arquivo, "recusado", motivo}));
 }
 
 }  // namespace
@@ -55,10 +55,10 @@ void Verificar(const Pedido& Feito, Relato& Onde) {
   std::size_t bons = 0, maus = 0;
   if (csv) Onde.Linha(LinhaCsv({"arquivo", "resultado", "motivo"}));
   ParaCadaPacote(
-      Feito, Onde, [&](const PacoteLido& lido) { return conferencia.Conferir(lido); },
-      [&](const std::string& arquivo, const Motivos& porque) {
-        ++(porque.empty() ? bons : maus);
-        if (csv) PorLinhas(arquivo, porque, Onde);
+      Feito, Onde, [&](const PacoteLido& Lido) { return conferencia.Conferir(Lido); },
+      [&](const std::string& Arquivo, const Motivos& Porque) {
+        ++(Porque.empty() ? bons : maus);
+        if (csv) PorLinhas(Arquivo, Porque, Onde);
       });
   if (!csv) Onde.Linha(Traduzir(Texto::PacotesVerificados, {std::to_string(bons), std::to_string(maus)}));
 }

@@ -10,17 +10,17 @@
 
 namespace {
 
-constexpr std::string_view ArquivoLocal = "PK\x03\x04", EntradaCentral = "PK\x01\x02", Fim = "PK\x05\x06";
+constexpr std::string_view ArquivoLocal = "PK\x03\x04", EntradaCentral = "PK\x01\x02", FimDeZip = "PK\x05\x06";
 constexpr std::size_t TamanhoDoFim = 22;  // bytes, without the comment
 
 // Numbers have their lowest byte first.
-void Por(std::string& texto, std::uint64_t numero, int bytes) {
-  for (int i = 0; i < bytes; ++i) texto += static_cast<char>(numero >> 8 * i & 0xFF);
+void Por(std::string& Texto, std::uint64_t Numero, int Bytes) {
+  for (int i = 0; i < Bytes; ++i) Texto += static_cast<char>(Numero >> 8 * i & 0xFF);
 }
 
-std::uint64_t Ler(std::string_view texto, std::size_t posicao, std::size_t bytes) {
+std::uint64_t Ler(std::string_view Texto, std::size_t Posicao, std::size_t Bytes) {
   std::uint64_t numero = 0;
-  for (std::size_t i = bytes; i-- > 0;) numero = numero << 8 | static_cast<unsigned char>(texto[posicao + i]);
+  for (std::size_t i = Bytes; i-- > 0;) numero = numero << 8 | static_cast<unsigned char>(Texto[Posicao + i]);
   return numero;
 }
 
@@ -36,17 +36,17 @@ struct Fluxo {
 };
 
 // Puts the content behind the text, deflated; zlib counts the bytes of one call in 32 bits.
-bool Comprimir(std::string& texto, std::string_view conteudo) {
+bool Comprimir(std::string& Texto, std::string_view Conteudo) {
   Fluxo fluxo;
-  if (!fluxo.Aberto || conteudo.size() > std::numeric_limits<std::uint32_t>::max() / 2) return false;
-  const std::size_t antes = texto.size(), cabem = deflateBound(&fluxo.Estado, static_cast<uLong>(conteudo.size()));
-  texto.resize(antes + cabem);
-  fluxo.Estado.next_in = reinterpret_cast<Bytef*>(const_cast<char*>(conteudo.data()));  // only read
-  fluxo.Estado.avail_in = static_cast<uInt>(conteudo.size());
-  fluxo.Estado.next_out = reinterpret_cast<Bytef*>(texto.data() + antes);
+  if (!fluxo.Aberto || Conteudo.size() > std::numeric_limits<std::uint32_t>::max() / 2) return false;
+  const std::size_t antes = Texto.size(), cabem = deflateBound(&fluxo.Estado, static_cast<uLong>(Conteudo.size()));
+  Texto.resize(antes + cabem);
+  fluxo.Estado.next_in = reinterpret_cast<Bytef*>(const_cast<char*>(Conteudo.data()));  // only read
+  fluxo.Estado.avail_in = static_cast<uInt>(Conteudo.size());
+  fluxo.Estado.next_out = reinterpret_cast<Bytef*>(Texto.data() + antes);
   fluxo.Estado.avail_out = static_cast<uInt>(cabem);
   const bool feito = deflate(&fluxo.Estado, Z_FINISH) == Z_STREAM_END;
-  texto.resize(antes + (feito ? cabem - fluxo.Estado.avail_out : 0));
+  Texto.resize(antes + (feito ? cabem - fluxo.Estado.avail_out : 0));
   return feito;
 }
 
@@ -57,43 +57,43 @@ struct Descricao {
   std::string_view Nome;
 };
 
-void PorDescricao(std::string& texto, const Descricao& qual) {
+void PorDescricao(std::string& Texto, const Descricao& Qual) {
   constexpr std::uint64_t versao = 20, nomeEmUtf8 = 1 << 11, deflate = 8, primeiroDeJaneiroDe1980 = 1 << 5 | 1;
-  const bool ascii = std::ranges::none_of(qual.Nome, [](char letra) { return (letra & 0x80) != 0; });
-  Por(texto, versao, 2);
-  Por(texto, ascii ? 0 : nomeEmUtf8, 2);
-  Por(texto, deflate, 2);
-  Por(texto, 0, 2);  // midnight
-  Por(texto, primeiroDeJaneiroDe1980, 2);
-  Por(texto, qual.Soma, 4);
-  Por(texto, qual.Comprimido, 4);
-  Por(texto, qual.Tamanho, 4);
-  Por(texto, qual.Nome.size(), 2);
-  Por(texto, 0, 2);  // no extra field
+  const bool ascii = std::ranges::none_of(Qual.Nome, [](char Letra) { return (Letra & 0x80) != 0; });
+  Por(Texto, versao, 2);
+  Por(Texto, ascii ? 0 : nomeEmUtf8, 2);
+  Por(Texto, deflate, 2);
+  Por(Texto, 0, 2);  // midnight
+  Por(Texto, primeiroDeJaneiroDe1980, 2);
+  Por(Texto, Qual.Soma, 4);
+  Por(Texto, Qual.Comprimido, 4);
+  Por(Texto, Qual.Tamanho, 4);
+  Por(Texto, Qual.Nome.size(), 2);
+  Por(Texto, 0, 2);  // no extra field
 }
 
-void PorEntradaCentral(std::string& zip, const Descricao& qual) {
-  const std::size_t inicio = zip.size();
-  zip += EntradaCentral;
-  Por(zip, 20, 2);  // made by: the same version, MS-DOS
-  PorDescricao(zip, qual);
+void PorEntradaCentral(std::string& Zip, const Descricao& Qual) {
+  const std::size_t inicio = Zip.size();
+  Zip += EntradaCentral;
+  Por(Zip, 20, 2);  // made by: the same version, MS-DOS
+  PorDescricao(Zip, Qual);
   constexpr std::size_t semComentarioNoInicio = 2 + 2 + 2 + 4 + 4;  // also: the first disk, no attributes
-  zip.append(semComentarioNoInicio, '\0').append(qual.Nome);
-  const std::size_t tamanho = zip.size() - inicio;
-  zip += Fim;
-  Por(zip, 0, 4);  // one disk
-  Por(zip, 1, 2);
-  Por(zip, 1, 2);
-  Por(zip, tamanho, 4);
-  Por(zip, inicio, 4);
-  Por(zip, 0, 2);  // no comment
+  Zip.append(semComentarioNoInicio, '\0').append(Qual.Nome);
+  const std::size_t tamanho = Zip.size() - inicio;
+  Zip += FimDeZip;
+  Por(Zip, 0, 4);  // one disk
+  Por(Zip, 1, 2);
+  Por(Zip, 1, 2);
+  Por(Zip, tamanho, 4);
+  Por(Zip, inicio, 4);
+  Por(Zip, 0, 2);  // no comment
 }
 
 // The directory of the archive lies before its end, with an entry at its beginning.
-bool TemDiretorio(std::string_view conteudo, std::size_t fim) {
-  const std::uint64_t entradas = Ler(conteudo, fim + 10, 2), tamanho = Ler(conteudo, fim + 12, 4);
-  const std::uint64_t inicio = Ler(conteudo, fim + 16, 4);
-  return entradas > 0 && inicio + tamanho <= fim && conteudo.substr(inicio).starts_with(EntradaCentral);
+bool TemDiretorio(std::string_view Conteudo, std::size_t Fim) {
+  const std::uint64_t entradas = Ler(Conteudo, Fim + 10, 2), tamanho = Ler(Conteudo, Fim + 12, 4);
+  const std::uint64_t inicio = Ler(Conteudo, Fim + 16, 4);
+  return entradas > 0 && inicio + tamanho <= Fim && Conteudo.substr(inicio).starts_with(EntradaCentral);
 }
 
 }  // namespace
@@ -120,7 +120,7 @@ std::optional<std::size_t> FimDoZip(std::string_view Conteudo) {
   const std::size_t ultimo = Conteudo.size() - TamanhoDoFim;
   const std::size_t primeiro = ultimo - std::min<std::size_t>(ultimo, 0xFFFF);
   for (std::size_t posicao = ultimo;; --posicao) {
-    if (Conteudo.substr(posicao).starts_with(Fim) && TemDiretorio(Conteudo, posicao)) return posicao;
+    if (Conteudo.substr(posicao).starts_with(FimDeZip) && TemDiretorio(Conteudo, posicao)) return posicao;
     if (posicao == primeiro) return std::nullopt;
   }
 }
