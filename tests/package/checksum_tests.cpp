@@ -36,17 +36,6 @@ TEST(Checksum, AddsTheValuesAtTheEndOfEveryChunk) {
   }
 }
 
-TEST(Checksum, AnyReadThatFailsLeavesNoValue) {
-  bool hasValue = false, failed = false;
-  const auto add = [&] {
-    platform::File file(Path, platform::Access::Read);
-    hasValue = cls_CRC().CRC(file).has_value();
-    failed = CallFailed();
-  };
-  const auto prepare = [] { PutFile(Path, std::string(2 * ChunkSize + 1, 'x')); };
-  EXPECT_GT(WithEachFault(prepare, add, [&] { EXPECT_NE(hasValue, failed); }), 3);  // each of three reads among them
-}
-
 // The register is all that is carried on, so any register stands for bytes that another way has taken before.
 TEST(Crc32, AllWaysAgreeOnEveryLengthWhateverTheAlignmentAndTheRegister) {
   std::vector ways = {CRC32::Atualizar, CRC32::AtualizarPorFatias};

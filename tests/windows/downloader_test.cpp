@@ -6,21 +6,7 @@ namespace {
 const std::string Path = Home + "tolvarisdownload.exe";
 constexpr ULONGLONG Soon = 2500;  // milliseconds: the program looks once a second, and this machine may be busy
 
-class Downloader : public Installation {
- protected:
-  Downloader() {
-    Set("LRom", "Zebra");
-    Start();
-  }
-
-  // The list is built again with the games, and the window can be used.
-  void ExpectBack(const Texts& games) const {
-    EXPECT_SOON_EQ(games, Entries(window->List));
-    EXPECT_SOON(window->Enabled() && window->Play.Enabled());
-    EXPECT_SOON_EQ(std::string("Tolvaris"), window->Text());
-    EXPECT_EQ(Selected(), "Zebra");
-  }
-};
+class Downloader : public Installation {};
 
 std::string Number(const Window& window) {
   return std::to_string(static_cast<int>(reinterpret_cast<intptr_t>(window.Handle())));
@@ -28,6 +14,8 @@ std::string Number(const Window& window) {
 
 TEST_F(Downloader, GivesTheWindowBackWithTheGamesThatItBrought) {
   PutStandIn("tolvarisdownload.exe");
+  Set("LRom", "Zebra");
+  Start();
   const HANDLE wake = CreateEventA(nullptr, TRUE, FALSE, "TolvarisDownload");
   Click(Download);
   EXPECT_EQ(NextCall(Path), (Call{Path + " " + Number(*window) + "@" + Number(window->List), "C:\\Ensaio"}));
@@ -38,22 +26,14 @@ TEST_F(Downloader, GivesTheWindowBackWithTheGamesThatItBrought) {
 
   SetEvent(wake);
   const ULONGLONG woken = GetTickCount64();
-  ExpectBack({"abelha", "Água Viva", "Corrida das Nuvens", "Élan", "Nave Nova", "Zebra"});
+  EXPECT_SOON_EQ((Texts{"abelha", "Água Viva", "Corrida das Nuvens", "Élan", "Nave Nova", "Zebra"}),
+                 Entries(window->List));
+  EXPECT_SOON(window->Enabled());
+  EXPECT_SOON(window->Play.Enabled());
+  EXPECT_SOON_EQ(std::string("Tolvaris"), window->Text());
+  EXPECT_EQ(Selected(), "Zebra");
   EXPECT_LT(GetTickCount64() - woken, Soon);
   CloseHandle(wake);
-}
-
-TEST_F(Downloader, ThatIsMissingOrCannotBeStartedLeavesTheWindowUsable) {
-  Click(Download);
-  EXPECT_EQ(Answer(IDOK), Of(Mensagem::SemDownloader));
-  ExpectBack(Games);
-
-  // The list that is built again shows that the attempt is over.
-  Put("tolvarisdownload.exe", "Isto não é um programa.");
-  Put("Roms\\Zorro.smc", "jogo");
-  Click(Download);
-  ExpectBack({"abelha", "Água Viva", "Corrida das Nuvens", "Élan", "Zebra", "Zorro"});
-  EXPECT_FALSE(FindMessage(*program));
 }
 
 }  // namespace

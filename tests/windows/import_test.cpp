@@ -6,7 +6,6 @@
 namespace {
 
 const Message Added = Of(Mensagem::JogoAdicionado), Replace = Of(Mensagem::JogoJaExiste);
-const Message CannotRead = Of(Mensagem::ErroAoLer), Corrupted = Of(Mensagem::JogoCorrompido);
 
 class ImportGame : public Installation {};
 
@@ -75,45 +74,6 @@ TEST_F(ImportGame, OfAPackageAsksBeforeItReplaces) {
   expected["Roms\\CORACAO.zip"] = "123456789";
   expected["Imgs\\" + name + ".gif"] = Gif(blue);
   ExpectFiles(expected, FilesIn(Home));
-}
-
-TEST_F(ImportGame, LeavesNothingOfWhatItCannotTake) {
-  const std::string checksum = "-873187034";
-  const std::string zebra = Package("Zebra", "ZEBRA", checksum, "GIF89a", "123456789");
-  const size_t romStart = zebra.size() - 9;
-  const std::string megabyte = Package("Zebra", "ZEBRA", checksum, "GIF89a", std::string(1 << 20, 'z'));
-  const struct {
-    std::string File, Content;
-    const Message* Shown;
-    int ToTheQuestion = 0;  // the answer, where it is asked whether to replace a game
-  } cases[] = {
-      {"cortado na figura.tvk", zebra.substr(0, romStart - 3), &CannotRead, IDYES},
-      {"cortado antes da rom.tvk", zebra.substr(0, romStart), &CannotRead, IDYES},
-      {"cortado na rom.tvk", zebra.substr(0, romStart + 4), &Corrupted, IDYES},
-      {"sem soma.tvk", megabyte, &CannotRead, IDYES},
-      {"rom de outro jogo.tvk", Package("Outro", "ELAN", checksum, "GIF89a", "123456789"), nullptr, IDNO},
-      {"alterado.tvk", Package("Novo", "NOVO", checksum, "GIF89a", "123456788"), &Corrupted},
-      {"cortado.tvk", Package("Novo", "NOVO", checksum, "GIF89a", "123456789").substr(0, 60), &CannotRead},
-      {"fora.tvk", Package("..\\Novo", "NOVO", checksum, "GIF89a", "123456789"), &CannotRead},
-      {"vazio.smc", "", &CannotRead},
-      {"outro.txt", "texto", nullptr},
-  };
-  Start();
-  const Files before = FilesIn(Home);
-  for (const auto& [file, content, shown, toTheQuestion] : cases) {
-    SCOPED_TRACE(file);
-    PutFile(Outside + file, content);
-    Choose(Import, Outside + file);
-    if (toTheQuestion != 0) {
-      EXPECT_EQ(Answer(toTheQuestion), Replace);
-    }
-    if (shown != nullptr) {
-      EXPECT_EQ(Answer(IDOK), *shown);
-    }
-    ExpectQuietEnd();
-    ExpectFiles(before, FilesIn(Home));
-    EXPECT_EQ(Entries(window->List), Games);
-  }
 }
 
 }  // namespace

@@ -86,17 +86,6 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   EXPECT_SOON(program->HasEnded());
 }
 
-TEST_F(Keyboard, EnterThatIsHeldPlaysOnce) {
-  Start();
-  EXPECT_SOON(window->List.Focused() && window->Play.Enabled());
-  HoldKey(VK_RETURN, 15);
-  PressKey(VK_HOME);
-  EXPECT_SOON_EQ(std::string("abelha"), Selected());
-  ExpectPlayed("ZEBRA.SMC");
-  PressKey(VK_RETURN);
-  ExpectPlayed("abelha.zip");
-}
-
 // Each key selects another game, and selecting lets pending events run.
 TEST_F(Keyboard, KeysThatWaitForEachOtherAreAllHandled) {
   constexpr int many = 100;

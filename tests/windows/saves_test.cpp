@@ -12,10 +12,9 @@ size_t FreeOnFloppy() {
   return static_cast<size_t>(available.QuadPart);
 }
 
-// A side of the manager: the files that it is to have, and what is asked before one of them is replaced or deleted.
+// A side of the manager, and the files that it is to have.
 struct Side {
   std::string Directory, CopyFromHere;
-  Mensagem MayReplace, MayDelete;
   std::vector<bool> Offered;  // for an entry of its own
   Files Expected;
 };
@@ -41,7 +40,6 @@ class Saves : public Installation {
   const SaveManager::Pane& PaneOf(const Side& side) const {
     return &side == &floppy ? manager->Floppy : manager->Computer;
   }
-  Texts EntriesOf(const Side& side) const { return Entries(PaneOf(side).List); }
 
   // Picks an entry and waits until it can be copied the right way.
   void Pick(const Side& side, const std::string& text) const {
@@ -65,67 +63,29 @@ class Saves : public Installation {
   }
 
   const FloppyDisk disk;
-  Side floppy = {"A:\\",
-                 "Copiar do disquete para o computador",
-                 Mensagem::SalvamentoNoDisquete,
-                 Mensagem::DeletarDoDisquete,
-                 FloppyOffered,
-                 {}};
-  Side computer = {Home + "Saves\\",
-                   "Copiar do computador para o disquete",
-                   Mensagem::SalvamentoNoComputador,
-                   Mensagem::DeletarDoComputador,
-                   ComputerOffered,
-                   {}};
+  Side floppy = {"A:\\", "Copiar do disquete para o computador", FloppyOffered, {}};
+  Side computer = {Home + "Saves\\", "Copiar do computador para o disquete", ComputerOffered, {}};
   std::optional<SaveManager> manager;
 };
 
-TEST_F(Saves, AreListedCopiedBothWaysAndReplacedAndDeletedOnYesOnly) {
-  OpenWith({{"agua.srm", Bytes(1, 8192)}, {"AGUA.ZST", Bytes(2, 5000)}, {"MEUJOGO.zs2", "x"}, {"leia.txt", "texto"}},
-           {{"zebra.srm", Bytes(3, 2048)}, {"ZEBRA.zs9", Bytes(4, 300'000)}, {"elan.zst", ""}});
-  for (const char* text : {" Disquete ", " Computador ", "&Fechar"}) EXPECT_TRUE(manager->Child(text)) << text;
-  EXPECT_EQ(EntriesOf(floppy), (Texts{"Água Viva", "Água Viva [State 0]", "MEUJOGO [State 2]"}));
-  EXPECT_EQ(EntriesOf(computer), (Texts{"Élan [State 0]", "Zebra", "Zebra [State 9]"}));
-  EXPECT_EQ(manager->Offered(), NothingOffered);
+// Which files are listed, and what is asked, is seen on the twin.
+TEST_F(Saves, AreCopiedFromAFloppyDiskReplacedAndDeleted) {
+  OpenWith({{"AGUA.ZST", Bytes(2, 300'000)}}, {{"AGUA.zst", "antigo"}, {"elan.zst", ""}});
+  const std::string entry = "Água Viva [State 0]";
+  EXPECT_EQ(Entries(manager->Floppy.List), Texts{entry});
+  EXPECT_EQ(Entries(manager->Computer.List), (Texts{entry, "Élan [State 0]"}));
   EXPECT_FALSE(window->Enabled());
 
-  Pick(computer, "Zebra");
-  Pick(floppy, "Água Viva [State 0]");
-  EXPECT_EQ(SelectedEntry(manager->Computer.List), "");
-  const struct {
-    Side *From, *To;
-    std::string Entry, Source, Copy;
-  } cases[] = {{&floppy, &computer, "Água Viva [State 0]", "AGUA.ZST", "AGUA.zst"},
-               {&computer, &floppy, "Zebra [State 9]", "ZEBRA.zs9", "ZEBRA.zs9"}};
-  for (const auto& [from, other, entry, source, copy] : cases) {
-    Side* const to = other;
-    const Texts before = EntriesOf(*to);
-    Pick(*from, entry);
-    manager->Copy.Click();
-    ExpectCopied(*to, copy, from->Expected[source]);
-    EXPECT_EQ(EntriesOf(*to).size(), before.size() + 1);
-
-    to->Expected[copy] = "antigo";
-    PutFile(to->Directory + copy, "antigo");
-    for (const int answer : {IDNO, IDCANCEL, IDYES}) {
-      ExpectBothSides();
-      Pick(*from, entry);
-      manager->Copy.Click();
-      EXPECT_EQ(Answer(answer), Of(to->MayReplace));
-    }
-    ExpectCopied(*to, copy, from->Expected[source]);
-    EXPECT_EQ(PaneOf(*to).Delete.Text(), "Excluir");
-    for (const int answer : {IDNO, IDCANCEL, IDYES}) {
-      ExpectBothSides();
-      Pick(*to, entry);
-      PaneOf(*to).Delete.Click();
-      EXPECT_EQ(Answer(answer), Of(to->MayDelete, entry));
-    }
-    EXPECT_SOON_EQ(before, EntriesOf(*to));
-    EXPECT_SOON_EQ(NothingOffered, manager->Offered());
-    to->Expected.erase(copy);
-    ExpectBothSides();
-  }
+  Pick(floppy, entry);
+  manager->Copy.Click();
+  EXPECT_EQ(Answer(IDYES), Of(Mensagem::SalvamentoNoComputador));
+  ExpectCopied(computer, "AGUA.zst", Bytes(2, 300'000));
+  Pick(floppy, entry);
+  manager->Floppy.Delete.Click();
+  EXPECT_EQ(Answer(IDYES), Of(Mensagem::DeletarDoDisquete, entry));
+  EXPECT_SOON_EQ(Texts(), Entries(manager->Floppy.List));
+  floppy.Expected.clear();
+  ExpectBothSides();
   manager->Close.Click();
   EXPECT_SOON(window->Enabled());
   EXPECT_SOON(!*manager);
