@@ -31,7 +31,7 @@ TEST(NewerConfiguration, NamesTheTwoDirectoriesAndKeepsEveryOtherByte) {
       {"behind the quote", "ROMPath=\"X\" ; mine\r\nSRAMPath=\"Y\"\t\r\n", r + " ; mine\r\n" + s + "\t\r\n"},
       {"no quotes, one quote", "ROMPath=C:\\R x\r\nSRAMPath=\"C:\\S\r\nb=\"1\"\r\n",
        r + "\r\n" + s + "\r\nb=\"1\"\r\n"},
-      {"a lone backslash hides no quote", "ROMPath=\"C:\\R\\\"\r\n" + s, r + "\r\n" + s},
+      {"a lone backslash hides no quote", "ROMPath=\"C:\\R\\\" ; mine\r\n" + s, r + " ; mine\r\n" + s},
       {"each line of the key", "ROMPath=\"1\"\r\n" + s + "\r\nROMPath=\"2\"\r\n", r + "\r\n" + s + "\r\n" + r + "\r\n"},
       {"a missing key is added", "x=1\r\nROMPath=\"\"", "x=1\r\n" + r + "\r\n" + s + "\r\n"},
       {"in the file's own line ends", "SRAMPath=\"\"\n", s + "\n" + r + "\n"},

@@ -1,4 +1,5 @@
 // The commands that lead to other programs and windows: play, the downloader and the save manager.
+#include "platform/keys.h"
 #include "tests/mainwindow/menu.h"
 
 namespace {
@@ -28,11 +29,17 @@ TEST_F(Play, StartsTheEmulatorWithTheShortPathAndRemembersTheGame) {
   EXPECT_EQ(States(), GameSelected);
 
   const auto writes = WriteCount(EmulatorConfig);
-  DoubleClick(form->List1);
-  PressKey(form->List1, 13);
-  PressKey(form->List1, 32);
-  EXPECT_EQ(StartedProcesses().size(), 3U);
-  EXPECT_EQ(WriteCount(EmulatorConfig), writes);  // nothing to change, nothing written
+  const std::tuple<const char*, std::function<void()>, std::size_t> ways[] = {
+      // what is done with the list, and how many games have been started then
+      {"a double click", [this] { DoubleClick(form->List1); }, 2},
+      {"Enter", [this] { PressKey(form->List1, platform::KeyEnter); }, 3},
+      {"the space bar", [this] { PressKey(form->List1, 32); }, 3},
+  };
+  for (const auto& [name, act, count] : ways) {
+    act();
+    EXPECT_EQ(StartedProcesses().size(), count) << name;
+  }
+  EXPECT_EQ(WriteCount(EmulatorConfig), writes) << "nothing to change, nothing written";
 
   const std::string fresh = "\r\nSaveDirectory = C:\\Tolvaris\\Saves\r\nGameDirectory = C:\\Tolvaris\\Roms\r\n";
   const struct {
