@@ -8,8 +8,10 @@
 
 namespace contract {
 
-// In the test program's own directory, where the last test's files are left.
+// In the test program's own directory, where the last test's files are left; with the mouse's pointer over no window of
+// a test, wherever it was left: what it is over is told so, and drawn another way.
 Machine::Machine() : here_(ProgramDirectory() + "\\Pasta de teste\\") {
+  ::SetCursorPos(0, 0);
   std::system(("rmdir /s /q \"" + here_.substr(0, here_.size() - 1) + "\"").c_str());
   EXPECT_TRUE(CreateDirectoryA(here_));
 }

@@ -22,7 +22,8 @@ TEST_F(Downloader, GivesTheWindowBackWithTheGamesThatItBrought) {
   EXPECT_FALSE(window->Enabled());
   EXPECT_EQ(window->Text(), "...");
   EXPECT_EQ(Selected(), "");
-  window->CloseByUser();  // to no effect
+  // To no effect. Only once it has been handled may the window be given back.
+  SendMessageTimeoutW(window->Handle(), WM_SYSCOMMAND, SC_CLOSE, 0, SMTO_NORMAL, Limit, nullptr);
 
   SetEvent(wake);
   const ULONGLONG woken = GetTickCount64();
