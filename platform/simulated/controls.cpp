@@ -72,9 +72,10 @@ void Control::SetToolTip(const std::string& text) {
 
 std::int32_t Control::Handle() const { return state_->Handle; }
 
-Button::Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font&) {
+Button::Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font) {
   Join(*state_, container, bounds);
   state_->Caption = caption;
+  state_->Letters = font;
 }
 
 Button::Button(const Container& container, const Bounds& bounds, int icon, const std::string& toolTip) {
@@ -95,8 +96,10 @@ void CheckBox::SetValue(int value) {
   if (IsAlive(*state_)) state_->Value = value;
 }
 
-Label::Label(const Container& container, int left, int top, const Font&, Ground) {
+Label::Label(const Container& container, int left, int top, const Font& font, Ground ground) {
   Join(*state_, container, {left, top, 0, 0});
+  state_->Letters = font;
+  state_->WhiteGround = ground == Ground::White;
 }
 
 Frame::Frame(Window& window, const Bounds& bounds, const std::string& caption) : Parent(window), Place(bounds) {

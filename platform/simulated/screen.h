@@ -14,6 +14,7 @@ namespace platform::simulated {
 // Of a window; shared with its controls, which may live longer.
 struct WindowFacts {
   Window* Self = nullptr;
+  WindowStyle Style{};
   std::string Caption;
   int Left = 0, Top = 0, Width = 0, Height = 0;
   bool Enabled = true, Shown = false, Closing = false, Closed = false;
@@ -89,6 +90,8 @@ struct ControlState {
   int Selected = -1;
   int Value = 0;
   int Icon = 0;
+  Font Letters{};
+  bool WhiteGround = false;
   Picture Shown;
 };
 

@@ -161,8 +161,12 @@ bool IsShown(const Window& window);
 Window* WindowFromHandle(std::int32_t handle);           // null when there is none
 std::vector<Control*> ControlsOf(const Window& window);  // in order of creation
 Bounds BoundsOf(const Control& control);                 // in the window's client area; a label's size is 0
-const Control* Focused();                       // the active window's control that has the keyboard focus, or null
-int IconOf(const Button& button);               // its icon's number, 0: none
+const Control* Focused();                     // the active window's control that has the keyboard focus, or null
+WindowStyle StyleOf(const Window& window);    // as it was made
+int IconOf(const Control& control);           // the number of its icon or picture, 0: none
+Font FontOf(const Control& control);          // as it was made
+bool HasWhiteGround(const Control& control);  // a label that has its own
+std::vector<std::string> EntriesOf(const ComboBox& box);
 int ResourceOf(const Picture& picture);         // the resource it came from, 0: none
 std::string ContentOf(const Picture& picture);  // the file content it came from
 std::uint32_t IntervalOf(const Timer& timer);   // milliseconds

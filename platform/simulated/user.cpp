@@ -106,7 +106,19 @@ const Control* Focused() {
   return focus && focus->Enabled() && focus->Visible() ? focus : nullptr;
 }
 
-int IconOf(const Button& button) { return button.State().Icon; }
+WindowStyle StyleOf(const Window& window) { return window.State().Facts->Style; }
+
+int IconOf(const Control& control) { return control.State().Icon; }
+
+Font FontOf(const Control& control) { return control.State().Letters; }
+
+bool HasWhiteGround(const Control& control) { return control.State().WhiteGround; }
+
+std::vector<std::string> EntriesOf(const ComboBox& box) {
+  std::vector<std::string> texts;
+  for (const ListEntry& entry : box.State().Entries) texts.push_back(entry.Text);
+  return texts;
+}
 
 std::uint32_t IntervalOf(const Timer& timer) { return timer.State().Interval; }
 

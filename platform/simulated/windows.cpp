@@ -30,6 +30,7 @@ Window::Window(const WindowStyle& style) : state_(std::make_unique<WindowState>(
   auto facts = std::make_shared<WindowFacts>();
   facts->Self = this;
   facts->Closed = TheMachine().RefusesWindows;
+  facts->Style = style;
   facts->Caption = style.Caption;
   facts->Width = style.ClientWidth + FrameWidth;
   facts->Height = style.ClientHeight + FrameHeight;
