@@ -141,16 +141,4 @@ TEST_F(Startup, ControllerHelpComesOnceBeforeTheWindow) {
   EXPECT_EQ(shown, 1);
 }
 
-TEST_F(Startup, TranslatesTheWindowAndItsMessages) {
-  PutFile(Home + "language.ini",
-          "[TOLVARIS20]\r\nJogar=Play\r\nUsar disquete para salvar o jogo=Keep saves on a floppy\r\n"
-          "Deletar jogo=Delete game\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nConfirmar deleção=Confirm\r\n"_ansi);
-  StartAndPick("Super Jogo");
-  EXPECT_EQ(TextsOf(*form),
-            "Tolvaris||Play|Keep saves on a floppy|Ler/Gravar salvamento de jogos do disquete|Baixar jogos da internet|"
-            "Importar jogo de...|Exportar jogo para...|Delete game|");
-  Click(form->Command6);
-  EXPECT_EQ(TakeMessages(), Texts{"Confirm, Yes/No/Cancel, exclamation: Delete ' Super Jogo ' now?"});
-}
-
 }  // namespace

@@ -255,20 +255,4 @@ TEST_F(Saves, AreOldOrNewButWholeWhateverCallOfThePlatformFails) {
   EXPECT_GT(warnings, 0);
 }
 
-TEST_F(Saves, AreShownAndDeletedInTheLanguageOfTheTranslation) {
-  ArquivoIdioma = "C:\\Tolvaris\\language.ini";
-  PutFile(
-      ArquivoIdioma,
-      "[TOLVARIS20]\r\nSalvamentos dos jogos=Saves\r\nExcluir=Delete\r\n Disquete =| Floppy |\r\n Computador =PC\r\n"
-      "&Fechar=&Close\r\nCopiar do computador para o disquete=To the floppy\r\n"
-      "Deletar o salvamento do jogo '=|Delete '|\r\n' que está no Computador ?=|' here?|"_ansi);
-  OpenWith([](Form4& window) {
-    Pick(window.List2, Unnamed);
-    EXPECT_EQ(TextsOf(window), "Saves| Floppy ||Delete|To the floppy|PC||Delete|&Close");
-    PressKey(window.List2, 46);
-  });
-  EXPECT_EQ(TakeMessages(), Texts{TitleOf(Mensagem::DeletarDoComputador) +
-                                  ", Yes/No/Cancel, question: Delete 'SEMNOME [State 2]' here?"});
-}
-
 }  // namespace

@@ -76,12 +76,4 @@ TEST(Messages, SayWhatTheyAlwaysSaid) {
   }
 }
 
-TEST(Messages, TranslateEachPieceByItselfAndNeverTheValue) {
-  simulated::Reset();
-  ArquivoIdioma = "C:\\language.ini";
-  simulated::PutFile(ArquivoIdioma, "[TOLVARIS20]\r\nDeletar o jogo '=Delete '\r\n' ?=' now?\r\nZebra=wrong\r\n");
-  EXPECT_EQ(TextoDaMensagem(Mensagem::DeletarJogo, "Zebra"), "Delete ' Zebra ' now?");
-  ArquivoIdioma.clear();
-}
-
 }  // namespace
