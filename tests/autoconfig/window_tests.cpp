@@ -143,15 +143,16 @@ TEST_F(Configurator, PathsAreWrittenRelativeToTheProgramOrWhole) {
     EXPECT_EQ(Stored(), (Texts{"\\Roms\\", "\\Saves\\", "\\Imgs\\", emulator, setting}));
     EXPECT_EQ(TakeMessages(), Texts());
   }
-  PutFile("C:\\E\\zsnes.cfg", "x");
-  EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\outro.exe"), "C:\\E\\zsnes.cfg") << "the one that is there";
 }
 
 TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRefused) {
-  const std::string longPath = "C:\\" + std::string(120, 'a') + "\\" + std::string(121, 'b') + "\\";
-  for (const std::string& file : {"C:\\Outro\\zsnes.exe"s, longPath + "z.exe"}) PutFile(file, WindowsProgram);
+  const std::string upTo254 = "C:\\" + std::string(120, 'a') + "\\" + std::string(119, 'b') + "\\";
+  const std::string upTo255 = "C:\\" + std::string(120, 'a') + "\\" + std::string(120, 'b') + "\\";
+  for (const std::string& directory : {"C:\\Outro\\zsne"s, upTo254, upTo255})
+    PutFile(directory + "s.exe", WindowsProgram);
   PutFile("C:\\Outro\\vazio.exe", "");
   PutFile("C:\\Outro\\dos.exe", DosProgram);
+  PutFile(upTo255 + "dos.exe", DosProgram);
   OpenAndSearch();
   for (const char* file : {"C:\\Outro\\zsnes.exe", "", "C:\\TOLVARIS\\zsnes\\ZSNESW.EXE"}) ChooseOther(file);
   EXPECT_EQ(form->List1.Count(), 2) << "nothing when it is cancelled, and nothing twice";
@@ -160,18 +161,42 @@ TEST_F(Configurator, AnotherEmulatorIsChosenWithTheDialogAndWhatCannotBeUsedIsRe
   EXPECT_EQ(asked.InitialDirectory, "C:\\Outro\\");
   EXPECT_EQ(asked.Title + asked.Filter,
             "Procurar emuladorEmulador ZSnes (zsnes*.exe)\0zsnes*.exe\0Programas (*.exe)\0*.exe\0"s);
-  for (const auto& [file, message] : {std::pair("C:\\Outro\\vazio.exe"s, Told(Mensagem::EmuladorNaoEncontrado)),
-                                      {"C:\\Outro\\dos.exe", Told(Mensagem::EmuladorDoDos, "C:\\Outro\\dos.exe")},
-                                      {longPath + "z.exe", Told(Mensagem::CaminhoLongo, longPath + "zsnesw.cfg")}}) {
+  const std::string dos = "C:\\Outro\\dos.exe", configuration = upTo255 + "zsnesw.cfg";
+  const std::string network = "\\\\servidor\\zsnes\\zsnesw.exe";
+  const std::tuple<const char*, std::string, std::string> refused[] = {
+      {"an empty file", "C:\\Outro\\vazio.exe", Told(Mensagem::EmuladorNaoEncontrado)},
+      {"a program for DOS", dos, Told(Mensagem::EmuladorDoDos, dos)},
+      {"a path of 255 characters", upTo255 + "s.exe", Told(Mensagem::CaminhoLongo, configuration)},
+      {"one for DOS at such a path", upTo255 + "dos.exe", Told(Mensagem::EmuladorDoDos, upTo255 + "dos.exe")},
+  };
+  for (const auto& [name, file, message] : refused) {
     ChooseOther(file);
     Save();
-    EXPECT_EQ(TakeMessages(), Texts{message});
-    EXPECT_EQ(Stored(), Nothing);
-    EXPECT_FALSE(form->IsClosed());
+    EXPECT_EQ(TakeMessages(), Texts{message}) << name;
+    EXPECT_EQ(Stored(), Nothing) << name;
+    EXPECT_FALSE(form->IsClosed()) << name;
   }
-  EXPECT_EQ(Impedimento(std::string(254, 'x')), std::nullopt);
-  EXPECT_EQ(Impedimento("\\\\servidor\\zsnes\\zsnesw.exe"), Mensagem::CaminhoEmRede)
-      << "read as relative to the program's directory";
+  EXPECT_EQ(Impedimento(network), Mensagem::CaminhoEmRede) << "read as relative to the program's directory";
+  ChooseOther(upTo254 + "s.exe");
+  Save();
+  EXPECT_EQ(Stored()[4], upTo254 + "zsnesw.cfg") << "a path of 254 characters";
+}
+
+TEST_F(Configurator, TheConfigurationBelongsToTheProgramsNameAndElseIsTheOneThatIsThere) {
+  const std::string forWindows = "C:\\E\\zsnesw.cfg", forDos = "C:\\E\\zsnes.cfg";
+  const std::tuple<const char*, Texts, const char*, std::string> cases[] = {
+      // the files that are there, the program, and its configuration
+      {"the name decides for Windows", {forDos}, "ZsnesW.exe", forWindows},
+      {"the name decides for DOS", {forWindows}, "ZSNES.EXE", forDos},
+      {"the only one there", {forDos}, "outro.exe", forDos},
+      {"both are there", {forDos, forWindows}, "outro.exe", forWindows},
+      {"none is there", {}, "outro.exe", forWindows},
+  };
+  for (const auto& [name, files, program, configuration] : cases) {
+    Renew();
+    for (const std::string& each : files) PutFile(each, "x");
+    EXPECT_EQ(ConfiguracaoDoEmulador("C:\\E\\"s + program), configuration) << name;
+  }
 }
 
 // The emulator's configuration file in the newer form.
@@ -180,20 +205,32 @@ const std::string After = "x=1\r\nROMPath=\"C:\\\\Tolvaris\\\\Roms\"\r\nSRAMPath
 
 TEST_F(Configurator, TheDirectoriesOfTheNewerFormAreSetOnRequest) {
   const std::string older = "SaveDirectory = C:\\S\r\n";
-  const Texts question = {Told(Mensagem::ConfiguracaoMaisNova)};
-  const std::tuple<const char*, std::string, Answer, std::string, bool> cases[] = {
-      // the file before, the answer to the question, the file afterwards, and whether the settings are written
-      {"cancelled", Before, Answer::Cancel, Before, false},  {"refused", Before, Answer::No, Before, true},
-      {"agreed", Before, Answer::Yes, After, true},          {"right already", After, Answer::Ok, After, true},
-      {"in the older form", older, Answer::Ok, older, true},
+  const std::string question = Told(Mensagem::ConfiguracaoMaisNova);
+  const std::string error = Told(Mensagem::ErroAoGravarConfiguracao, Configuration);
+  const struct {
+    const char* Name;
+    std::string Before;
+    Answer ToTheQuestion;
+    std::uint64_t Room;  // on the disk
+    Texts Shown;
+    std::string After;
+    bool Saved;  // the settings
+  } cases[] = {
+      {"cancelled", Before, Answer::Cancel, 1 << 20, {question}, Before, false},
+      {"on a full disk", Before, Answer::Yes, 0, {question, error}, Before, false},
+      {"refused", Before, Answer::No, 1 << 20, {question}, Before, true},
+      {"agreed", Before, Answer::Yes, 1 << 20, {question}, After, true},
+      {"right already", After, Answer::Ok, 1 << 20, {}, After, true},
+      {"in the older form", older, Answer::Ok, 1 << 20, {}, older, true},
   };
-  for (const auto& [name, before, answer, after, saved] : cases) {
+  for (const auto& [name, before, answer, room, shown, after, saved] : cases) {
     SCOPED_TRACE(name);
     PutFile(Configuration, before);
     OpenAndSearch();
+    SetFreeSpace('C', room);
     QueueAnswer(answer);
     Save();
-    EXPECT_EQ(TakeMessages(), before == Before ? question : Texts());
+    EXPECT_EQ(TakeMessages(), shown);
     EXPECT_EQ(Content(Configuration), after);
     EXPECT_EQ(Stored(), saved ? Defaults : Nothing);
     EXPECT_EQ(form->IsClosed(), saved);
