@@ -1,6 +1,7 @@
 // What the commands have in common when something is missing or fails, and the simplest of them: delete.
 #include <set>
 
+#include "tests/contract/small_pictures.h"
 #include "tests/mainwindow/menu.h"
 
 namespace {
@@ -14,7 +15,7 @@ TEST_F(Commands, OnWhatIsNotThereSayWhyAndLeaveEverythingAsItWas) {
       // what is missing, what play says, and what export and delete say
       {"a selection", [this] { form->List1.Select(-1); }, {}, unknown},
       {"the game's row", [this] { form->Jogos.clear(); }, unknown, unknown},
-      {"the ROM", [] { RemoveFile(Roms + "SEMFIG.SMC"); }, gone, gone},
+      {"the ROM", [] { RemoveFile(Roms + "ULTIMO.SMC"); }, gone, gone},
       {"the emulator", [] { RemoveFile(Emulator); }, {Told(Mensagem::EmuladorNaoEncontrado)}, {}},
   };
   for (const auto& [name, spoil, playSays, othersSay] : cases) {
@@ -58,6 +59,32 @@ TEST_F(Commands, OnAGameWhoseNameTheCodePageLacksUseItsShortNameOrSayWhyNot) {
       EXPECT_EQ(TakeMessages(), Texts(3, Told(Mensagem::NomeForaDoWindows)));
       EXPECT_EQ(AllFiles(), before);
     }
+  }
+}
+
+TEST_F(Commands, ThatWereRefusedLeaveTheKeyboardWhereThePersonGoesOn) {
+  const struct {
+    const char* Name;
+    platform::Button Form1::*Command;
+    bool OnTheList;  // else on the command
+    std::function<void()> Prepare = [] {};
+  } cases[] = {
+      {"an import that was cancelled", &Form1::Command4, true},
+      {"an export that was cancelled", &Form1::Command5, true},
+      {"a game that is to stay", &Form1::Command6, true},
+      {"no disk to play from", &Form1::Command1, true, [this] { form->Check1.SetValue(1); }},
+      {"no emulator", &Form1::Command1, false, [] { RemoveFile(Emulator); }},
+      {"no disk with saves", &Form1::Command2, false},
+      {"no downloader", &Form1::Command3, false},
+  };
+  for (const auto& [name, command, onTheList, prepare] : cases) {
+    SetUpMachine();
+    StartAndPick("Sem figura");
+    prepare();
+    const platform::Control &list = form->List1, &button = (*form).*command;
+    Click((*form).*command);
+    EXPECT_EQ(Focused(), onTheList ? &list : &button) << name;
+    EXPECT_EQ(Selected(), "Sem figura") << name;
   }
 }
 
@@ -130,14 +157,15 @@ TEST_F(Commands, LeaveOldOrNewFilesWhicheverCallFails) {
 }
 
 TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
+  PutFile(Imgs + "Super Jogo.gif", contract::SmallGif());
   StartAndPick("Sem figura");
   Files expected = Standing();
   const std::tuple<const char*, Answer, const char*, const char*> cases[] = {
       // the game, the answer to the question, the ROM file that goes, and the game that is selected then
       {"Sem figura", Answer::No, "", "Sem figura"},
-      {"Super Jogo", Answer::Yes, "SUPERJOG.zip", "Sem figura"},
-      {"Nome comprido", Answer::Yes, "Nome comprido.smc", "Sem figura"},
-      {"Sem figura", Answer::Yes, "SEMFIG.SMC", ""},
+      {"Sem figura", Answer::Yes, "ULTIMO.SMC", "Super Jogo"},
+      {"Nome comprido", Answer::Yes, "Nome comprido.smc", "Super Jogo"},
+      {"Super Jogo", Answer::Yes, "SUPERJOG.zip", ""},
   };
   for (const auto& [name, answer, rom, neighbour] : cases) {
     Pick(name);
@@ -147,6 +175,8 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
     EXPECT_TRUE(Standing() == expected) << name;
     EXPECT_EQ(Selected(), neighbour) << name;
     EXPECT_EQ(States(), *neighbour ? GameSelected : NothingSelected) << name;
+    const std::string picture = neighbour == "Super Jogo"s ? contract::SmallGif() : "";
+    EXPECT_EQ(ContentOf(form->Image1.ShownPicture()), picture) << name;
   }
   EXPECT_EQ(TakeMessages()[0], Told(Mensagem::DeletarJogo, "Sem figura"));
 }

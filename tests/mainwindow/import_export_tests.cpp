@@ -1,3 +1,4 @@
+#include "platform/keys.h"
 #include "tests/mainwindow/menu.h"
 
 namespace {
@@ -40,11 +41,11 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
   const std::string whole = Package("Super Jogo", "SUPERJOG", "new");  // its picture begins at byte 104
   const Files package = {{Roms + "ação.zip"_ansi, Rom},
                          {Imgs + "Ação=Jogo.gif"_ansi, "figura"},
-                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||AÇÃO=Ação=Jogo|"_ansi}};
+                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||ULTIMO=Sem figura||AÇÃO=Ação=Jogo|"_ansi}};
   const Files replaced = {{Roms + "SUPERJOG.zip", Rom}, {Imgs + "Super Jogo.gif", "new"}};
   const Files renamed = {{Roms + "SUPERJOG.zip", Rom},
                          {Imgs + "Outro.gif", "new"},
-                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura||SUPERJOG=Outro|"}};
+                         {Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||ULTIMO=Sem figura||SUPERJOG=Outro|"}};
   const std::string fresh = Package("Novo", "NOVO"), other = Package("Outro", "SUPERJOG", "new");
   const std::string anotherCase = Package("SUPER jogo", "SUPERJOG", "new");
   const std::string wrongSum = Package("Super Jogo", "SUPERJOG", "new", "987654321");
@@ -137,7 +138,7 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
   } cases[] = {
       {"a ROM", "Super Jogo", both, "C:\\x.zip", {Saved}, Rom},
       {"a package", "Super Jogo", both, "C:\\x.TvK", {Saved}, Package("Super Jogo", "SUPERJOG")},
-      {"a package without a picture", "Sem figura", smc, "C:\\x.tvk", {Saved}, Package("Sem figura", "SEMFIG", "")},
+      {"a package without a picture", "Sem figura", smc, "C:\\x.tvk", {Saved}, Package("Sem figura", "ULTIMO", "")},
       {"a package without a DOS name", "Nome comprido", smc, "C:\\x.tvk", {Saved}, Package("Nome comprido", "")},
       {"no extension", "Nome comprido", smc, "C:\\x", {Saved}, Rom},
       {"cancelled", "Super Jogo", both, "", {}, {}},
@@ -165,8 +166,13 @@ TEST_F(Export, OffersTheTypesOfAGameAndSavesItWholeOrNotAtAll) {
     each.Happens();
     Files expected = Standing();
     if (each.Left) expected[each.Target] = each.Left;
-    QueueEvent([this] { EXPECT_EQ(States(), Busy); });
+    QueueEvent([this] {
+      EXPECT_EQ(States(), Busy);
+      DoubleClick(form->List1);
+      PressKey(form->List1, platform::KeyEnter);
+    });
     ChooseFile(form->Command5, each.Target);
+    EXPECT_TRUE(StartedProcesses().empty()) << "by what was done with the list meanwhile";
     EXPECT_EQ(TakeMessages(), each.Shown);
     EXPECT_TRUE(Standing() == expected);
     EXPECT_EQ(States(), NothingSelected);  // the game commands wait for the next click

@@ -12,7 +12,7 @@ TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
   for (const char* rom : {"acao.ZIP", "z.b.zip", "outro.smc", "leiame.txt"}) PutFile(Roms + rom, Rom);
   PutFile(Roms + "oculto.smc", Rom, 0x22);
   ASSERT_TRUE(Start());
-  EXPECT_EQ(EntriesOf(form->List1), "Ação|Nome comprido|SEMFIG|Super Jogo|Super Jogo|zebra|"_ansi);
+  EXPECT_EQ(EntriesOf(form->List1), "Ação|Nome comprido|Super Jogo|Super Jogo|ULTIMO|zebra|"_ansi);
 
   ASSERT_EQ(form->Jogos.size(), 6U);
   const Jogo &first = form->Jogos[0], &unknown = form->Jogos[1];

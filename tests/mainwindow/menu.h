@@ -1,4 +1,5 @@
-// A configured installation with three games on the machine in memory, and the main window on it.
+// A configured installation with three games on the machine in memory, and the main window on it. The list shows them
+// in another order than their files have: a row of the list is none of the table's.
 #pragma once
 
 #include <map>
@@ -42,8 +43,8 @@ struct Menu : FreshMachine {
     PutText(Key, "EmuCFG", EmulatorConfig);
     PutFile(Emulator, "MZ");
     PutFile(EmulatorConfig, "x\r\nSaveDirectory = C:\\Somewhere\\else\\before\r\nGameDirectory = C:\\Old2\r\ny");
-    PutFile(Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||SEMFIG=Sem figura|");
-    for (const char* rom : {"SUPERJOG.zip", "SEMFIG.SMC", "Nome comprido.smc"}) PutFile(Roms + rom, Rom);
+    PutFile(Home + "tolvaris.dat", "|SUPERJOG=Super Jogo||ULTIMO=Sem figura|");
+    for (const char* rom : {"SUPERJOG.zip", "ULTIMO.SMC", "Nome comprido.smc"}) PutFile(Roms + rom, Rom);
     for (const char* picture : {"Super Jogo.gif", "Nome comprido.bmp"}) PutFile(Imgs + picture, "figura");
   }
 

@@ -65,6 +65,18 @@ TEST_F(Startup, SavedPositionIsRestoredOnAnyMonitorThatIsThere) {
   EXPECT_EQ(form->Top(), -1000);
 }
 
+TEST_F(Startup, TheWindowsOwnWidthAndHeightDecideWhereItStands) {
+  ASSERT_TRUE(Start());
+  EXPECT_EQ(form->Left(), (15360 - form->Width()) / 2) << "in the middle";
+  EXPECT_EQ(form->Top(), (11520 - form->Height()) / 2) << "in the middle";
+  const int last = 256 - form->Width();  // so much of it is still seen
+  PutText(Key, "pl", std::to_string(last));
+  PutText(Key, "pt", "11264");
+  ASSERT_TRUE(Start());
+  EXPECT_EQ(form->Left(), last);
+  EXPECT_EQ(form->Top(), 11264);
+}
+
 TEST_F(Startup, TakesWindowAndPathsFromTheSettings) {
   PutText(Key, "pl", "1500");
   PutText(Key, "pt", "3000");
