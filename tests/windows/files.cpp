@@ -29,13 +29,6 @@ void PutFile(const std::string& path, const std::string& content) {
   EXPECT_TRUE((std::ofstream(path, std::ios::binary) << content).flush()) << "cannot write " << path;
 }
 
-HeldFile::HeldFile(const std::string& path)
-    : handle_(CreateFileA(path.c_str(), GENERIC_READ, 0, nullptr, OPEN_EXISTING, 0, nullptr)) {
-  EXPECT_NE(handle_, INVALID_HANDLE_VALUE) << path;
-}
-
-HeldFile::~HeldFile() { CloseHandle(handle_); }
-
 Files FilesIn(const std::string& directory) {
   Files files;
   std::error_code missing;

@@ -12,18 +12,6 @@ std::string ContentOf(const std::string& path);
 // Writes a file; the directories on its way are created.
 void PutFile(const std::string& path, const std::string& content);
 
-// While it lives, no other program can open the file.
-class HeldFile {
- public:
-  explicit HeldFile(const std::string& path);
-  ~HeldFile();
-  HeldFile(const HeldFile&) = delete;
-  HeldFile& operator=(const HeldFile&) = delete;
-
- private:
-  HANDLE handle_;
-};
-
 // Contents by name. A directory without anything is there too, with a backslash behind its name.
 using Files = std::map<std::string, std::string>;
 

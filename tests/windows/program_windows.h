@@ -40,6 +40,5 @@ struct SaveManager : Window {
   const Pane Floppy = {ChildAt(240, 480), ChildAt(3060, 2760)}, Computer = {ChildAt(4440, 480), ChildAt(7260, 2760)};
 };
 
-inline const std::vector<bool> NothingOffered = {false, false, false};
 inline const std::vector<bool> FloppyOffered = {true, true, false};
 inline const std::vector<bool> ComputerOffered = {false, true, true};
