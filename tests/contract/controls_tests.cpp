@@ -10,7 +10,7 @@ using namespace contract;
 
 using Texts = std::vector<string>;
 
-constexpr const char* Untouched = "/-1/0/0";
+constexpr const char* Untouched = "| row -1, unchecked, choice 0";
 
 class Controls : public AllControls {};
 
@@ -55,10 +55,10 @@ TEST_F(Controls, SelectionInCodeIsSilentAndNeverGuesses) {
   combo.Select(1);
   check.SetValue(1);
   RunPendingEvents();
-  EXPECT_EQ(Seen(), "/1/1/1");
+  EXPECT_EQ(Seen(), "| row 1, checked, choice 1");
   list.Clear();
   RunPendingEvents();
-  EXPECT_EQ(Seen(), "/-1/1/1");
+  EXPECT_EQ(Seen(), "| row -1, checked, choice 1");
   EXPECT_EQ(list.Count(), 0);
 }
 
@@ -83,8 +83,8 @@ TEST_F(Controls, HandActsOnWhatTakesInputOnly) {
   EXPECT_FALSE(window.IsClosed());
   EXPECT_FALSE(window.Enabled());
   window.Enable(true);
-  EXPECT_EQ(act(), "list button image /1/1/0");
-  EXPECT_EQ(act(), "list button image /1/0/0");
+  EXPECT_EQ(act(), "list button image | row 1, checked, choice 0");
+  EXPECT_EQ(act(), "list button image | row 1, unchecked, choice 0");
 }
 
 TEST_F(Controls, AHeldKeyIsToldOnceAndGoesOnMovingTheSelection) {
@@ -92,10 +92,10 @@ TEST_F(Controls, AHeldKeyIsToldOnceAndGoesOnMovingTheSelection) {
   list.OnKeyDown = [this](int key) { clicks += std::to_string(key) + " "; };
   list.Select(0);
   HoldKey(list, down, 1);
-  EXPECT_EQ(Seen(), "40 list list /2/0/0");
+  EXPECT_EQ(Seen(), "40 list list | row 2, unchecked, choice 0");
   for (int press = 0; press < 2; ++press) {
     HoldKey(list, enter, 20);
-    EXPECT_EQ(Seen(), "13 /2/0/0");
+    EXPECT_EQ(Seen(), "13 | row 2, unchecked, choice 0");
   }
 }
 
@@ -125,7 +125,7 @@ TEST_F(Controls, ClosingRunsUnloadOnceAndLeavesTheLastAnswers) {
   }
   window.Show();
   window.ShowModal();
-  EXPECT_EQ(Seen(), "unload /1/1/0");
+  EXPECT_EQ(Seen(), "unload | row 1, checked, choice 0");
   EXPECT_EQ(TextsOf(list), (Texts{"A", "B", "C"}));
   EXPECT_EQ(button.Caption(), "&Jogar");
 }
@@ -144,7 +144,7 @@ TEST_F(Controls, ModalWindowTakesAllInputUntilItIsClosed) {
   EXPECT_TRUE(modal.IsClosed());
   EXPECT_TRUE(window.Enabled());
   EXPECT_FALSE(window.IsClosed());
-  EXPECT_EQ(Seen(), "inside /-1/0/0");
+  EXPECT_EQ(Seen(), "inside | row -1, unchecked, choice 0");
 }
 
 // The first window made is the main one. It is closed while events run inside a handler, deep in the loop.

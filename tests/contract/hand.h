@@ -42,8 +42,9 @@ class AllControls : public Machine {
 
   // The handlers that ran since it was asked last, and what the list, the check box and the combo box say.
   string Seen() {
-    for (const int value : {list.Selected(), check.Value(), combo.Selected()}) clicks += "/" + std::to_string(value);
-    return std::exchange(clicks, "");
+    const string box = check.Value() == 1 ? "checked" : "unchecked";
+    return std::exchange(clicks, "") + "| row " + std::to_string(list.Selected()) + ", " + box + ", choice " +
+           std::to_string(combo.Selected());
   }
 
   Window window{{.Caption = "Teste", .ClientWidth = 7500, .ClientHeight = 4500}};

@@ -156,7 +156,7 @@ TEST_F(NativeWindow, TakesAMessageWithoutWhatItShouldPointTo) {
   ::SendMessageA(window.State().Handle, WM_NCCREATE, 0, reinterpret_cast<LPARAM>(&another));
   EXPECT_EQ((Bounds{window.Left(), window.Top(), window.Width(), window.Height()}), before);
   Click(button);
-  EXPECT_EQ(Seen(), "button /-1/0/0");
+  EXPECT_EQ(Seen(), "button | row -1, unchecked, choice 0");
 }
 
 TEST_F(NativeWindow, IsDrawnAlsoWhereEventsBringNoOthers) {
