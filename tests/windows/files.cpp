@@ -43,7 +43,11 @@ Files FilesIn(const std::string& directory) {
 void ExpectFiles(const Files& expected, const Files& found) {
   for (const auto& [name, content] : found) EXPECT_TRUE(expected.contains(name)) << name << " should not be there";
   for (const auto& [name, content] : expected) {
-    EXPECT_TRUE(found.contains(name) && found.at(name) == content) << name << " is missing or has other bytes";
+    if (!found.contains(name)) {
+      ADD_FAILURE() << name << " is missing";
+    } else {
+      EXPECT_TRUE(found.at(name) == content) << name << " has other bytes";
+    }
   }
 }
 

@@ -61,7 +61,8 @@ void Installation::Start() {
 
 void Installation::Select(const std::string& game) const {
   ClickEntry(window->List, game);
-  EXPECT_SOON(window->Pictures[Export].Enabled() && window->Pictures[Delete].Enabled());
+  EXPECT_SOON(window->Pictures[Export].Enabled());
+  EXPECT_SOON(window->Pictures[Delete].Enabled());
 }
 
 void Installation::Choose(Command command, const std::string& path) const {

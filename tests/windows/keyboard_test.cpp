@@ -68,7 +68,8 @@ TEST_F(Keyboard, PlaysAndKeepsTheCollectionInTheMainWindow) {
   FileDialog(*program).Enter(Outside + "novo.smc");
   EXPECT_EQ(Press(VK_SPACE), Of(Mensagem::JogoAdicionado));
   EXPECT_SOON_EQ(std::string("novo"), Selected());
-  EXPECT_SOON(window->List.Focused() && pictures[Export].Enabled());
+  EXPECT_SOON(window->List.Focused());
+  EXPECT_SOON(pictures[Export].Enabled());
   Use(pictures[Export], VK_RETURN);
   FileDialog(*program).Enter(Outside + "copia.smc");
   EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::ArquivoSalvo));
@@ -92,7 +93,8 @@ TEST_F(Keyboard, KeysThatWaitForEachOtherAreAllHandled) {
   for (int i = 0; i <= many; ++i) Put("Roms\\jogo " + std::to_string(1000 + i) + ".smc", "jogo");
   Set("LRom", "jogo 1000");
   Start();
-  EXPECT_SOON(window->List.Focused() && window->Play.Enabled());
+  EXPECT_SOON(window->List.Focused());
+  EXPECT_SOON(window->Play.Enabled());
   const auto waiting = [&](WORD key) {
     for (int i = 0; i < many; ++i) PostMessageW(window->List.Handle(), WM_KEYDOWN, key, 1);
   };
