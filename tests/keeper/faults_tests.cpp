@@ -27,8 +27,8 @@ TEST_F(Faults, LeaveOldOrNewFilesAndAreTold) {
        {"instalar", "--instalacao", "C:\\T", "--substituir", "C:\\p.tvk"},
        {"C:\\T\\Roms\\", "C:\\T\\Imgs\\"}},
   };
-  for (const auto& [name, arguments, directories] : verbs) {
-    SCOPED_TRACE(name);
+  for (const auto& verb : verbs) {
+    SCOPED_TRACE(verb.Name);
     Files before, after;
     Outcome told{};
     const auto prepare = [&] {
@@ -45,13 +45,13 @@ TEST_F(Faults, LeaveOldOrNewFilesAndAreTold) {
       PutFile("C:\\T\\Imgs\\Super Jogo.gif", Picture);
       before = Standing();
     };
-    const auto operate = [&] { told = RunTvk(arguments); };
+    const auto operate = [&] { told = RunTvk(verb.Arguments); };
     const auto check = [&] {
       for (const auto& [path, content] : after) {
         EXPECT_TRUE(Content(path) == content || told.Status == 1) << path << " is not told of";
       }
       EXPECT_EQ(OpenFiles(), 0U);
-      EXPECT_EQ(Leftovers(directories), Texts{});
+      EXPECT_EQ(Leftovers(verb.Directories), Texts{});
       for (const bool cut : {false, true}) {
         if (cut) CutPower();
         for (const auto& [path, content] : Standing()) {
