@@ -6,6 +6,7 @@
 #include "platform/processes.h"
 #include "tests/contract/machine.h"
 
+// NOLINTNEXTLINE(readability-identifier-naming): the linker has named it.
 extern "C" decltype(&::CreateProcessA) __imp_CreateProcessA;  // where the program's calls of the function lead
 
 namespace {

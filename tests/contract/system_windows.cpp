@@ -5,8 +5,10 @@
 #include "platform/windows/system_library.h"
 #include "tests/contract/replaced_import.h"
 
+// NOLINTBEGIN(readability-identifier-naming): as Windows spells them.
 extern void* ImportOfLoadLibraryExA asm("__imp_LoadLibraryExA");
 extern void* ImportOfLoadLibraryExW asm("__imp_LoadLibraryExW");
+// NOLINTEND(readability-identifier-naming)
 
 // Such addresses may be written only while somebody says so.
 void contract::ReplacedImport::Set(void* function) {
