@@ -2,7 +2,6 @@
 #include <windows.h>
 
 #include <memory>
-#include <string_view>
 #include <utility>
 
 #include "platform/files.h"
@@ -41,22 +40,23 @@ bool FindNext(const FindHandle& find, WIN32_FIND_DATAW& data) {
 
 // The wide structure holds every name, where that of ANSI has 260 bytes and fails at a longer one.
 DirectoryEntry EntryOf(const WIN32_FIND_DATAW& data) {
-  DirectoryEntry entry{NameToAnsi(data.cFileName), NameToAnsi(data.cAlternateFileName)};
-  entry.IsExact = ToWide(entry.Name) == data.cFileName;
-  if (ToWide(entry.ShortName) != data.cAlternateFileName) entry.ShortName.clear();
-  return entry;
+  AnsiName name = NameToAnsi(data.cFileName), shorter = NameToAnsi(data.cAlternateFileName);
+  if (!shorter.IsExact) shorter.Text.clear();
+  return {std::move(name.Text), std::move(shorter.Text), name.IsExact};
 }
 
-// What a directory holds, as far as it is wanted, in the order of the names. A path without its last backslash would
-// list what begins with the directory's name beside it.
+// What a directory holds of a kind (those attributes of NotListed), as far as its name is wanted, in the order of the
+// names. A path without its last backslash would list what begins with the directory's name beside it.
 template <typename Wanted>
-std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& wanted) {
+std::vector<DirectoryEntry> Collect(const std::string& directory, DWORD kind, const Wanted& wanted) {
   std::vector<DirectoryEntry> found;
   if (!directory.ends_with('\\') && !directory.ends_with('/')) return found;
   WIN32_FIND_DATAW data;
   const FindHandle find = FindFirst(directory + "*", data);
   for (bool more = find != nullptr; more; more = FindNext(find, data)) {
-    if (wanted(data)) found.push_back(EntryOf(data));
+    if ((data.dwFileAttributes & NotListed) != kind) continue;
+    DirectoryEntry entry = EntryOf(data);
+    if (wanted(entry.Name)) found.push_back(std::move(entry));
   }
   std::vector<const std::string*> names;
   names.reserve(found.size());
@@ -66,11 +66,6 @@ std::vector<DirectoryEntry> Collect(const std::string& directory, const Wanted& 
   entries.reserve(found.size());
   for (const std::size_t place : InOrder(names)) entries.push_back(std::move(found[place]));
   return entries;
-}
-
-bool IsSubdirectory(const WIN32_FIND_DATAW& data) {
-  const std::wstring_view name = data.cFileName;
-  return (data.dwFileAttributes & NotListed) == FILE_ATTRIBUTE_DIRECTORY && name != L"." && name != L"..";
 }
 
 bool HasWildcard(const std::string& path) {
@@ -85,15 +80,14 @@ bool HasWildcard(const std::string& path) {
 // find "a.zipx", and which would read the directory anew for each pattern.
 std::vector<DirectoryEntry> ListDirectory(const std::string& directory, const std::string& patterns) {
   const std::string wanted = CharUpperBuffA(patterns);
-  return Collect(directory, [&](const WIN32_FIND_DATAW& data) {
-    return (data.dwFileAttributes & NotListed) == 0 &&
-           MatchesAnyPattern(CharUpperBuffA(NameToAnsi(data.cFileName)), wanted);
-  });
+  return Collect(directory, 0,
+                 [&](const std::string& name) { return MatchesAnyPattern(CharUpperBuffA(name), wanted); });
 }
 
 std::vector<std::string> ListSubdirectories(const std::string& directory) {
   std::vector<std::string> names;
-  for (const DirectoryEntry& each : Collect(directory, IsSubdirectory)) {
+  const auto isNeitherSelfNorParent = [](const std::string& name) { return name != "." && name != ".."; };
+  for (const DirectoryEntry& each : Collect(directory, FILE_ATTRIBUTE_DIRECTORY, isNeitherSelfNorParent)) {
     if (!each.PathName().empty()) names.push_back(each.PathName());
   }
   return names;

@@ -16,8 +16,8 @@ void RaiseFirst(char* text, std::size_t length) {
   }
   std::wstring letter = Decode(CP_ACP, MB_ERR_INVALID_CHARS, {text, length});
   ::CharUpperBuffW(letter.data(), static_cast<DWORD>(letter.size()));
-  const std::string raised = NameToAnsi(letter);
-  if (raised.size() == length && raised != "?") raised.copy(text, length);
+  const AnsiName raised = NameToAnsi(letter);
+  if (raised.IsExact && raised.Text.size() == length) raised.Text.copy(text, length);
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include <windows.h>
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/letters.h"
 #include "platform/text.h"
@@ -22,9 +23,15 @@ std::string Encode(std::wstring_view wide) {
   return text;
 }
 
-std::string Convert(std::wstring_view wide, char (*missing)(char32_t)) {
+// Every ANSI code page has the characters of ASCII, at their places.
+bool IsAscii(std::wstring_view wide) {
+  return std::all_of(wide.begin(), wide.end(), [](wchar_t unit) { return unit < 0x80; });
+}
+
+AnsiName Convert(std::wstring_view wide, char (*missing)(char32_t)) {
+  if (IsAscii(wide)) return {std::string(wide.begin(), wide.end()), true};
   std::string text = Encode(wide);
-  if (ToWide(text) == wide) return text;
+  if (ToWide(text) == wide) return {std::move(text), true};
   text.clear();
   while (!wide.empty()) {
     const bool pair = wide.size() > 1 && IS_SURROGATE_PAIR(wide[0], wide[1]);
@@ -33,7 +40,7 @@ std::string Convert(std::wstring_view wide, char (*missing)(char32_t)) {
     text += ToWide(converted) == character ? converted : std::string(1, missing(wide[0]));
     wide.remove_prefix(character.size());
   }
-  return text;
+  return {std::move(text), false};
 }
 
 }  // namespace
@@ -83,9 +90,9 @@ std::wstring ToShown(std::string_view text) {
   return wide;
 }
 
-std::string ToAnsi(std::wstring_view wide) { return Convert(wide, WithoutAccent); }
+std::string ToAnsi(std::wstring_view wide) { return Convert(wide, WithoutAccent).Text; }
 
-std::string NameToAnsi(std::wstring_view wide) {
+AnsiName NameToAnsi(std::wstring_view wide) {
   return Convert(wide, [](char32_t) { return '?'; });
 }
 

@@ -29,7 +29,11 @@ std::string ToAnsi(std::wstring_view wide);
 
 // The same for the name of a file, with "?" for all that the code page lacks: a letter that only looks like the one
 // meant would name another file.
-std::string NameToAnsi(std::wstring_view wide);
+struct AnsiName {
+  std::string Text;
+  bool IsExact;  // it converts back to the very name
+};
+AnsiName NameToAnsi(std::wstring_view wide);
 
 // To UTF-8; half a character becomes the replacement character.
 std::string Utf8Of(std::wstring_view wide);
