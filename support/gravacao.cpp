@@ -111,14 +111,11 @@ Substituicao::Substituicao(const std::string& Caminho, std::string_view Conteudo
 
 // Without room for all of it, what there is of it gives its room back at once.
 Substituicao::Estado Substituicao::Preparar() {
-  platform::File& arquivo = aoLado_.Arquivo();
-  if (!arquivo.Write(0, conteudo_)) {
+  if (!aoLado_.Arquivo().Write(0, conteudo_)) {
     aoLado_.Desistir();
     return Estado::SemLugar;
   }
-  const bool gravado = arquivo.Flush();
-  arquivo.Close();
-  return gravado ? Estado::AoLado : Estado::Recusada;
+  return aoLado_.Arquivo().Flush() ? Estado::AoLado : Estado::Recusada;
 }
 
 bool Substituicao::Concluir() {

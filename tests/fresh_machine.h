@@ -21,6 +21,7 @@ using Texts = std::vector<std::string>;
 // A test on a fresh machine, with the program's texts as they are there.
 struct FreshMachine : testing::Test {
   FreshMachine() { Renew(); }
+  ~FreshMachine() override { EXPECT_EQ(OpenRegistryHandles(), 0U); }
 
   static void Renew() {
     Reset();

@@ -58,6 +58,21 @@ TEST_F(Installing, ReplacesADifferentGameOnRequestOnly) {
   }
 }
 
+TEST_F(Installing, AGameThatIsThereUnderAnotherNameGetsItsOwn) {
+  PutFile(Catalogue, "|UM=Outro|");
+  PutFile(Target + "Roms\\UM.zip", Rom);
+  PutFile(Target + "Imgs\\Um Jogo.gif", Picture);
+  EXPECT_EQ(Install().Output, "dois      Ação\nUM        Um Jogo\n");
+}
+
+TEST_F(Installing, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
+  const Texts halves = {Target + "Roms\\x.0f3a99c2.novo~", Target + "Imgs\\x.0f3a99c2.novo~"};
+  for (const std::string& half : halves) PutFile(half, "half");
+  PassTime(3601);
+  EXPECT_EQ(Install().Status, 0);
+  for (const std::string& half : halves) EXPECT_FALSE(Content(half)) << half;
+}
+
 TEST_F(Installing, ThePersonsOwnCollectionIsThatOfTheSettings) {
   const Texts arguments = {"instalar", "C:\\p\\um.tvk"};
   EXPECT_EQ(RunTvk(arguments),

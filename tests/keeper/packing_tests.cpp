@@ -41,6 +41,17 @@ TEST_F(Packing, GivesTheSameBytesAndWritesThemOnce) {
   EXPECT_EQ(RunTvk(arguments).Output.substr(0, 27), "SUPEP7PV  p\\Super Jogo.tvk\n");
 }
 
+TEST_F(Packing, TakesAwayWhatAnEarlierRunHasLeftHalfWritten) {
+  PutGame("ZEBRA.smc");
+  for (const char* half : {"x.tvk.0f3a99c2.novo~", "p\\x.tvk.0f3a99c2.novo~"}) PutFile(Home + half, "half");
+  PassTime(3601);
+  EXPECT_EQ(RunTvk({"criar", "--saida", "p", "ZEBRA.smc"}).Status, 0);
+  EXPECT_FALSE(Content(Home + "p\\x.tvk.0f3a99c2.novo~"));
+  EXPECT_TRUE(Content(Home + "x.tvk.0f3a99c2.novo~")) << "in another directory";
+  EXPECT_EQ(RunTvk({"criar", "ZEBRA.smc"}).Status, 0);
+  EXPECT_FALSE(Content(Home + "x.tvk.0f3a99c2.novo~"));
+}
+
 TEST_F(Packing, AnArchiveStaysButForAByteWhereItHasNoChecksum) {
   const std::string zip = FazerZip("x.smc", Rom).value_or("");
   // One whose end lies at a whole MiB: what stands before the directory is longer.

@@ -1,4 +1,5 @@
 // Tables, archives and DOS names: functions of texts.
+#include "keeper/codificacao.h"
 #include "keeper/csv.h"
 #include "keeper/nome_dos.h"
 #include "keeper/zip.h"
@@ -61,6 +62,26 @@ TEST(Zip, OfOthersIsTakenOnlyWholeAndItsCommentGrows) {
   EXPECT_FALSE(FimDoZip(noEntry));
 }
 
+// What is not UTF-8 is in the code page.
+TEST(Encoding, IsToldFromTheBytes) {
+  Reset();
+  const struct {
+    const char *Name, *Content, *Utf8;
+  } cases[] = {
+      {"a mark", "\xEF\xBB\xBFx", "x"},
+      {"ASCII", "x", "x"},
+      {"two bytes", "\xC2\x80\xDF\xBF", "\xC2\x80\xDF\xBF"},
+      {"three bytes", "\xE0\xA0\x80\xEF\xBF\xBF", "\xE0\xA0\x80\xEF\xBF\xBF"},
+      {"four bytes", "\xF0\x90\x80\x80\xF4\x8F\xBF\xBF", "\xF0\x90\x80\x80\xF4\x8F\xBF\xBF"},
+      {"a letter of the code page", "\xE7x", "\xC3\xA7x"},
+      {"two of them", "\xC3\xC3", "\xC3\x83\xC3\x83"},
+      {"the first byte alone, at the end", "x\xC3", "x\xC3\x83"},
+      {"a byte that begins nothing", "\xBF\xC1\xBF", "\xC2\xBF\xC3\x81\xC2\xBF"},
+      {"five bytes", "\xF5\xBF\xBF\xBF", "\xC3\xB5\xC2\xBF\xC2\xBF\xC2\xBF"},
+  };
+  for (const auto& [name, content, utf8] : cases) EXPECT_EQ(EmUtf8(content), utf8) << name;
+}
+
 TEST(DosNames, StayWhereTheyCanAndElseComeFromTheName) {
   Reset();
   const struct {
@@ -68,7 +89,7 @@ TEST(DosNames, StayWhereTheyCanAndElseComeFromTheName) {
   } cases[] = {
       {"zebra", "ZEBRA"},          {"A_B-9876", "A_B-9876"}, {"123456789", "1234CXRL"}, {"Super Jogo", "SUPEP7PV"},
       {"Ação Máxima", "ACAOCBUM"}, {"con", "CONCFB5"},       {"a.b", "ABFZZT"},         {"!", "XNZA"},
-      {"Ünïcødé ß", "UNICE6FR"},
+      {"Ünïcødé ß", "UNICE6FR"},   {"a é", "AEP6LD"},
   };
   for (const auto& [name, dosName] : cases) EXPECT_EQ(FazerNomeDOS(platform::FromUtf8(name)), dosName) << name;
 }

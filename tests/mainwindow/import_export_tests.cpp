@@ -99,7 +99,10 @@ TEST_F(Import, TakesAFileWholeOrLeavesItOutAndSaysSo) {
     Files expected = Standing();
     for (const auto& [path, content] : each.New) expected[path] = content;
     each.Happens();
-    QueueEvent([this] { EXPECT_EQ(States(), Busy); });
+    QueueEvent([this] {
+      EXPECT_EQ(States(), Busy);
+      EXPECT_TRUE(ShownFileDialogs().empty()) << "the dialog opens in front of buttons that are grey already";
+    });
     ChooseFile(form->Command4, each.Path);
     EXPECT_EQ(TakeMessages(), each.Shown);
     EXPECT_TRUE(Standing() == expected);

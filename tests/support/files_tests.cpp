@@ -157,6 +157,16 @@ TEST_F(Files, ThatCannotBeWrittenStayAndWhatDeletingAndWritingCouldDoIsDone) {
   }
 }
 
+TEST_F(Files, AreNotWrittenInPlaceWhereWhatLiesBesideThemDoesNotReachTheDisk) {
+  PutFile(Target, "velho");
+  const auto writes = WriteCount(Target);
+  FailCall(3);  // behind making the file beside it and writing it
+  EXPECT_EQ(GravarArquivo(Target, "novo", 1, true), -1);
+  EXPECT_TRUE(CallFailed());
+  EXPECT_EQ(Content(Target), "velho");
+  EXPECT_EQ(WriteCount(Target), writes);
+}
+
 TEST_F(Files, HalfWrittenOnesGoWhenTheyAreOldAndNobodysAndThePersonsOwnStay) {
   const struct {
     const char *Name, *File;

@@ -38,6 +38,11 @@ TEST_F(Registry, AValueIsReadByItsTypeAndKeepsItWhenItIsSet) {
   EXPECT_EQ(Settings.GetValue(Root, "Software\\Outro", "text"), Valor());
 }
 
+TEST_F(Registry, AValueBringsTheKeysOnItsPathAndNoOthers) {
+  EXPECT_TRUE(Settings.SetValue(Root, "\\Um\\Dois\\Três"_ansi, "a", "b"));
+  EXPECT_EQ(Keys(), (Texts{"Um", "Um\\Dois", "Um\\Dois\\Três"_ansi}));
+}
+
 TEST_F(Registry, AKeyThatIsDeniedHoldsNothingAndStays) {
   PutText(Key, "LRom", "Jogo");
   DenyKey(Key);

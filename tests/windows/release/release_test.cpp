@@ -67,7 +67,8 @@ void RefuseWriteProtected(const std::string& directory) {
   button(IDOK).Click();
   ASSERT_SOON(button(IDRETRY));
   const std::string told = Answer(program, IDCANCEL).Text;
-  EXPECT_TRUE(told.starts_with("This file is write-protected.") && told.ends_with(file)) << told;
+  EXPECT_TRUE(told.starts_with("This file is write-protected.")) << told;
+  EXPECT_TRUE(told.ends_with(file)) << told;
   SetFileAttributesA(file.c_str(), FILE_ATTRIBUTE_NORMAL);
 }
 
