@@ -2,13 +2,12 @@
 #include <windows.h>
 
 #include <algorithm>
-#include <utility>
 #include <vector>
 
 #include "tests/contract/machine.h"
+#include "tests/contract/replaced_import.h"
 
-extern "C" decltype(&::FindNextFileW) __imp_FindNextFileW;  // NOLINT(readability-identifier-naming): the linker's;
-                                                            // where the program's calls of the function lead
+extern void* importOfFindNextFileW asm("__imp_FindNextFileW");
 
 namespace {
 
@@ -16,10 +15,10 @@ using namespace contract;
 
 // How many calls from the second one on fail, and how many were made.
 int failing = 0, calls = 0;
-decltype(&::FindNextFileW) original = nullptr;
+const auto Original = reinterpret_cast<decltype(&::FindNextFileW)>(importOfFindNextFileW);
 
 BOOL WINAPI FindNextFileThatFails(HANDLE find, LPWIN32_FIND_DATAW data) {
-  if (++calls == 1 || calls > failing + 1) return original(find, data);
+  if (++calls == 1 || calls > failing + 1) return Original(find, data);
   ::SetLastError(ERROR_FILENAME_EXCED_RANGE);
   return FALSE;
 }
@@ -29,17 +28,16 @@ class BrokenListings : public Machine {
   BrokenListings() {
     failing = 0;
     for (const char* name : {"a.zip", "b.zip", "c.zip"}) Put(here_ + name);
-    DWORD access = 0;
-    ::VirtualProtect(&__imp_FindNextFileW, sizeof original, PAGE_READWRITE, &access);
-    original = std::exchange(__imp_FindNextFileW, FindNextFileThatFails);
   }
-  ~BrokenListings() override { __imp_FindNextFileW = original; }
 
   std::size_t Listed(int failingCalls) const {
     failing = failingCalls;
     calls = 0;
     return ListDirectory(here_, "*").size();
   }
+
+ private:
+  const ReplacedImport failing_{importOfFindNextFileW, &FindNextFileThatFails};
 };
 
 TEST_F(BrokenListings, GoOnBehindAnEntryThatFailsAndEndWhereEverythingDoes) {

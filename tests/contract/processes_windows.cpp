@@ -5,9 +5,9 @@
 
 #include "platform/processes.h"
 #include "tests/contract/machine.h"
+#include "tests/contract/replaced_import.h"
 
-// NOLINTNEXTLINE(readability-identifier-naming): the linker has named it.
-extern "C" decltype(&::CreateProcessA) __imp_CreateProcessA;  // where the program's calls of the function lead
+extern void* importOfCreateProcessA asm("__imp_CreateProcessA");
 
 namespace {
 
@@ -23,9 +23,7 @@ BOOL WINAPI CreateProcessThatFails(LPCSTR, LPSTR, LPSECURITY_ATTRIBUTES, LPSECUR
 
 // Wine starts every program, whatever it asks for.
 TEST(Elevation, IsToldApartFromOtherFailures) {
-  DWORD access = 0;
-  ::VirtualProtect(&__imp_CreateProcessA, sizeof __imp_CreateProcessA, PAGE_READWRITE, &access);
-  const auto original = std::exchange(__imp_CreateProcessA, CreateProcessThatFails);
+  const ReplacedImport refusing(importOfCreateProcessA, &CreateProcessThatFails);
   for (const auto& [error, needed] :
        {std::pair<DWORD, bool>(740, true), {ERROR_BAD_EXE_FORMAT, false}, {ERROR_ACCESS_DENIED, false}}) {
     failure = error;
@@ -33,7 +31,6 @@ TEST(Elevation, IsToldApartFromOtherFailures) {
     EXPECT_FALSE(process.Started());
     EXPECT_EQ(process.NeedsElevation(), needed) << error;
   }
-  __imp_CreateProcessA = original;
 }
 
 }  // namespace

@@ -5,10 +5,8 @@
 #include "platform/windows/system_library.h"
 #include "tests/contract/replaced_import.h"
 
-// NOLINTBEGIN(readability-identifier-naming): as Windows spells them.
-extern void* ImportOfLoadLibraryExA asm("__imp_LoadLibraryExA");
-extern void* ImportOfLoadLibraryExW asm("__imp_LoadLibraryExW");
-// NOLINTEND(readability-identifier-naming)
+extern void* importOfLoadLibraryExA asm("__imp_LoadLibraryExA");
+extern void* importOfLoadLibraryExW asm("__imp_LoadLibraryExW");
 
 // Such addresses may be written only while somebody says so.
 void contract::ReplacedImport::Set(void* function) {
@@ -40,7 +38,7 @@ HMODULE WINAPI LoadAsWindows7Wide(LPCWSTR name, HANDLE, DWORD flags) {
 }
 
 TEST(SystemLibraries, AreLoadedAlsoByWindows7WithoutItsLaterUpdates) {
-  const ReplacedImport ansi(ImportOfLoadLibraryExA, LoadAsWindows7), wide(ImportOfLoadLibraryExW, LoadAsWindows7Wide);
+  const ReplacedImport ansi(importOfLoadLibraryExA, LoadAsWindows7), wide(importOfLoadLibraryExW, LoadAsWindows7Wide);
   EXPECT_NE(SystemFunction<void()>("comdlg32.dll", "GetSaveFileNameA"), nullptr);
   EXPECT_NE(SystemFunction<void()>("ole32.dll", "CoCreateInstance"), nullptr);
   EXPECT_EQ(SystemFunction<void()>("comdlg32.dll", "NoSuchFunction"), nullptr);
