@@ -30,10 +30,9 @@ bool GravarAjustes(const cls_REG& Registro, const Ajustes& Novos) {
 Ajustes AjustesPara(const std::string& Emulador, const Ajustes& Atuais, bool Outro) {
   Ajustes novos = Atuais;
   for (const AjusteDeCaminho& cada : AjustesDeCaminhos) {
-    if ((novos.*cada.Texto).empty()) novos.*cada.Texto = cada.Padrao;
-  }
-  for (std::string Ajustes::*diretorio : {&Ajustes::RomDir, &Ajustes::SaveDir, &Ajustes::ImgDir}) {
-    novos.*diretorio = ComBarra(novos.*diretorio);
+    std::string& novo = novos.*cada.Texto;
+    if (novo.empty()) novo = cada.Padrao;
+    if (cada.EhDiretorio) novo = ComBarra(novo);
   }
   if (Emulador.empty()) return novos;
   if (Outro || novos.EmuExe.empty()) novos.EmuExe = CaminhoRelativo(Emulador);

@@ -15,7 +15,7 @@ void EscolherIdioma();
 
 // The paths of the settings, as they are stored there: a leading backslash stands for DirPrograma; empty: not set.
 struct Ajustes {
-  std::string RomDir, SaveDir, ImgDir;  // directories, with a backslash at their end
+  std::string RomDir, SaveDir, ImgDir;  // directories
   std::string EmuExe, EmuCFG;           // the emulator's program and configuration files
 };
 
@@ -24,15 +24,16 @@ struct AjusteDeCaminho {
   std::string Ajustes::*Texto;
   std::string* Destino;  // what the program makes of it
   const char* Padrao;    // the text that counts while it is not set
+  bool EhDiretorio;      // it ends with a backslash
 };
 
 // In the order in which they are written: only with the last one is the program configured.
 inline constexpr std::array<AjusteDeCaminho, 5> AjustesDeCaminhos = {
-    {{"RomDir", &Ajustes::RomDir, &DirRoms, "\\Roms\\"},
-     {"SaveDir", &Ajustes::SaveDir, &DirSaves, "\\Saves\\"},
-     {"ImgDir", &Ajustes::ImgDir, &DirImgs, "\\Imgs\\"},
-     {"EmuExe", &Ajustes::EmuExe, &ArquivoEmulador, ""},
-     {"EmuCFG", &Ajustes::EmuCFG, &ArquivoCfgEmulador, ""}}};
+    {{"RomDir", &Ajustes::RomDir, &DirRoms, "\\Roms\\", true},
+     {"SaveDir", &Ajustes::SaveDir, &DirSaves, "\\Saves\\", true},
+     {"ImgDir", &Ajustes::ImgDir, &DirImgs, "\\Imgs\\", true},
+     {"EmuExe", &Ajustes::EmuExe, &ArquivoEmulador, "", false},
+     {"EmuCFG", &Ajustes::EmuCFG, &ArquivoCfgEmulador, "", false}}};
 
 // The paths that stand in the settings.
 Ajustes LerAjustes(const cls_REG& Registro);
