@@ -31,18 +31,31 @@ def arguments_for(compiler):
     # clang looks for the headers of the language in another place than Debian puts them, and knows UTF-8 alone.
     told = output_of(compiler, "-v", "-E", "-x", "c++", os.devnull).stderr
     folders = [line.strip() for line in told.splitlines() if line.startswith(" /") and "/c++" in line]
-    options = [f"-isystem{folder}" for folder in folders] + ["-fexec-charset=UTF-8", "-Wno-error"]
-    return [f"--extra-arg={option}" for option in options]
+    return ["--target=x86_64-w64-mingw32", *(f"-isystem{folder}" for folder in folders), "-fexec-charset=UTF-8",
+            "-Wno-error"]
+
+
+def options_of(command):
+    """How a source is compiled, without what goes in and out; precompiled headers are another compiler's."""
+    words = iter(shlex.split(command))
+    compiler = next(word for word in words if word.endswith("++") or "++-" in word)
+    options = []
+    for word in words:
+        if word in ("-o", "-c", "-include"):
+            next(words)
+        elif word != "-Winvalid-pch":
+            options.append(word)
+    return options + arguments_for(compiler)
 
 
 def sources(builds):
-    """Each source with the build that compiles it and the compiler."""
+    """Each source with the options of the first build that compiles it."""
     found = {}
     for build in builds:
         for command in json.loads((build / "compile_commands.json").read_text()):
             path = pathlib.Path(command["directory"], command["file"])
-            if path.suffix == ".cpp" and path.is_relative_to(ROOT):
-                found.setdefault(path, (build, shlex.split(command["command"])[0]))
+            if path.suffix == ".cpp" and path.is_relative_to(ROOT) and path not in found:
+                found[path] = options_of(command["command"])
     return found
 
 
@@ -70,9 +83,9 @@ def digest(source, rules):
     return total.hexdigest()
 
 
-def examine(source, build, compiler):
-    return subprocess.run(["clang-tidy", "--quiet", "-p", build, *arguments_for(compiler), source],
-                          capture_output=True, text=True, check=False)
+def examine(source, options):
+    return subprocess.run(["clang-tidy", "--quiet", source, "--", *options], capture_output=True, text=True,
+                          check=False)
 
 
 def main():
@@ -83,13 +96,13 @@ def main():
     clean = builds[0] / "tidy"
     clean.mkdir(exist_ok=True)
     waiting = {}
-    for source, how in sources(builds).items():
+    for source, options in sources(builds).items():
         mark = clean / digest(source, b"".join(rules))
         if not mark.exists():
-            waiting[source] = (how, mark)
+            waiting[source] = (options, mark)
     faults = 0
     with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
-        results = pool.map(lambda source: examine(source, *waiting[source][0]), waiting)
+        results = pool.map(lambda source: examine(source, waiting[source][0]), waiting)
         for (_, mark), result in zip(waiting.values(), results):
             if result.returncode == 0:
                 mark.touch()
