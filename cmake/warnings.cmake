@@ -5,13 +5,10 @@ target_compile_features(tolvaris_options INTERFACE cxx_std_20)
 target_compile_options(tolvaris_options INTERFACE
   $<$<COMPILE_LANGUAGE:CXX>:-Wall -Wextra -Wpedantic -Wshadow -Wconversion -Werror>)
 if(TOLVARIS_SANITIZE)
-  target_compile_options(tolvaris_options INTERFACE -fsanitize=address,undefined -fno-sanitize-recover=all
+  # The fuzzer sees which code its inputs reach; its targets alone are linked with it.
+  target_compile_options(tolvaris_options INTERFACE -fsanitize=address,undefined,fuzzer-no-link -fno-sanitize-recover=all
     -fno-omit-frame-pointer)
   target_link_options(tolvaris_options INTERFACE -fsanitize=address,undefined)
-endif()
-if(TOLVARIS_FUZZ)
-  # The fuzzer sees which code its inputs reach; the targets alone are linked with it.
-  target_compile_options(tolvaris_options INTERFACE -fsanitize=fuzzer-no-link)
 endif()
 if(WIN32)
   target_compile_options(tolvaris_options INTERFACE $<$<COMPILE_LANGUAGE:CXX>:-ffunction-sections -fdata-sections>)

@@ -5,6 +5,8 @@
 # shellcheck disable=SC2034  # the scripts that source this file use them
 native_packages=(g++ cmake ninja-build libgtest-dev zlib1g-dev)
 # shellcheck disable=SC2034
+sanitize_packages=(clang-14 libclang-rt-14-dev)
+# shellcheck disable=SC2034
 windows_packages=(g++-mingw-w64-x86-64-posix binutils-mingw-w64-x86-64 cmake ninja-build googletest
   libz-mingw-w64-dev)
 # shellcheck disable=SC2034
