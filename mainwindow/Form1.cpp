@@ -23,6 +23,7 @@ Form1::Form1()
       Picture1(platform::LoadPictureResource(FIGURA_PREVIA)) {
   Image1.SetPicture(Picture1);
 
+  OnHelp = [this] { Form_Help(); };
   OnUnload = [this] { Form_Unload(); };
   List1.OnClick = [this] { List1_Click(); };
   List1.OnDoubleClick = [this] { List1_DblClick(); };

@@ -60,6 +60,7 @@ class Form1 : public platform::Window {
   static bool DisqueteNoDrive();                                // a disk is ready in drive A:
 
   // --- Handlers.
+  void Form_Help();  // F1: the controller help, unless a command is under way
   void Form_Unload();
   void List1_Click();
   void List1_DblClick();

@@ -100,4 +100,8 @@ void Form1::GravarAjuste(const std::string& Ajuste, const std::string& Texto) co
   Registro.SetValue(platform::RootCurrentUser, ChaveConfiguracao, Ajuste, Texto);
 }
 
+void Form1::Form_Help() {
+  if (Command4.Enabled()) Form3::ABRIR();
+}
+
 void Form1::Form_Unload() { Form3::Descarregar(); }

@@ -74,6 +74,7 @@ class Window {
   std::int32_t Handle() const;
 
   std::function<void()> OnUnload;
+  std::function<void()> OnHelp;  // F1, whichever control has the keyboard
 
   WindowState& State() const { return *state_; }
 

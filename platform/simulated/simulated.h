@@ -153,6 +153,7 @@ void DoubleClick(ListBox& list);
 void PressKey(ListBox& list, int keyCode);              // up 38, down 40, home 36 and end 35 also move the selection
 void HoldKey(ListBox& list, int keyCode, int repeats);  // pressed, and repeated so many times before it is released
 void CloseWindow(Window& window);                       // its close box
+void PressHelp(Window& window);                         // F1
 void Tick(Timer& timer);                                // one tick, when the timer is enabled
 
 // --- What stands on the screen.

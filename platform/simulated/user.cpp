@@ -82,6 +82,10 @@ void CloseWindow(Window& window) {
   if (TakesInput(*window.State().Facts)) window.Close();
 }
 
+void PressHelp(Window& window) {
+  if (TakesInput(*window.State().Facts)) RunHandler(window.OnHelp);
+}
+
 void Tick(Timer& timer) {
   if (timer.Enabled() && !timer.State().Window->Closed) RunHandler(timer.OnTick);
 }

@@ -1,6 +1,7 @@
 #include <utility>
 
 #include "platform/windows/control.h"
+#include "platform/windows/events.h"
 #include "platform/windows/pictures.h"
 #include "platform/windows/placement.h"
 #include "platform/windows/timer.h"
@@ -89,6 +90,9 @@ std::pair<bool, LRESULT> Answer(WindowState& window, UINT message, WPARAM wParam
     case WM_SETFOCUS:
       PassFocusOn(window);
       return {true, 0};
+    case WM_HELP:  // from the control that has the keyboard, which passes it on
+      Raise(window.Object.OnHelp);
+      return {true, TRUE};
     case WM_DPICHANGED:
       ChangeDpi(window, HIWORD(wParam), *reinterpret_cast<const RECT*>(lParam));
       return {true, 0};

@@ -153,4 +153,18 @@ TEST_F(Startup, ControllerHelpComesOnceBeforeTheWindow) {
   EXPECT_EQ(shown, 1);
 }
 
+TEST_F(Startup, ControllerHelpComesAgainWithF1UnlessACommandIsUnderWay) {
+  ASSERT_TRUE(Start());
+  Texts shown;
+  const auto note = [&](platform::Window& help) { shown.push_back(help.Caption()); };
+  QueueModal(note);
+  PressHelp(*form);
+  EXPECT_EQ(shown, Texts{"Controle"});
+  EXPECT_EQ(StoredText(Key, "AvisoControle"), "1");
+  QueueModal(note);
+  QueueEvent([this] { PressHelp(*form); });
+  ChooseFile(form->Command4, "");
+  EXPECT_EQ(shown, Texts{"Controle"});
+}
+
 }  // namespace

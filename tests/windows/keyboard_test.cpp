@@ -183,6 +183,11 @@ TEST_F(Keyboard, ReadsAndClosesTheControllerHelp) {
     byEscape ? PressKey(VK_ESCAPE) : PressWith(VK_MENU, 'F');
     EXPECT_SOON(MainWindow(*program).List.Focused());
   }
+  PressKey(VK_F1);
+  EXPECT_EQ(Press(VK_RETURN), Of(Mensagem::GuardeOsComandos));
+  EXPECT_TRUE(FindVisible(*program, "Controle").ChildAt(120, 120).Focused());
+  PressKey(VK_ESCAPE);
+  EXPECT_SOON(MainWindow(*program).List.Focused());
 }
 
 }  // namespace
