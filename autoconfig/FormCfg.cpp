@@ -165,7 +165,9 @@ Ajustes FormCfg::AjustesEscolhidos() const { return AjustesPara(Selecionado(), a
 void FormCfg::MostrarEscolha() {
   const Ajustes novos = AjustesEscolhidos();
   for (std::size_t i = 0; i < Linhas.size(); ++i) {
-    Label4[i].SetCaption(Abreviado(CaminhoConfigurado(novos.*Linhas[i].Texto), LarguraNoQuadro));
+    const std::string caminho = CaminhoConfigurado(novos.*Linhas[i].Texto);
+    Label4[i].SetCaption(Abreviado(caminho, LarguraNoQuadro));
+    Label4[i].SetAccessibleName(Label3[i].Caption() + " " + caminho);
   }
   Command1.Enable(!Selecionado().empty());
 }

@@ -61,6 +61,7 @@ void Form3::Preparar() {
   Command1.SetCaption(Traduzir(Command1.Caption()));
   Combo1.Add(Traduzir(Texto::Jogador1));
   Combo1.Add(Traduzir(Texto::Jogador2));
+  Combo1.SetAccessibleName(Traduzir(Texto::NomeDoJogador));
   Combo1.Select(0);
   MostrarTeclas();
   SetCaption(Traduzir(Caption()));
@@ -72,6 +73,7 @@ void Form3::MostrarTeclas() {
   if (jogador != 0 && jogador != 1) return;
   for (std::size_t i = 0; i < Teclas.size(); ++i) {
     Label1[i].SetCaption(Traduzir(Teclas[i].Nomes[static_cast<std::size_t>(jogador)]));
+    Label1[i].SetAccessibleName(Traduzir(Teclas[i].Botao) + ": " + Label1[i].Caption());
   }
 }
 

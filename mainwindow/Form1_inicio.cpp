@@ -14,6 +14,7 @@
 #include "support/mod_Globais.h"
 #include "support/mod_Traducao.h"
 #include "support/mod_exe.h"
+#include "support/textos.h"
 
 namespace {
 
@@ -83,6 +84,8 @@ void Form1::TraduzirControles() {
         static_cast<platform::Control*>(&Command5), static_cast<platform::Control*>(&Command6)}) {
     cada->SetToolTip(Traduzir(cada->ToolTip()));
   }
+  List1.SetAccessibleName(Traduzir(Texto::NomeDosJogos));
+  Image1.SetAccessibleName(Traduzir(Texto::NomeDaFigura));
 }
 
 void Form1::MostrarControleNaPrimeiraVez() {

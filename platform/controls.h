@@ -116,6 +116,11 @@ class Control {
   std::string ToolTip() const;
   void SetToolTip(const std::string& text);
 
+  // The name by which a screen reader calls the control, where neither its text nor a tool tip says it; empty when none
+  // was given. Nothing visible changes.
+  std::string AccessibleName() const;
+  void SetAccessibleName(const std::string& name);
+
   std::int32_t Handle() const;  // as Window::Handle
 
   ControlState& State() const { return *state_; }

@@ -73,6 +73,8 @@ void Form4::Form_Load() {
   TraduzirTitulo(Command2);
   TraduzirDica(Image1);
   TraduzirDica(Image2);
+  List1.SetAccessibleName(Traduzir(Texto::NomeDosSalvamentosNoDisquete));
+  List2.SetAccessibleName(Traduzir(Texto::NomeDosSalvamentosNoComputador));
   platform::RunPendingEvents();
   Diretorios = {"A:\\", DirSaves};
   ListarComputador();

@@ -27,6 +27,12 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "Procurar emulador",
     "Emulador ZSnes (zsnes*.exe)",
     "Programas (*.exe)",
+    // For screen readers.
+    "Jogos",
+    "Figura do jogo",
+    "Salvamentos no disquete",
+    "Salvamentos no computador",
+    "Jogador",
     // tvk: the help.
     "Pacotes de jogos (.tvk) para quem guarda uma coleção para outros.",
     "tvk VERBO [OPÇÕES] ARQUIVOS...",

@@ -26,6 +26,12 @@ enum class Texto {
   ProcurarEmulador,
   EmuladorZsnes,
   Programas,
+  // For screen readers.
+  NomeDosJogos,
+  NomeDaFigura,
+  NomeDosSalvamentosNoDisquete,
+  NomeDosSalvamentosNoComputador,
+  NomeDoJogador,
   // tvk: the help.
   TvkResumo,
   TvkUso,

@@ -49,6 +49,7 @@ int main() {
   for (const DescricaoDeMensagem& message : TodasAsMensagens()) PrintMessage(message);
   for (const std::string_view text : TodosOsTextos()) PrintText(platform::FromUtf8(text));
   for (const Tecla& key : Teclas) {
+    PrintText(key.Botao);
     for (const char* name : key.Nomes) PrintText(name);
   }
   Reset();

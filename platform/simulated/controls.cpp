@@ -70,6 +70,12 @@ void Control::SetToolTip(const std::string& text) {
   if (IsAlive(*state_)) state_->ToolTip = text;
 }
 
+std::string Control::AccessibleName() const { return state_->AccessibleName; }
+
+void Control::SetAccessibleName(const std::string& name) {
+  if (IsAlive(*state_)) state_->AccessibleName = name;
+}
+
 std::int32_t Control::Handle() const { return state_->Handle; }
 
 Button::Button(const Container& container, const Bounds& bounds, const std::string& caption, const Font& font) {

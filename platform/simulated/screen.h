@@ -81,7 +81,7 @@ struct ControlState {
   Control* Self = nullptr;
   std::shared_ptr<simulated::WindowFacts> Window;
   Bounds Place{};
-  std::string Caption, ToolTip;
+  std::string Caption, ToolTip, AccessibleName;
   bool Enabled = true, Visible = true;
   std::int32_t Handle = 0;
 

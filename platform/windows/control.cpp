@@ -2,8 +2,10 @@
 
 #include <algorithm>
 
+#include "platform/windows/accessibility.h"
 #include "platform/windows/fonts.h"
 #include "platform/windows/tooltips.h"
+#include "platform/windows/wide.h"
 
 namespace platform {
 namespace {
@@ -45,7 +47,11 @@ LRESULT CALLBACK ControlProcedure(HWND handle, UINT message, WPARAM wParam, LPAR
     case WM_ERASEBKGND:
       if (control.DrawsItself) return TRUE;
       break;
+    case WM_GETOBJECT:  // a screen reader
+      TellName(control);
+      break;
     case WM_NCDESTROY:
+      ForgetName(control);
       control.Handle = nullptr;
       ::SetWindowLongPtrW(handle, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(native));
       break;
@@ -202,6 +208,17 @@ void Control::SetToolTip(const std::string& text) {
   state_->ToolTip = text;
   if (state_->NamedByToolTip) ::SetWindowTextA(state_->Handle, text.c_str());
   UpdateToolTip(*state_);
+}
+
+std::string Control::AccessibleName() const { return state_->AccessibleName; }
+
+// Also as the control's text, by which some readers call it, where that is not on the screen.
+void Control::SetAccessibleName(const std::string& name) {
+  if (state_->Handle == nullptr || name == state_->AccessibleName) return;
+  state_->AccessibleName = name;
+  state_->NameIsTold = false;
+  if (!state_->ShowsText) ::SetWindowTextW(state_->Handle, ToShown(name).c_str());
+  ::NotifyWinEvent(EVENT_OBJECT_NAMECHANGE, state_->Handle, OBJID_CLIENT, CHILDID_SELF);
 }
 
 std::int32_t Control::Handle() const {

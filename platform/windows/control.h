@@ -23,10 +23,12 @@ struct ControlState {
   WNDPROC Native = nullptr;      // what the control's class does with a message
   Bounds Place = {};             // in the window's client area, twips
   Font Face;
-  std::string Caption, ToolTip;
+  std::string Caption, ToolTip, AccessibleName;
+  bool NameIsTold = false;                      // to screen readers, as it is now
   bool NamedByToolTip = false;                  // the native text is the tool tip
   bool EnterIsKey = false;                      // Enter goes to OnKey and not to the window
   bool DrawsItself = false;                     // all of its area
+  bool ShowsText = true;                        // the native text
   bool LastEnabled = true, LastVisible = true;  // once the window is closed
 
   // What a kind of control does in its own way.

@@ -19,7 +19,10 @@ void DrawLater(HWND box) {
 }
 
 struct ImageBoxState : ControlState {
-  ImageBoxState() { DrawsItself = true; }
+  ImageBoxState() {
+    DrawsItself = true;
+    ShowsText = false;
+  }
 
   void Draw(const DRAWITEMSTRUCT& item) override {
     const SIZE place = {item.rcItem.right - item.rcItem.left, item.rcItem.bottom - item.rcItem.top};

@@ -54,7 +54,10 @@ std::vector<const std::string*> AsListed(const std::vector<std::string>& texts, 
 }
 
 struct ListBoxState : ControlState {
-  explicit ListBoxState(const ListBox& object) : Object(object) { EnterIsKey = true; }
+  explicit ListBoxState(const ListBox& object) : Object(object) {
+    EnterIsKey = true;
+    ShowsText = false;
+  }
 
   void OnNotification(int code) override {
     if (code == LBN_SELCHANGE) Raise(Object.OnClick);

@@ -2,12 +2,12 @@
 
 // clang-format off
 #include <windows.h>
-#include <objbase.h>
 #include <shellapi.h>
 // clang-format on
 
 #include <utility>
 
+#include "platform/windows/com.h"
 #include "platform/windows/events.h"
 #include "platform/windows/system_library.h"
 
@@ -21,12 +21,6 @@ void Release(std::intptr_t handle) {
 }
 
 bool HasNul(const std::string& text) { return text.find('\0') != std::string::npos; }
-
-// The shell may need COM, whose objects the thread then keeps to its end.
-bool PrepareCom() {
-  const auto initialize = SystemFunction<HRESULT WINAPI(LPVOID, DWORD)>("ole32.dll", "CoInitializeEx");
-  return initialize != nullptr && SUCCEEDED(initialize(nullptr, COINIT_APARTMENTTHREADED | COINIT_DISABLE_OLE1DDE));
-}
 
 }  // namespace
 
@@ -69,13 +63,13 @@ Process CreateProcessA(const std::string& commandLine, std::uint32_t creationFla
   return process;
 }
 
-// The question to the person belongs to the active window; without one it would wait in the taskbar.
+// The shell may need COM. The question to the person belongs to the active window; without one it would wait in the
+// taskbar.
 Process ShellExecuteExA(const std::string& verb, const std::string& file, const std::string& parameters,
                         const std::string& directory) {
   Process process;
-  static const bool prepared = PrepareCom();
   const auto execute = SystemFunction<BOOL WINAPI(SHELLEXECUTEINFOA*)>("shell32.dll", "ShellExecuteExA");
-  if (!prepared || execute == nullptr || HasNul(verb + file + parameters + directory)) return process;
+  if (!PrepareCom() || execute == nullptr || HasNul(verb + file + parameters + directory)) return process;
   SHELLEXECUTEINFOA request{};
   request.cbSize = sizeof request;
   request.fMask = SEE_MASK_NOCLOSEPROCESS | SEE_MASK_NOASYNC | SEE_MASK_FLAG_NO_UI;

@@ -12,6 +12,7 @@
 #include <memory>
 #include <utility>
 
+#include "platform/windows/com.h"
 #include "platform/windows/system_library.h"
 
 namespace platform {
@@ -30,21 +31,10 @@ Owned<T> Obtain(Create create) {
   return Owned<T>(SUCCEEDED(create(&object)) ? object : nullptr);
 }
 
-Owned<IWICImagingFactory> CreateFactory() {
-  const auto initialize = SystemFunction<HRESULT WINAPI(LPVOID, DWORD)>("ole32.dll", "CoInitializeEx");
-  const auto create =
-      SystemFunction<HRESULT WINAPI(REFCLSID, LPUNKNOWN, DWORD, REFIID, LPVOID*)>("ole32.dll", "CoCreateInstance");
-  if (initialize == nullptr || create == nullptr) return nullptr;
-  initialize(nullptr, COINIT_APARTMENTTHREADED);
-  return Obtain<IWICImagingFactory>([&](IWICImagingFactory** factory) {
-    return create(CLSID_WICImagingFactory, nullptr, CLSCTX_INPROC_SERVER, IID_IWICImagingFactory,
-                  reinterpret_cast<LPVOID*>(factory));
-  });
-}
-
 // Made once, when the first picture needs it, and alive until the process ends.
 IWICImagingFactory* Factory() {
-  static IWICImagingFactory* const factory = CreateFactory().release();
+  static auto* const factory =
+      static_cast<IWICImagingFactory*>(CreateObject(CLSID_WICImagingFactory, IID_IWICImagingFactory));
   return factory;
 }
 

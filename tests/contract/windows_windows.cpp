@@ -26,6 +26,25 @@ TEST_F(NativeWindow, KeepsTheKeyboardForAControlThatIsSwitchedOff) {
   }
 }
 
+string NativeText(const Control& control) {
+  char text[100] = "";
+  ::GetWindowTextA(control.State().Handle, text, sizeof text);
+  return text;
+}
+
+// Wine's service for names refuses them: the control is as before, and only a text that is not shown says its name.
+TEST_F(NativeWindow, KeepsAControlsNameForReadersAlsoWhereWindowsTakesNone) {
+  const std::pair<Control*, const char*> texts[] = {{&list, "Nome"}, {&button, "&Jogar"}, {&check, "Usar disquete"}};
+  for (const auto& [control, text] : texts) {
+    control->SetAccessibleName("Nome");
+    ::SendMessageA(control->State().Handle, WM_GETOBJECT, 0, OBJID_CLIENT);
+    EXPECT_EQ(control->AccessibleName(), "Nome") << text;
+    EXPECT_EQ(NativeText(*control), text);
+  }
+  Choose(list, 1);
+  EXPECT_EQ(Seen(), "list | row 1, unchecked, choice 0");
+}
+
 // As beside a taskbar at the left and at the top.
 TEST_F(NativeWindow, StandsWhereItWouldWithoutATaskbar) {
   RECT before = {};

@@ -31,6 +31,7 @@ std::set<std::string> AllTexts() {
   const auto add = [&](std::string_view text) { texts.insert(platform::FromUtf8(text)); };
   for (const std::string_view text : TodosOsTextos()) add(text);
   for (const Tecla& key : Teclas) {
+    add(key.Botao);
     for (const char* name : key.Nomes) add(name);
   }
   for (const DescricaoDeMensagem& message : TodasAsMensagens()) {
@@ -71,6 +72,7 @@ struct Translation : Menu {
     for (const platform::Control* each : ControlsOf(window)) {
       ExpectMarked(each->Caption());
       ExpectMarked(each->ToolTip());
+      ExpectMarked(each->AccessibleName());
     }
   }
 
