@@ -14,7 +14,8 @@ namespace platform {
 enum class Access {
   Read,       // the file must exist
   ReadWrite,  // created empty when missing; an existing file keeps its contents
-  CreateNew   // for writing; fails when anything of that name exists
+  CreateNew,  // for writing; fails when anything of that name exists
+  Alone       // the file must exist and can be written; no other program has it open, and none can open it meanwhile
 };
 
 // An open file, closed at the end of its life. Other programs may read and write it meanwhile.

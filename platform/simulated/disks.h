@@ -40,7 +40,7 @@ struct OpenFile {
   std::shared_ptr<Disk> Where;
   std::shared_ptr<Entry> Target;
   std::string Path;
-  bool Writable = false;
+  bool Writable = false, Alone = false;
 };
 
 // Where a path leads: into a directory that exists.

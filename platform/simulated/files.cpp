@@ -21,11 +21,18 @@ OpenFile* Opened(std::intptr_t handle) {
   return usable ? &found->second : nullptr;
 }
 
+bool IsOpenAlone(const simulated::Entry& file) {
+  return std::ranges::any_of(TheMachine().OpenFiles,
+                             [&](const auto& each) { return each.second.Alone && each.second.Target.get() == &file; });
+}
+
 bool MayOpen(const Place& place, Access access) {
   if (place.EndsWithBackslash) return false;
-  if (!place.Found) return access != Access::Read && place.Folder && !place.Folder->TakesNoFiles;
+  const bool mustExist = access == Access::Read || access == Access::Alone;
+  if (!place.Found) return !mustExist && place.Folder && !place.Folder->TakesNoFiles;
   if (access == Access::CreateNew) return false;
-  if (place.Found->IsDirectory() || place.Found->Locked) return false;
+  if (place.Found->IsDirectory() || place.Found->Locked || IsOpenAlone(*place.Found)) return false;
+  if (access == Access::Alone && place.Found->TimesOpen > 0) return false;
   return access == Access::Read || (place.Found->Attributes & AttributeReadOnly) == 0;
 }
 
@@ -38,7 +45,8 @@ File::File(const std::string& path, Access access) {
   if (!place->Found) simulated::CreateEntry(*place, AttributeArchive);
   ++place->Found->TimesOpen;
   handle_ = ++TheMachine().LastHandle;
-  TheMachine().OpenFiles[handle_] = {place->Where, place->Found, place->Path, access != Access::Read};
+  TheMachine().OpenFiles[handle_] = {place->Where, place->Found, place->Path, access != Access::Read,
+                                     access == Access::Alone};
 }
 
 File::File(File&& other) noexcept : handle_(std::exchange(other.handle_, -1)) {}

@@ -22,11 +22,22 @@ OVERLAPPED At(std::int64_t position) {
   return place;
 }
 
+DWORD Disposition(Access access) {
+  switch (access) {
+    case Access::CreateNew:
+      return CREATE_NEW;
+    case Access::ReadWrite:
+      return OPEN_ALWAYS;
+    default:
+      return OPEN_EXISTING;
+  }
+}
+
 HANDLE OpenFile(const std::string& path, Access access) {
   const DWORD rights = access == Access::Read ? GENERIC_READ : GENERIC_READ | GENERIC_WRITE;
-  const DWORD how = access == Access::Read ? OPEN_EXISTING : access == Access::CreateNew ? CREATE_NEW : OPEN_ALWAYS;
-  return ::CreateFileA(WindowsPath(path), rights, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr, how,
-                       FILE_ATTRIBUTE_NORMAL, nullptr);
+  const DWORD sharing = access == Access::Alone ? 0 : FILE_SHARE_READ | FILE_SHARE_WRITE;
+  return ::CreateFileA(WindowsPath(path), rights, sharing, nullptr, Disposition(access), FILE_ATTRIBUTE_NORMAL,
+                       nullptr);
 }
 
 // What a failure to see a file says of its length.

@@ -32,6 +32,8 @@ TEST_F(Files, OpenAsTheAccessSays) {
       {"a new one where one is", a_, Access::CreateNew, false, "0123456789"},
       {"a new one", here_ + "new2", Access::CreateNew, true, ""},
       {"a new one where a directory is", here_, Access::CreateNew, false, "(none)"},
+      {"alone", a_, Access::Alone, true, "0123456789"},
+      {"a missing one, alone", missing_, Access::Alone, false, "(none)"},
   };
   for (const auto& [name, path, access, opens, after] : cases) {
     SCOPED_TRACE(name);
@@ -52,6 +54,19 @@ TEST_F(Files, OpenAsTheAccessSays) {
   SetAttributes(b_, AttributeHidden);
   Put(b_, "new");
   EXPECT_EQ(Content(b_), "new");
+}
+
+TEST_F(Files, OpenAloneLeaveAllOthersOut) {
+  Put(a_, "x");
+  for (const Access other : {Access::Read, Access::ReadWrite, Access::Alone}) {
+    {
+      const File first(a_, other);
+      EXPECT_FALSE(File(a_, Access::Alone).IsOpen());
+    }
+    const File alone(a_, Access::Alone);
+    EXPECT_TRUE(alone.IsOpen());
+    EXPECT_FALSE(File(a_, other).IsOpen());
+  }
 }
 
 TEST_F(Files, BytePositionsAndSizesAreExact) {
