@@ -3,11 +3,7 @@
 #include "platform/text.h"
 #include "support/mod_Arquivos.h"
 
-namespace {
-
 std::string CaminhoCatalogo() { return DirPrograma + "tolvaris.dat"; }
-
-}  // namespace
 
 void cls_DAT::AbrirLeitura(const std::string& Caminho) {
   numArquivo_ = platform::File(Caminho, platform::Access::Read);

@@ -1,5 +1,6 @@
-// The catalogue: which name belongs to which DOS name. It is one text file in the program's directory, only ever
-// appended to, which stays open, and which other programs may read and write meanwhile.
+// The catalogue: which name belongs to which DOS name. It is one text file in the program's directory, which stays
+// open, and which other programs may read and write meanwhile. Entries are only ever appended to it, except where no
+// program has it open (catalog/reescrita.h).
 #pragma once
 
 #include <optional>
@@ -8,6 +9,9 @@
 #include "catalog/indice.h"
 #include "platform/files.h"
 #include "support/mod_Globais.h"
+
+// The path of its file.
+std::string CaminhoCatalogo();
 
 class cls_DAT {
  public:
