@@ -4,12 +4,6 @@
 #include "support/caminhos.h"
 #include "support/mod_Globais.h"
 
-namespace {
-
-constexpr const char* ExtensoesDeImagem[] = {".gif", ".bmp", ".jpg", ".png"};  // the first one present is shown
-
-}  // namespace
-
 Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurto) {
   Jogo jogo;
   const auto base = NomeBase(Entrada.Name);

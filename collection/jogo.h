@@ -1,6 +1,7 @@
 // A game of the collection: one ROM file of the ROM directory, what the catalogue says of it, and its picture.
 #pragma once
 
+#include <array>
 #include <string>
 
 #include "platform/files.h"
@@ -20,6 +21,9 @@ Jogo LerJogo(const platform::DirectoryEntry& Entrada, const std::string& DirCurt
 
 // The files of the ROM directory that are games, as a listing takes it.
 inline constexpr const char* PadraoRoms = "*.zip;*.smc";
+
+// Those that a picture file may have: the first one present is shown.
+inline constexpr std::array<const char*, 4> ExtensoesDeImagem = {".gif", ".bmp", ".jpg", ".png"};
 
 // The picture file of the game of this name, or the empty text: the first one of ".gif", ".bmp", ".jpg", ".png" that is
 // there and not empty, or of which that cannot be told.

@@ -1,6 +1,5 @@
 #include "keeper/instalacao.h"
 
-#include "keeper/argumentos.h"
 #include "keeper/arquivos.h"
 #include "support/mod_Arquivos.h"
 #include "support/mod_Configuracao.h"
@@ -27,4 +26,14 @@ bool UsarConfigurada(Relato& Onde) {
   }
   LerCaminhos(cls_REG());
   return true;
+}
+
+bool TemUmArquivoEInstalacao(const Pedido& Feito, Relato& Onde) {
+  if (!Feito.Tem("--instalacao")) {
+    Onde.UsoErrado(Traduzir(Texto::FaltaAOpcao, {"--instalacao"}));
+    return false;
+  }
+  if (Feito.Arquivos.size() == 1) return true;
+  Onde.UsoErrado(Traduzir(Texto::SoUmArquivo));
+  return false;
 }

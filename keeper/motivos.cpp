@@ -42,12 +42,15 @@ Motivos MotivosDoConteudo(const Pacote& Lido) {
   return motivos;
 }
 
+Motivos MotivosDoNome(const std::string& Nome) {
+  const FaltaNoNome nome = ConferirNome(platform::ToUtf8(Nome));
+  if (nome.Qual == Tipo::Nenhuma) return {};
+  return {Traduzir(Texto::NomeErrado, {Nome, EmPalavras(nome, Texto::NomeLongo)})};
+}
+
 Motivos MotivosDosNomes(const std::string& Nome, const std::string& NomeDOS) {
-  Motivos motivos;
-  const FaltaNoNome nome = ConferirNome(platform::ToUtf8(Nome)), dos = ConferirNomeDOS(platform::ToUtf8(NomeDOS));
-  if (nome.Qual != Tipo::Nenhuma) {
-    motivos.push_back(Traduzir(Texto::NomeErrado, {Nome, EmPalavras(nome, Texto::NomeLongo)}));
-  }
+  Motivos motivos = MotivosDoNome(Nome);
+  const FaltaNoNome dos = ConferirNomeDOS(platform::ToUtf8(NomeDOS));
   if (dos.Qual != Tipo::Nenhuma) {
     motivos.push_back(Traduzir(Texto::NomeDOSErrado, {NomeDOS, EmPalavras(dos, Texto::NomeDOSLongo)}));
   }

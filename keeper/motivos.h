@@ -9,5 +9,8 @@
 // What keeps a package's content from being put into a collection.
 Motivos MotivosDoConteudo(const Pacote& Lido);
 
+// What is wrong with a game's name, where it is to be given on.
+Motivos MotivosDoNome(const std::string& Nome);
+
 // What is wrong with its names, where they are to be given on.
 Motivos MotivosDosNomes(const std::string& Nome, const std::string& NomeDOS);

@@ -43,7 +43,10 @@ void Relato::UsoErrado(const std::string& Porque) {
 
 void Relato::Escrever(bool Erro, std::string_view Utf8) {
   ApagarAndamento();
-  const std::string linha = std::string(Utf8).append(FimDeLinha);
+  std::string linha(Utf8);
+  std::ranges::replace_if(
+      linha, [](unsigned char Letra) { return Letra < ' '; }, '?');  // it stays one line
+  linha += FimDeLinha;
   if (!platform::WriteStream(Erro ? Stream::Error : Stream::Output, linha)) calado_ = true;
 }
 

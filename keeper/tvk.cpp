@@ -28,6 +28,9 @@ constexpr Opcao OpcoesDeCriar[] = {
 };
 constexpr Opcao OpcoesDeListar[] = {Csv};
 constexpr Opcao OpcoesDeExtrair[] = {Saida};
+constexpr Opcao EmInstalacao = {"--instalacao", "DIR", Texto::OpcaoQualInstalacao};
+constexpr Opcao OpcoesDeNomear[] = {EmInstalacao, {"--simular", "", Texto::OpcaoSimular}};
+constexpr Opcao OpcoesDeDesfazer[] = {EmInstalacao};
 constexpr Opcao OpcoesDeInstalar[] = {
     {"--instalacao", "DIR", Texto::OpcaoEmInstalacao},
     {"--substituir", "", Texto::OpcaoSubstituir},
@@ -58,6 +61,8 @@ constexpr Verbo Verbos[] = {
      {"tvk instalar [--instalacao DIR] [--substituir] PACOTE..."},
      OpcoesDeInstalar,
      Instalar},
+    {"nomear", Texto::TvkNomear, {"tvk nomear --instalacao DIR [--simular] LISTA.csv"}, OpcoesDeNomear, Nomear},
+    {"desfazer", Texto::TvkDesfazer, {"tvk desfazer --instalacao DIR ARQUIVO"}, OpcoesDeDesfazer, Desfazer},
 };
 
 // A word and what it means.

@@ -9,3 +9,5 @@ void Listar(const Pedido& Feito, Relato& Onde);
 void Verificar(const Pedido& Feito, Relato& Onde);
 void Extrair(const Pedido& Feito, Relato& Onde);
 void Instalar(const Pedido& Feito, Relato& Onde);
+void Nomear(const Pedido& Feito, Relato& Onde);
+void Desfazer(const Pedido& Feito, Relato& Onde);

@@ -41,6 +41,8 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "confere os pacotes e não muda nada",
     "tira dos pacotes os jogos e as figuras",
     "põe os jogos dos pacotes em uma coleção",
+    "muda nomes de jogos; a LISTA tem as colunas dos e nome",
+    "desfaz o que um nomear mudou",
     "tvk VERBO --ajuda mostra as opções de um verbo; tvk --versao, a versão.",
     "ARQUIVOS podem ter * e ?; um diretório serve pelos pacotes que há nele.",
     "@ARQUIVO é uma lista de argumentos, um por linha; -- termina as opções.",
@@ -54,6 +56,8 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "como tabela CSV, para outros programas",
     "a instalação; sem ela, a que está configurada",
     "troca também os jogos diferentes que já estão lá",
+    "a instalação do Tolvaris",
+    "diz o que mudaria e não muda nada",
     // tvk: wrong use.
     "Veja tvk --ajuda.",
     "falta o verbo",
@@ -64,10 +68,17 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "faltam os arquivos",
     "--instalacao, --lista e arquivos não podem vir juntos",
     "--nome, --dos e --figura valem para um jogo só",
+    "falta a opção %",
+    "só pode vir um arquivo",
     // tvk: what it tells.
     "% de %, % MB/s",
     "Pacotes gravados: %; iguais aos que já estavam lá: %.",
     "Pacotes bons: %; recusados: %.",
+    "Nomes mudados: %; figuras: %. Nomes que já eram esses: %.",
+    "Nomes que mudariam: %; figuras: %. Nomes que já são esses: %.",
+    "Guarde este arquivo para desfazer: %",
+    "Desfeito. Figuras que voltaram: %.",
+    "Tudo já estava como antes.",
     "DOS",
     "Figura",
     "Jogo",
@@ -121,8 +132,20 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "já há outro jogo com esse nome ou arquivo; --substituir o troca",
     "o jogo foi posto na coleção, mas o catálogo não pode ser gravado",
     "não pode ser gravado na coleção",
+    "a coleção não tem um jogo com o nome DOS '%'",
+    "já há uma figura com o nome novo: %",
+    "está aberto em outro programa, ou não pode ser gravado; feche o Tolvaris",
+    "não pode ser gravado; nada mudou",
+    "não pode mudar; tudo está como antes",
+    "não pode mudar, e o que já mudou não voltou; use tvk desfazer com %",
+    "não pode mudar; só uma parte voltou: repita o comando",
+    "não é um arquivo para desfazer do tvk, ou está danificado",
+    "os nomes mudaram de novo depois disso; desfaça primeiro o que veio depois",
+    "é outra figura agora",
+    "há agora outra figura com o nome de antes",
+    "a figura não está mais lá",
 });
-static_assert(Tabela.size() == static_cast<std::size_t>(Texto::NaoPodeSerInstalado) + 1, "a text for each name");
+static_assert(Tabela.size() == static_cast<std::size_t>(Texto::FiguraSumiu) + 1, "a text for each name");
 
 }  // namespace
 

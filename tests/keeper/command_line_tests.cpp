@@ -23,12 +23,14 @@ struct CommandLine : Keeper {
 TEST_F(CommandLine, HelpFitsOneScreenInBothLanguages) {
   const std::pair<Texts, Texts> cases[] = {
       // the arguments, and words that the help has
-      {{"--ajuda"}, {"criar ", "listar ", "verificar ", "extrair ", "instalar "}},
+      {{"--ajuda"}, {"criar ", "listar ", "verificar ", "extrair ", "instalar ", "nomear ", "desfazer "}},
       {{"criar", "--ajuda"}, {"--nome", "--dos", "--figura", "--saida", "--instalacao", "--lista"}},
       {{"listar", "--ajuda"}, {"--csv"}},
       {{"verificar", "x", "--ajuda"}, {"--csv"}},
       {{"extrair", "--ajuda"}, {"--saida"}},
       {{"instalar", "--ajuda"}, {"--instalacao", "--substituir"}},
+      {{"nomear", "--ajuda"}, {"--instalacao", "--simular"}},
+      {{"desfazer", "--ajuda"}, {"--instalacao"}},
   };
   for (const bool english : {false, true}) {
     if (english) TranslateIntoEnglish();
@@ -62,6 +64,8 @@ TEST_F(CommandLine, WhatIsWrongIsToldAndEndsWith2) {
       {"a value outside the code page",
        {"extrair", "--saida", "日本", "x"},
        "--saida: tem um caractere que a página de código do Windows não tem"},
+      {"no installation", {"nomear", "l.csv"}, "falta a opção --instalacao"},
+      {"two files where one can be", {"desfazer", "--instalacao", "C:\\T", "a", "b"}, "só pode vir um arquivo"},
       {"a list and files",
        {"criar", "--lista", "l.csv", "x.smc"},
        "--instalacao, --lista e arquivos não podem vir juntos"},

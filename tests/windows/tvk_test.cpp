@@ -107,6 +107,39 @@ TEST_F(Tvk, InstallsIntoTheCollectionThatTheMenuLists) {
   ExpectPlayed("CORACAO.zip");
 }
 
+TEST_F(Tvk, NamesGamesWhileNobodyHasTheCatalogueOpenAndTakesItBack) {
+  Put("Imgs\\Zebra.gif", Gif(RGB(220, 20, 40)));
+  Put("Imgs\\Élan.gif", Gif(RGB(10, 200, 60)));
+  PutFile(Outside + "n.csv", "dos;nome\r\nZEBRA;Élan\r\nELAN;Zebra\r\nABELHA;Abelha\r\n");
+  const std::string catalogue = Content("tolvaris.dat");
+  const Files pictures = FilesIn(Home + "Imgs\\");
+  const std::wstring name = L"nomear --instalacao C:\\Ensaio n.csv";
+  const Ended refused = {
+      1, "",
+      "C:\\Ensaio\\tolvaris.dat: est\xC3\xA1 aberto em outro programa, ou n\xC3\xA3o pode ser gravado; "
+      "feche o Tolvaris\n"};
+  Start();
+  EXPECT_EQ(RunTvk(name), refused);
+  program.reset();
+  const Ended named = RunTvk(name);
+  EXPECT_EQ(named.Status, 0u) << named.Errors;
+  Start();
+  Select("Élan");
+  EXPECT_SOON_EQ(RGB(220, 20, 40), window->Preview());
+  EXPECT_EQ(Entries(window->List).front(), "Abelha");
+  window->Play.Click();
+  ExpectPlayed("ZEBRA.SMC");
+
+  const std::string file =
+      named.Output.substr(named.Output.rfind(' ') + 1, named.Output.size() - named.Output.rfind(' ') - 2);
+  const std::wstring undo = L"desfazer --instalacao C:\\Ensaio " + std::wstring(file.begin(), file.end());
+  EXPECT_EQ(RunTvk(undo), refused);
+  program.reset();
+  EXPECT_EQ(RunTvk(undo), (Ended{0, "Desfeito. Figuras que voltaram: 2.\n", ""}));
+  EXPECT_EQ(Content("tolvaris.dat"), catalogue);
+  ExpectFiles(pictures, FilesIn(Home + "Imgs\\"));
+}
+
 TEST_F(Tvk, RefusesByNameWhatTheCodePageLacks) {
   EXPECT_EQ(RunTvk(L"verificar \x65E5\x672C.tvk"),
             (Ended{1, "",
