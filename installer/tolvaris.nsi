@@ -3,7 +3,8 @@
 ;   ARQUIVOS     the directory with what is installed
 ;   RAIZ         the project's directory
 ;   INSTALADOR   the file to make
-; Silently: tolvaris-VERSAO-setup.exe /S [/INGLES] [/D=DIRECTORY]; /INGLES puts the English texts too.
+; Silently: tolvaris-VERSAO-setup.exe /S [/INGLES] [/TVK] [/D=DIRECTORY]; /INGLES puts the English texts too, /TVK the
+; keeper's tool.
 Target amd64-unicode
 !include MUI2.nsh
 !include FileFunc.nsh
@@ -57,6 +58,9 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
 !insertmacro TEXTO INGLES "Textos em inglês (language.ini)" "English interface (language.ini)"
 !insertmacro TEXTO SOBRE_INGLES "O Tolvaris em inglês. Sem isto ele fala português." \
   "Tolvaris in English. Without this it speaks Portuguese."
+!insertmacro TEXTO TVK "Ferramenta tvk (para quem guarda uma coleção)" "The tool tvk (for those who keep a collection)"
+!insertmacro TEXTO SOBRE_TVK "Faz pacotes de jogos, confere e renomeia, no Prompt de Comando. Quem só joga não precisa." \
+  "Packs games, checks and renames them, at the command prompt. Who only plays does not need it."
 !insertmacro TEXTO ABERTO "O Tolvaris está aberto. Feche-o e tente de novo." \
   "Tolvaris is open. Close it and try again."
 !insertmacro TEXTO PROTEGIDO \
@@ -90,6 +94,7 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
 !macro ESPERAR_PROGRAMAS_LIVRES
   !insertmacro ESPERAR_LIVRE "$INSTDIR\tolvaris.exe"
   !insertmacro ESPERAR_LIVRE "$INSTDIR\tolvariscfg.exe"
+  !insertmacro ESPERAR_LIVRE "$INSTDIR\tvk.exe"
 !macroend
 
 ; A translation that we did not install is the user's.
@@ -100,11 +105,18 @@ VIAddVersionKey /LANG=1046 "LegalCopyright" ""
   ${EndIf}
 !macroend
 
+; It goes, and is put again where it is wanted.
+!macro APAGAR_TVK
+  Delete "$INSTDIR\tvk.exe"
+  Delete "$INSTDIR\LEIAME-tvk.txt"
+!macroend
+
 Section "$(PROGRAMA)" SECAO_PROGRAMA
   SectionIn RO
   SetOutPath "$INSTDIR"
   !insertmacro ESPERAR_PROGRAMAS_LIVRES
   !insertmacro APAGAR_NOSSA_TRADUCAO
+  !insertmacro APAGAR_TVK
   File "${ARQUIVOS}/tolvaris.exe"
   File "${ARQUIVOS}/tolvariscfg.exe"
   File "${ARQUIVOS}/LEIAME.txt"
@@ -139,12 +151,18 @@ Section /o "$(INGLES)" SECAO_INGLES
   WriteRegDWORD HKCU "${CHAVE}" "Ingles" 1
 SectionEnd
 
+Section /o "$(TVK)" SECAO_TVK
+  File "${ARQUIVOS}/tvk.exe"
+  File "${ARQUIVOS}/LEIAME-tvk.txt"
+SectionEnd
+
 !insertmacro MUI_FUNCTION_DESCRIPTION_BEGIN
   !insertmacro MUI_DESCRIPTION_TEXT ${SECAO_PROGRAMA} "$(SOBRE_PROGRAMA)"
+  !insertmacro MUI_DESCRIPTION_TEXT ${SECAO_TVK} "$(SOBRE_TVK)"
   !insertmacro MUI_DESCRIPTION_TEXT ${SECAO_INGLES} "$(SOBRE_INGLES)"
 !insertmacro MUI_FUNCTION_DESCRIPTION_END
 
-; Who installed the English texts before, or asks for them on the command line, gets them.
+; Who installed the English texts or the tool before, or asks for them on the command line, gets them.
 Function .onInit
   ReadRegDWORD $0 HKCU "${CHAVE}" "Ingles"
   ${GetParameters} $1
@@ -154,12 +172,19 @@ Function .onInit
   ${OrIf} $0 == 1
     !insertmacro SelectSection ${SECAO_INGLES}
   ${EndIf}
+  ClearErrors
+  ${GetOptions} $1 "/TVK" $2
+  ${IfNot} ${Errors}
+  ${OrIf} ${FileExists} "$INSTDIR\tvk.exe"
+    !insertmacro SelectSection ${SECAO_TVK}
+  ${EndIf}
 FunctionEnd
 
 ; What we installed goes; a directory goes only when it is empty.
 Section "Uninstall"
   !insertmacro ESPERAR_PROGRAMAS_LIVRES
   !insertmacro APAGAR_NOSSA_TRADUCAO
+  !insertmacro APAGAR_TVK
   Delete "$INSTDIR\tolvaris.exe"
   Delete "$INSTDIR\tolvariscfg.exe"
   Delete "$INSTDIR\LEIAME.txt"

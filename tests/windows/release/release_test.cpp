@@ -157,12 +157,22 @@ TEST_F(Release, InstalledForOneUserPlayedAndUninstalled) {
 TEST_F(Release, InstalledInEnglishWhereThePersonLikes) {
   const std::string directory = "C:\\Área de Jogos\\";
   PutFile(directory + "language.ini", "[TOLVARIS20]\r\nJogar=Jugar\r\n");
-  RunToItsEnd(std::string(Downloaded) + " /S /INGLES /D=C:\\Área de Jogos");
+  RunToItsEnd(std::string(Downloaded) + " /S /INGLES /TVK /D=C:\\Área de Jogos");
   PlayFirstGame(directory, English);
   RunToItsEnd(std::string(Downloaded) + " /S");  // once more, over it
-  const std::vector<std::string> installed = {"CHANGELOG.txt", "Imgs\\",          "LEIAME.txt",          Game,
-                                              "Saves\\",       "desinstalar.exe", "language.antes1.ini", "language.ini",
-                                              "tolvaris.dat",  "tolvaris.exe",    "tolvariscfg.exe"};
+  const std::vector<std::string> installed = {"CHANGELOG.txt",
+                                              "Imgs\\",
+                                              "LEIAME-tvk.txt",
+                                              "LEIAME.txt",
+                                              Game,
+                                              "Saves\\",
+                                              "desinstalar.exe",
+                                              "language.antes1.ini",
+                                              "language.ini",
+                                              "tolvaris.dat",
+                                              "tolvaris.exe",
+                                              "tolvariscfg.exe",
+                                              "tvk.exe"};
   EXPECT_EQ(NamesIn(directory), installed);
   UninstallWithTheSettings(directory);
   const std::vector<std::string> left = {Game, "desinstalar.exe", "language.antes1.ini", "tolvaris.dat"};
@@ -171,6 +181,13 @@ TEST_F(Release, InstalledInEnglishWhereThePersonLikes) {
 }
 
 // Unpacked before the tests run.
-TEST_F(Release, Unzipped) { PlayFirstGame("C:\\Jogos do João\\Tolvaris\\", Portuguese); }
+TEST_F(Release, Unzipped) {
+  const std::string directory = "C:\\Jogos do João\\Tolvaris\\";
+  const std::vector<std::string> unpacked = {"CHANGELOG.txt", "LEIAME-tvk.txt",  "LEIAME.txt",
+                                             "tolvaris.exe",  "tolvariscfg.exe", "translation\\language.ini",
+                                             "tvk.exe"};
+  EXPECT_EQ(NamesIn(directory), unpacked);
+  PlayFirstGame(directory, Portuguese);
+}
 
 }  // namespace
