@@ -81,6 +81,8 @@ struct Machine {
 
   std::map<std::string, std::string> Environment;  // by name in upper case
 
+  int KeysMade = 0;
+
   std::vector<Argument> Arguments;
   std::map<Stream, std::string> Streams;  // what was written
   bool HasConsole = false;

@@ -77,7 +77,8 @@ enum class Fault {
 };
 
 // The n-th call (from 1) that can fail, counted from now, fails: of files, disks, registry, initialisation files,
-// pictures, processes, hashes and streams. A write that fails has written half of its bytes. 0: none. Reset by Reset().
+// pictures, processes, hashes, signatures and streams. A write that fails has written half of its bytes. 0: none. Reset
+// by Reset().
 void FailCall(int n, Fault fault = Fault::Once);
 bool CallFailed();  // whether the fault has been reached
 

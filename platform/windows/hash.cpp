@@ -1,31 +1,14 @@
-// As Windows 7 has it: neither the shorter functions nor the ready handles of Windows 10.
 #include "platform/hash.h"
 
-// clang-format off
-#include <windows.h>
-#include <bcrypt.h>
-// clang-format on
-
-#include <algorithm>
-#include <memory>
+#include "platform/windows/algorithms.h"
 
 namespace platform {
 namespace {
 
-struct ProviderCloser {
-  void operator()(void* provider) const { ::BCryptCloseAlgorithmProvider(provider, 0); }
-};
 struct HashDestroyer {
   void operator()(void* hash) const { ::BCryptDestroyHash(hash); }
 };
-using Provider = std::unique_ptr<void, ProviderCloser>;
 using Hash = std::unique_ptr<void, HashDestroyer>;
-
-Provider OpenProvider() {
-  BCRYPT_ALG_HANDLE provider = nullptr;
-  const NTSTATUS status = ::BCryptOpenAlgorithmProvider(&provider, BCRYPT_SHA256_ALGORITHM, nullptr, 0);
-  return Provider(BCRYPT_SUCCESS(status) ? provider : nullptr);
-}
 
 // Without a buffer of the caller's, Windows makes one.
 Hash CreateHash(const Provider& provider) {
@@ -38,8 +21,7 @@ bool Add(const Hash& hash, std::string_view bytes) {
   constexpr std::size_t most = std::size_t{1} << 30;  // bytes of one call are counted in 32 bits
   while (!bytes.empty()) {
     const std::string_view piece = bytes.substr(0, most);
-    auto* data = reinterpret_cast<PUCHAR>(const_cast<char*>(piece.data()));  // only read
-    if (!BCRYPT_SUCCESS(::BCryptHashData(hash.get(), data, static_cast<ULONG>(piece.size()), 0))) return false;
+    if (!BCRYPT_SUCCESS(::BCryptHashData(hash.get(), Data(piece), static_cast<ULONG>(piece.size()), 0))) return false;
     bytes.remove_prefix(piece.size());
   }
   return true;
@@ -48,7 +30,7 @@ bool Add(const Hash& hash, std::string_view bytes) {
 }  // namespace
 
 std::optional<Sha256Value> Sha256(std::string_view bytes) {
-  const Provider provider = OpenProvider();
+  const Provider provider = OpenProvider(BCRYPT_SHA256_ALGORITHM);
   const Hash hash = CreateHash(provider);
   Sha256Value value = {};
   if (!hash || !Add(hash, bytes)) return std::nullopt;
