@@ -114,6 +114,10 @@ std::optional<DirectoryEntry> ListPath(const std::string& path);
 // longer than `bufferLength` - 1 characters.
 std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_t bufferLength);
 
+// The path of a file or directory however it was reached: whole, without short names, links and drives that stand for
+// directories. For comparing: nothing of it need be in the code page. Nothing when it is missing or does not open.
+std::optional<std::string> GetFinalPathNameA(const std::string& path);
+
 struct DiskFreeSpace {
   std::uint32_t SectorsPerCluster;
   std::uint32_t BytesPerSector;

@@ -95,6 +95,13 @@ bool CreateDirectoryA(const std::string& path) {
   return true;
 }
 
+std::optional<std::string> GetFinalPathNameA(const std::string& path) {
+  const bool fault = Fails();
+  const std::optional<Place> place = Locate(path);
+  if (fault || !place || !place->Found) return std::nullopt;
+  return place->Path;
+}
+
 std::optional<DiskFreeSpace> GetDiskFreeSpaceA(const std::string& root) {
   const bool fault = Fails();
   const bool isRoot = root.size() >= 2 && root[1] == ':' && (root.size() == 2 || root.substr(2) == "\\");

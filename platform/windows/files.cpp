@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "platform/windows/paths.h"
+#include "platform/windows/wide.h"
 
 namespace platform {
 namespace {
@@ -181,6 +182,19 @@ std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_
   if (length == 0 || length >= bufferLength) return std::nullopt;
   buffer.resize(length);
   return buffer;
+}
+
+std::optional<std::string> GetFinalPathNameA(const std::string& path) {
+  constexpr DWORD all = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE, longest = 32'768;
+  const HANDLE opened =
+      ::CreateFileA(WindowsPath(path), 0, all, nullptr, OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr);
+  if (opened == INVALID_HANDLE_VALUE) return std::nullopt;
+  std::wstring name(longest, L'\0');
+  const DWORD length = ::GetFinalPathNameByHandleW(opened, name.data(), longest, FILE_NAME_NORMALIZED);
+  ::CloseHandle(opened);
+  if (length == 0 || length >= longest) return std::nullopt;
+  name.resize(length);
+  return NameToAnsi(name);
 }
 
 }  // namespace platform

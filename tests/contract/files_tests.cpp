@@ -181,6 +181,17 @@ TEST_F(Files, AreAbandonedOnceTheyAreOldAndNobodyHasThemOpen) {
   EXPECT_EQ(Content(a_) + Content(b_), "source(none)");
 }
 
+TEST_F(Files, HaveOneFinalPathHoweverTheyAreReached) {
+  Put(a_);
+  ASSERT_TRUE(CreateDirectoryA(here_ + "dir"));
+  const auto file = GetFinalPathNameA(a_), directory = GetFinalPathNameA(here_);
+  ASSERT_TRUE(file && directory);
+  EXPECT_EQ(*file, *GetFinalPathNameA(here_.substr(0, here_.size() - 1)) + "\\A\xE7\xE3o.smc");
+  EXPECT_EQ(GetFinalPathNameA(here_ + "dir\\..\\a\xE7\xE3O.smc"), file);
+  EXPECT_EQ(GetFinalPathNameA(GetShortPathNameA(a_, 260).value_or("")), file);
+  EXPECT_EQ(GetFinalPathNameA(missing_), std::nullopt);
+}
+
 TEST_F(Files, DisksTellTheirSpaceAndTakeADirectoryWhenTheyAreThere) {
   const string drive = here_.substr(0, 2), root = drive + "\\";
   const auto space = GetDiskFreeSpaceA(drive).value_or(DiskFreeSpace{});
