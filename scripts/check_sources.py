@@ -28,7 +28,7 @@ def project_files():
 
 # What only support/ does: a text that is written where it is shown would escape the translation's checks.
 MESSAGE = re.compile(r'MessageBoxA\(|Traduzir\("')
-SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "collection/", "controller/", "keeper/", "mainwindow/", "package/", "savemanager/")
+SHOWS_NO_TEXTS = ("app/", "autoconfig/", "catalog/", "collection/", "controller/", "keeper/", "mainwindow/", "package/", "repository/", "savemanager/")
 
 
 def layers():
