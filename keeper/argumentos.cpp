@@ -80,13 +80,13 @@ class Leitor {
   void LerOpcao(const std::string& Nome) {
     const auto opcao = std::ranges::find(opcoes_, Nome, &Opcao::Nome);
     if (opcao == opcoes_.end()) return onde_.UsoErrado(Traduzir(Texto::OpcaoDesconhecida, {Nome}));
-    if (pedido_.Tem(Nome)) return onde_.UsoErrado(Traduzir(Texto::OpcaoRepetida, {Nome}));
-    std::string& valor = pedido_.Opcoes[opcao->Nome];
+    if (pedido_.Tem(Nome) && !opcao->Varias) return onde_.UsoErrado(Traduzir(Texto::OpcaoRepetida, {Nome}));
+    auto& valores = pedido_.Opcoes[opcao->Nome];
     if (opcao->Valor.empty()) return;
     if (atual_ == argumentos_.size()) return onde_.UsoErrado(Traduzir(Texto::FaltaOValor, {Nome}));
     const Argument& dado = argumentos_[atual_++];
     if (!dado.Ansi) return onde_.UsoErrado(Nome + ": " + Traduzir(Texto::ForaDaPaginaDeCodigo));
-    valor = *dado.Ansi;
+    valores.push_back(*dado.Ansi);
   }
 
   std::span<const Argument> argumentos_;
@@ -102,7 +102,12 @@ class Leitor {
 const std::string& Pedido::Valor(std::string_view Nome) const {
   static const std::string nenhum;
   const auto achado = Opcoes.find(Nome);
-  return achado == Opcoes.end() ? nenhum : achado->second;
+  return achado == Opcoes.end() || achado->second.empty() ? nenhum : achado->second.front();
+}
+
+std::vector<std::string> Pedido::Valores(std::string_view Nome) const {
+  const auto achado = Opcoes.find(Nome);
+  return achado == Opcoes.end() ? std::vector<std::string>() : achado->second;
 }
 
 std::vector<Argument> ComListas(const std::vector<Argument>& Argumentos, Relato& Onde) {

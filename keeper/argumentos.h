@@ -15,14 +15,16 @@ struct Opcao {
   std::string_view Nome;   // with its two hyphens
   std::string_view Valor;  // the word that stands for its value in the help; empty: it has none
   Texto Descricao;
+  bool Varias = false;  // it may be given more than once
 };
 
 struct Pedido {
-  std::map<std::string_view, std::string> Opcoes;  // those that were given, with their values
-  std::vector<std::string> Arquivos;               // wildcards are expanded; backslashes part their directories
+  std::map<std::string_view, std::vector<std::string>> Opcoes;  // those that were given, with their values
+  std::vector<std::string> Arquivos;  // wildcards are expanded; backslashes part their directories
 
   bool Tem(std::string_view Nome) const { return Opcoes.contains(Nome); }
   const std::string& Valor(std::string_view Nome) const;  // the empty text when it was not given
+  std::vector<std::string> Valores(std::string_view Nome) const;
 };
 
 // The arguments with each "@FILE" replaced by the lines of that file, up to "--". A file that cannot be read is

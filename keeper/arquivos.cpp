@@ -11,21 +11,6 @@
 
 namespace {
 
-// Compared piece by piece, so that only one of the two is in memory.
-bool TemConteudo(const std::string& Caminho, std::string_view Conteudo) {
-  using Pedaco = std::array<char, 65'536>;
-  platform::File arquivo(Caminho, platform::Access::Read);
-  if (arquivo.Size() != static_cast<std::int64_t>(Conteudo.size())) return false;
-  const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
-  for (std::size_t posicao = 0; posicao < Conteudo.size(); posicao += pedaco->size()) {
-    const std::string_view parte = Conteudo.substr(posicao, pedaco->size());
-    const std::int64_t lidos = arquivo.Read(static_cast<std::int64_t>(posicao), pedaco->data(), parte.size());
-    if (lidos != static_cast<std::int64_t>(parte.size())) return false;
-    if (!std::equal(parte.begin(), parte.end(), pedaco->begin())) return false;
-  }
-  return true;
-}
-
 Leitura Falta(Texto Qual) { return {"", Traduzir(Qual)}; }
 
 }  // namespace
@@ -47,6 +32,26 @@ Escrita GravarSeMuda(const std::string& Caminho, std::string_view Conteudo, plat
   if (Existente == platform::Existing::Keep && platform::GetFileAttributesA(Caminho)) return Escrita::Outro;
   CriarCaminho(Caminho);
   return Substituicao(Caminho, Conteudo, Existente).Concluir() ? Escrita::Feita : Escrita::Falhou;
+}
+
+bool TemConteudo(const std::string& Caminho, std::string_view Conteudo) {
+  using Pedaco = std::array<char, 65'536>;
+  platform::File arquivo(Caminho, platform::Access::Read);
+  if (arquivo.Size() != static_cast<std::int64_t>(Conteudo.size())) return false;
+  const auto pedaco = std::make_unique_for_overwrite<Pedaco>();
+  for (std::size_t posicao = 0; posicao < Conteudo.size(); posicao += pedaco->size()) {
+    const std::string_view parte = Conteudo.substr(posicao, pedaco->size());
+    const std::int64_t lidos = arquivo.Read(static_cast<std::int64_t>(posicao), pedaco->data(), parte.size());
+    if (lidos != static_cast<std::int64_t>(parte.size())) return false;
+    if (!std::equal(parte.begin(), parte.end(), pedaco->begin())) return false;
+  }
+  return true;
+}
+
+bool GravarInteiro(const std::string& Caminho, std::string_view Conteudo, platform::Existing Existente) {
+  CriarCaminho(Caminho);
+  ArquivoAoLado novo(Caminho);
+  return novo.Arquivo().Write(0, Conteudo) && novo.Arquivo().Flush() && novo.TomarNome(Existente);
 }
 
 bool EhDiretorio(const std::string& Caminho) {

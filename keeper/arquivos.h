@@ -23,5 +23,12 @@ enum class Escrita { Feita, Igual, Outro, Falhou };  // Outro: with Keep, the fi
 // created.
 Escrita GravarSeMuda(const std::string& Caminho, std::string_view Conteudo, platform::Existing Existente);
 
+// Whether this is all that the file holds. Compared piece by piece, so that only one of the two is in memory.
+bool TemConteudo(const std::string& Caminho, std::string_view Conteudo);
+
+// Writes a file whole or not at all, for those who may read it at any moment: its name never stands for a part of it,
+// not even where the disk is full. The directories on its way are created.
+bool GravarInteiro(const std::string& Caminho, std::string_view Conteudo, platform::Existing Existente);
+
 // True for a directory, whatever other attributes it has.
 bool EhDiretorio(const std::string& Caminho);

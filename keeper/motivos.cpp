@@ -5,6 +5,7 @@
 #include "package/cls_CRC.h"
 #include "package/nomes.h"
 #include "platform/text.h"
+#include "repository/figura.h"
 #include "support/textos.h"
 
 namespace {
@@ -46,6 +47,34 @@ Motivos MotivosDoNome(const std::string& Nome) {
   const FaltaNoNome nome = ConferirNome(platform::ToUtf8(Nome));
   if (nome.Qual == Tipo::Nenhuma) return {};
   return {Traduzir(Texto::NomeErrado, {Nome, EmPalavras(nome, Texto::NomeLongo)})};
+}
+
+Motivos MotivosDaFigura(std::string_view Figura) {
+  switch (ConferirFigura(Figura, ExtensaoDaFigura(Figura))) {
+    case FaltaNaFigura::Nenhuma:
+      return {};
+    case FaltaNaFigura::Grande:
+      return {Traduzir(Texto::FiguraGrande)};
+    case FaltaNaFigura::PontosDemais:
+      return {Traduzir(Texto::FiguraDePontosDemais)};
+    default:
+      return {Traduzir(Texto::FiguraDeOutroTipo)};
+  }
+}
+
+std::string MotivoDaRecusa(const Recusa& Porque) {
+  switch (Porque.Qual) {
+    case Recusa::Tipo::Grande:
+      return Traduzir(Texto::MaiorQuePode);
+    case Recusa::Tipo::VersaoNova:
+      return Traduzir(Texto::DeVersaoNova);
+    case Recusa::Tipo::AssinaturaErrada:
+      return Traduzir(Texto::AssinaturaNaoConfere);
+    case Recusa::Tipo::FaltaChave:
+      return Traduzir(Texto::FaltaALinha, {Porque.Chave});
+    default:
+      return Traduzir(Texto::LinhaNaoServe, {std::to_string(Porque.Linha)});
+  }
 }
 
 Motivos MotivosDosNomes(const std::string& Nome, const std::string& NomeDOS) {

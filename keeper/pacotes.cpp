@@ -32,7 +32,7 @@ Motivos LerEFazer(const std::string& Arquivo, std::int64_t& Tamanho, const ComPa
   if (!lido.Falta.empty()) return {lido.Falta};
   const auto pacote = LerPacote(lido.Conteudo);
   if (!pacote) return {Traduzir(MotivoDe(DefeitoDe(lido.Conteudo)))};
-  return Fazer({Arquivo, Tamanho, *pacote});
+  return Fazer({Arquivo, Tamanho, *pacote, lido.Conteudo});
 }
 
 // Whatever goes wrong unexpectedly is a want of memory.

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "keeper/argumentos.h"
@@ -14,6 +15,7 @@ struct PacoteLido {
   const std::string& Arquivo;
   std::int64_t Tamanho;  // bytes of the file
   const Pacote& Conteudo;
+  std::string_view Bytes;  // the whole file
 };
 
 using Motivos = std::vector<std::string>;  // why something is refused; none: it is not

@@ -35,6 +35,12 @@ constexpr Opcao OpcoesDeInstalar[] = {
     {"--instalacao", "DIR", Texto::OpcaoEmInstalacao},
     {"--substituir", "", Texto::OpcaoSubstituir},
 };
+constexpr Opcao OpcoesDePublicar[] = {
+    {"--titulo", "T", Texto::OpcaoTitulo},        {"--espelho", "URL", Texto::OpcaoEspelho, true},
+    {"--validade", "DIAS", Texto::OpcaoValidade}, {"--lista", "LISTA.csv", Texto::OpcaoListaDePublicar},
+    {"--limpar", "", Texto::OpcaoLimpar},         {"--simular", "", Texto::OpcaoSimular},
+    {"--chave", "ARQUIVO", Texto::OpcaoChave},    {"--repositorio", "DIR", Texto::OpcaoRepositorio},
+};
 
 struct Verbo {
   std::string_view Nome;
@@ -63,6 +69,13 @@ constexpr Verbo Verbos[] = {
      Instalar},
     {"nomear", Texto::TvkNomear, {"tvk nomear --instalacao DIR [--simular] LISTA.csv"}, OpcoesDeNomear, Nomear},
     {"desfazer", Texto::TvkDesfazer, {"tvk desfazer --instalacao DIR ARQUIVO"}, OpcoesDeDesfazer, Desfazer},
+    {"chave", Texto::TvkChave, {"tvk chave ARQUIVO"}, {}, FazerChave},
+    {"publicar",
+     Texto::TvkPublicar,
+     {"tvk publicar [--titulo T] [--espelho URL]... [--validade DIAS] [--limpar]",
+      "             [--lista LISTA.csv] [--simular] --chave ARQUIVO", "             --repositorio DIR PACOTE|DIR..."},
+     OpcoesDePublicar,
+     Publicar},
 };
 
 // A word and what it means.

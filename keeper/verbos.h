@@ -11,3 +11,5 @@ void Extrair(const Pedido& Feito, Relato& Onde);
 void Instalar(const Pedido& Feito, Relato& Onde);
 void Nomear(const Pedido& Feito, Relato& Onde);
 void Desfazer(const Pedido& Feito, Relato& Onde);
+void FazerChave(const Pedido& Feito, Relato& Onde);
+void Publicar(const Pedido& Feito, Relato& Onde);

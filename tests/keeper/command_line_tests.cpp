@@ -13,6 +13,12 @@ struct CommandLine : Keeper {
     PutFile("C:\\Tolvaris\\language.ini", platform::FromUtf8(content));
   }
 
+  static Texts NineMirrors() {
+    Texts arguments = {"publicar", "--chave", "k", "--repositorio", "r", "x"};
+    for (int i = 0; i < 9; ++i) arguments.insert(arguments.end(), {"--espelho", "https://a.example/"});
+    return arguments;
+  }
+
   static void PutPackages() {
     for (const char* name : {"Um", "Dois", "Três"}) {
       PutFile("C:\\Tolvaris\\p\\"s + platform::FromUtf8(name) + ".tvk", Package(platform::FromUtf8(name), "UM"));
@@ -23,7 +29,8 @@ struct CommandLine : Keeper {
 TEST_F(CommandLine, HelpFitsOneScreenInBothLanguages) {
   const std::pair<Texts, Texts> cases[] = {
       // the arguments, and words that the help has
-      {{"--ajuda"}, {"criar ", "listar ", "verificar ", "extrair ", "instalar ", "nomear ", "desfazer "}},
+      {{"--ajuda"},
+       {"criar ", "listar ", "verificar ", "extrair ", "instalar ", "nomear ", "desfazer ", "chave ", "publicar "}},
       {{"criar", "--ajuda"}, {"--nome", "--dos", "--figura", "--saida", "--instalacao", "--lista"}},
       {{"listar", "--ajuda"}, {"--csv"}},
       {{"verificar", "x", "--ajuda"}, {"--csv"}},
@@ -31,6 +38,9 @@ TEST_F(CommandLine, HelpFitsOneScreenInBothLanguages) {
       {{"instalar", "--ajuda"}, {"--instalacao", "--substituir"}},
       {{"nomear", "--ajuda"}, {"--instalacao", "--simular"}},
       {{"desfazer", "--ajuda"}, {"--instalacao"}},
+      {{"chave", "--ajuda"}, {"tvk chave ARQUIVO"}},
+      {{"publicar", "--ajuda"},
+       {"--titulo", "--espelho", "--validade", "--lista", "--limpar", "--simular", "--chave", "--repositorio"}},
   };
   for (const bool english : {false, true}) {
     if (english) TranslateIntoEnglish();
@@ -72,6 +82,22 @@ TEST_F(CommandLine, WhatIsWrongIsToldAndEndsWith2) {
       {"a name for two games",
        {"criar", "--nome", "X", "a.smc", "b.smc"},
        "--nome, --dos e --figura valem para um jogo só"},
+      {"two keys", {"chave", "a", "b"}, "só pode vir um arquivo"},
+      {"no key", {"publicar", "--repositorio", "r", "x"}, "falta a opção --chave"},
+      {"no repository", {"publicar", "--chave", "k", "--repositorio", "", "x"}, "falta a opção --repositorio"},
+      {"an empty title",
+       {"publicar", "--chave", "k", "--repositorio", "r", "--titulo", "", "x"},
+       "--titulo é uma linha de texto, nem vazia nem longa demais"},
+      {"a mirror of another kind",
+       {"publicar", "--chave", "k", "--repositorio", "r", "--espelho", "http://a/", "x"},
+       "--espelho http://a/ não serve: https://, sem usuário, ? nem #, e com / no fim"},
+      {"nine mirrors", NineMirrors(), "--espelho pode vir até 8 vezes"},
+      {"no days",
+       {"publicar", "--chave", "k", "--repositorio", "r", "--validade", "0", "x"},
+       "--validade é um número de dias, de 1 a 36500"},
+      {"too many days",
+       {"publicar", "--chave", "k", "--repositorio", "r", "--validade", "36501", "x"},
+       "--validade é um número de dias, de 1 a 36500"},
   };
   for (const auto& [name, arguments, said] : cases) {
     EXPECT_EQ(RunTvk(arguments), (Outcome{2, "", "tvk: " + said + "\nVeja tvk --ajuda.\n"})) << name;

@@ -37,6 +37,13 @@ TEST_F(Packages, AreVerifiedAndEveryReasonIsToldWithItsFile) {
        Package("Novo 2", "NOVO2", "123456788"),
        {"a soma do jogo é outra: o pacote está cortado ou danificado"}},
       {"dispositivo", Package("Novo 3", "CON"), {"um nome do pacote sairia da coleção"}},
+      {"figura de outro tipo",
+       Package("Novo 8", "NOVO8", Rom, contract::SmallPng()),
+       {"a figura não é .gif, .bmp nem .jpg"}},
+      {"figura de pontos demais",
+       Package("Novo 9", "NOVO9", Rom, contract::SmallJpeg({2'001, 2'000}) + std::string(8'000, 'x')),
+       {"a figura tem mais de 4 megapixels"}},
+      {"figura grande", Package("Novo 10", "NOVO10", Rom, Picture + megabyte), {"a figura tem mais de 1 MiB"}},
       {"longo",
        Package(std::string(101, 'x'), "NOVE_LETR"),
        {"o nome '" + std::string(101, 'x') + "' tem mais de 100 caracteres",
@@ -70,7 +77,7 @@ TEST_F(Packages, AreVerifiedAndEveryReasonIsToldWithItsFile) {
     }
   }
   const Files before = Standing();
-  EXPECT_EQ(RunTvk({"verificar", "C:\\p"}), (Outcome{1, "Pacotes bons: 1; recusados: 14.\n", errors}));
+  EXPECT_EQ(RunTvk({"verificar", "C:\\p"}), (Outcome{1, "Pacotes bons: 1; recusados: 17.\n", errors}));
   EXPECT_EQ(RunTvk({"verificar", "--csv", "C:\\p"}), (Outcome{1, table, errors}));
   EXPECT_EQ(Standing(), before);
 }

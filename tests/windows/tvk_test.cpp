@@ -140,6 +140,38 @@ TEST_F(Tvk, NamesGamesWhileNobodyHasTheCatalogueOpenAndTakesItBack) {
   ExpectFiles(pictures, FilesIn(Home + "Imgs\\"));
 }
 
+// Keys and signatures as OpenSSL has them, and the whole as a reader in Python.
+TEST_F(Tvk, PublishesWhatOtherProgramsConfirm) {
+  PutFile(Outside + "p\\um.tvk", Package("Ação", "ACAO", "-873187034", Gif(RGB(220, 20, 40)), "123456789"));
+  PutFile(Outside + "p\\dois.tvk", Package("Dois", "DOIS", "-873187034", Gif(RGB(1, 2, 3)), "123456789"));
+  const Ended made = RunTvk(L"chave k.pem");
+  EXPECT_EQ(made.Status, 0u);
+  const Ended again = RunTvk(L"chave k.pem");
+  EXPECT_EQ(again.Status, 1u);
+  const std::wstring publish = L"publicar --chave k.pem --repositorio r p";
+  const Ended first = RunTvk(publish + L" --titulo \"Clube S\x00E3o Jo\x00E3o\" --espelho https://a.example/");
+  EXPECT_EQ(first.Errors, "");
+  EXPECT_NE(first.Output.find("Publicado com o n\xC3\xBAmero de s\xC3\xA9rie "), std::string::npos) << first.Output;
+
+  EXPECT_EQ(Machine("openssl ec -in k.pem -noout -check 2>&1 | tail -n 1"), "EC Key valid.\n");
+  const std::string print =
+      Machine("openssl ec -in k.pem -pubout -outform DER 2>&- | tail -c 65 | sha256sum | cut -c 1-64");
+  EXPECT_NE(made.Output.find(" da chave: " + print), std::string::npos) << print << made.Output;
+  EXPECT_NE(first.Output.find(" da chave: " + print), std::string::npos);
+  const std::string read = Machine("python3 '" READ_REPOSITORY_PY "' r");
+  EXPECT_EQ(read.substr(0, 17), "Clube S\xC3\xA3o Jo\xC3\xA3o ") << read;
+  EXPECT_EQ(read.substr(read.find('\n')), "\nA\xC3\xA7\xC3\xA3o\nDois\n");
+  EXPECT_EQ(Machine("cd r && for f in */*; do n=${f#*/}; sha256sum $f | grep -q ^${n%.*} || echo $f; done"), "");
+
+  const Files published = FilesIn(Outside + "r\\");
+  EXPECT_EQ(published.size(), 6u);
+  EXPECT_EQ(RunTvk(publish).Errors, "");
+  ExpectFiles(published, FilesIn(Outside + "r\\"));
+  EXPECT_EQ(Machine("openssl genpkey -algorithm EC -pkeyopt ec_paramgen_curve:P-256 -out outra.pem"), "");
+  EXPECT_EQ(RunTvk(L"publicar --chave outra.pem --repositorio r2 --titulo X p").Errors, "");
+  EXPECT_EQ(Machine("python3 '" READ_REPOSITORY_PY "' r2").substr(0, 2), "X ");
+}
+
 TEST_F(Tvk, RefusesByNameWhatTheCodePageLacks) {
   EXPECT_EQ(RunTvk(L"verificar \x65E5\x672C.tvk"),
             (Ended{1, "",
