@@ -4,6 +4,7 @@
 #include "keeper/instalacao.h"
 #include "keeper/levas.h"
 #include "keeper/verbos.h"
+#include "platform/clock.h"
 #include "support/caminhos.h"
 #include "support/gravacao.h"
 #include "support/mod_Globais.h"

@@ -27,9 +27,6 @@ bool IsConsole(Stream stream);
 // takes all.
 bool WriteStream(Stream stream, std::string_view utf8);
 
-// The day of the system's calendar, as "2026-11-23".
-std::string LocalDate();
-
 // Milliseconds since the machine was started.
 std::uint64_t GetTickCount64();
 

@@ -6,8 +6,6 @@
 // clang-format on
 
 #include <algorithm>
-#include <array>
-#include <cstdio>
 #include <memory>
 
 #include "platform/text.h"
@@ -77,14 +75,6 @@ bool WriteStream(Stream stream, std::string_view utf8) {
   const HANDLE handle = HandleOf(stream);
   if (handle == nullptr) return true;
   return IsConsole(stream) ? WriteToConsole(handle, Decode(CP_UTF8, 0, utf8)) : WriteToFile(handle, utf8);
-}
-
-std::string LocalDate() {
-  SYSTEMTIME now = {};
-  ::GetLocalTime(&now);
-  std::array<char, 40> text{};
-  std::snprintf(text.data(), text.size(), "%04d-%02d-%02d", now.wYear, now.wMonth, now.wDay);
-  return text.data();
 }
 
 std::uint64_t GetTickCount64() { return ::GetTickCount64(); }
