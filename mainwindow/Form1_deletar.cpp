@@ -1,4 +1,5 @@
-// The delete command. Only the ROM file goes; the catalogue's entry and the picture stay for when it comes back.
+// The delete command. Only the ROM file goes, to the recycle bin; the catalogue's entry and the picture stay for when
+// it comes back.
 #include "mainwindow/Form1.h"
 #include "support/mensagens.h"
 #include "support/mod_Arquivos.h"
@@ -11,7 +12,7 @@ void Form1::Command6_Click() {
     return;
   }
   Desativar(false);
-  ApagarArquivo(escolhido->Arquivo);
+  DescartarArquivo(escolhido->Arquivo);
   const int indiceAntigo = List1.Selected();
   CarregarLista(true);
   SelecionarVizinho(indiceAntigo);

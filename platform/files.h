@@ -73,6 +73,10 @@ std::optional<std::int64_t> FileSize(const std::string& path);
 
 bool DeleteFileA(const std::string& path);  // false for a missing, read-only or open file
 
+// Puts a file into its disk's recycle bin, without any dialog; where the disk has none it may be deleted. True when it
+// is gone. False, and it stays, for what DeleteFileA would leave, and where the shell cannot do it.
+bool MoveToRecycleBin(const std::string& path);
+
 // Deletes a file that no program has open, and that was changed last before the machine was started or more than so
 // many seconds ago. False when it stays; one that was changed in the future stays.
 bool DeleteAbandonedFile(const std::string& path, std::uint32_t seconds);

@@ -121,6 +121,10 @@ Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const
 
 void ApagarArquivo(const std::string& Caminho) { platform::DeleteFileA(Caminho); }
 
+void DescartarArquivo(const std::string& Caminho) {
+  if (!platform::MoveToRecycleBin(Caminho)) ApagarArquivo(Caminho);
+}
+
 std::int32_t TamanhoArquivo(const std::string& Caminho) {
   return static_cast<std::int32_t>(std::clamp<std::int64_t>(platform::FileSize(Caminho).value_or(0), 0, MaiorTamanho));
 }

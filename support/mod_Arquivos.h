@@ -39,6 +39,9 @@ Copia CopiarArquivo(const std::string& Origem, const std::string& Destino, const
 // A file that is missing or cannot be deleted is left alone.
 void ApagarArquivo(const std::string& Caminho);
 
+// The same for what the person may want back: it goes to the recycle bin, where there is one.
+void DescartarArquivo(const std::string& Caminho);
+
 // The length in bytes; 0 for a file that is missing or cannot be seen, and the largest number for a longer file than it
 // can tell.
 std::int32_t TamanhoArquivo(const std::string& Caminho);

@@ -76,6 +76,10 @@ void SetProgramDirectory(const std::string& directory) {
 
 void KeepNoShortNames() { TheMachine().ShortNames = false; }
 
+void KeepNoRecycleBin() { TheMachine().HasRecycleBin = false; }
+
+std::vector<std::string> Recycled() { return TheMachine().RecycleBin; }
+
 void PutDirectory(const std::string& path, std::uint32_t attributes) {
   PutParents(path);
   Place place = Demand(path);

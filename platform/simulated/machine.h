@@ -59,7 +59,8 @@ struct QueuedEvent {
 struct Machine {
   std::map<char, std::shared_ptr<Disk>> Disks;
   std::string ProgramDirectory = "C:\\";
-  bool ShortNames = true;
+  bool ShortNames = true, HasRecycleBin = true;
+  std::vector<std::string> RecycleBin;  // full paths
   unsigned CodePage = 1252;
   std::map<std::intptr_t, OpenFile> OpenFiles;
   std::map<std::string, std::uint64_t> Writes;  // by full path in upper case

@@ -62,6 +62,15 @@ bool DeleteFileA(const std::string& path) {
   return true;
 }
 
+bool MoveToRecycleBin(const std::string& path) {
+  const bool fault = Fails();
+  std::optional<Place> place = Locate(path);
+  if (fault || !MayDelete(place) || !TheMachine().HasRecycleBin) return false;
+  TheMachine().RecycleBin.push_back(place->Path);
+  simulated::Detach(*place);
+  return true;
+}
+
 bool DeleteAbandonedFile(const std::string& path, std::uint32_t seconds) {
   const bool fault = Fails();
   std::optional<Place> place = Locate(path);

@@ -29,6 +29,9 @@ void SetFreeSpace(char letter, std::uint64_t bytes);
 void SetProgramDirectory(const std::string& directory);
 void KeepNoShortNames();  // from now on no file and no directory gets one, as on a disk that is set up so
 
+void KeepNoRecycleBin();              // the shell cannot recycle any more
+std::vector<std::string> Recycled();  // full paths of what was put into the recycle bin, in order
+
 void PutDirectory(const std::string& path, std::uint32_t attributes = 0x10);                       // with its parents
 void PutFile(const std::string& path, std::string_view content, std::uint32_t attributes = 0x20);  // with its parents
 // A file whose name has letters that the code page lacks, each a "?" here: only its short name leads to it, if any.

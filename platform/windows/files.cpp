@@ -194,7 +194,7 @@ std::optional<std::string> GetFinalPathNameA(const std::string& path) {
   ::CloseHandle(opened);
   if (length == 0 || length >= longest) return std::nullopt;
   name.resize(length);
-  return NameToAnsi(name);
+  return NameToAnsi(name).Text;
 }
 
 }  // namespace platform

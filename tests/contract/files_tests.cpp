@@ -69,6 +69,20 @@ TEST_F(Files, OpenAloneLeaveAllOthersOut) {
   }
 }
 
+TEST_F(Files, AreRecycledOnlyWhereTheyCouldBeDeleted) {
+  Put(a_);
+  ASSERT_TRUE(CreateDirectoryA(here_ + "dir"));
+  {
+    const File open(a_, Access::Read);
+    EXPECT_FALSE(MoveToRecycleBin(a_)) << "open";
+  }
+  EXPECT_FALSE(MoveToRecycleBin(missing_));
+  EXPECT_FALSE(MoveToRecycleBin(here_ + "dir"));
+  EXPECT_TRUE(GetFileAttributesA(here_ + "dir"));
+  const bool moved = MoveToRecycleBin(a_);  // the shell may not be able to
+  EXPECT_EQ(GetFileAttributesA(a_).has_value(), !moved);
+}
+
 TEST_F(Files, BytePositionsAndSizesAreExact) {
   File file(a_, Access::ReadWrite), reader(a_, Access::Read), other(a_, Access::ReadWrite);
   EXPECT_TRUE(file.Write(0, string("\0\r\n\x1A\xFF|=", 7)));

@@ -179,6 +179,21 @@ TEST_F(Commands, DeleteAsksRemovesTheRomAndSelectsTheNeighbour) {
     EXPECT_EQ(ContentOf(form->Image1.ShownPicture()), picture) << name;
   }
   EXPECT_EQ(TakeMessages()[0], Told(Mensagem::DeletarJogo, "Sem figura"));
+  EXPECT_EQ(Recycled(), (Texts{Roms + "ULTIMO.SMC", Roms + "Nome comprido.smc", Roms + "SUPERJOG.zip"}));
+}
+
+TEST_F(Commands, DeleteWorksWithoutARecycleBinAndLeavesWhatIsReadOnly) {
+  KeepNoRecycleBin();
+  SetAttributes(Roms + "ULTIMO.SMC", platform::AttributeReadOnly);
+  ASSERT_TRUE(Start());
+  for (const char* game : {"Super Jogo", "Sem figura"}) {
+    Pick(game);
+    QueueAnswer(Answer::Yes);
+    Click(form->Command6);
+  }
+  EXPECT_FALSE(Content(Roms + "SUPERJOG.zip"));
+  EXPECT_TRUE(Content(Roms + "ULTIMO.SMC"));
+  EXPECT_EQ(Recycled(), Texts{});
 }
 
 }  // namespace
