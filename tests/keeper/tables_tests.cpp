@@ -2,6 +2,7 @@
 #include "keeper/codificacao.h"
 #include "keeper/csv.h"
 #include "keeper/nome_dos.h"
+#include "keeper/rom.h"
 #include "keeper/zip.h"
 #include "tests/keeper/keeper.h"
 
@@ -80,6 +81,14 @@ TEST(Encoding, IsToldFromTheBytes) {
       {"five bytes", "\xF5\xBF\xBF\xBF", "\xC3\xB5\xC2\xBF\xC2\xBF\xC2\xBF"},
   };
   for (const auto& [name, content, utf8] : cases) EXPECT_EQ(EmUtf8(content), utf8) << name;
+}
+
+TEST(Roms, AreKnownByTheirExtension) {
+  const std::pair<const char*, bool> cases[] = {
+      {"C:\\p\\a.smc", true}, {"a.SFC", true}, {"a.zip", true},   {"a.b.zip", true},
+      {"C:\\p\\.smc", false}, {"asmc", false}, {"a.smc2", false}, {"a.tvk", false},
+  };
+  for (const auto& [file, isRom] : cases) EXPECT_EQ(EhRom(file), isRom) << file;
 }
 
 TEST(DosNames, StayWhereTheyCanAndElseComeFromTheName) {
