@@ -60,6 +60,15 @@ bool IsOld(const FILETIME& changed, std::uint32_t seconds) {
   return Number(changed) < started || Number(changed) + seconds * second < Number(now);
 }
 
+// Empty where the name cannot be had in this form: disks that the system did not mount itself have no letter for it.
+std::wstring FinalName(HANDLE opened, DWORD form) {
+  constexpr DWORD longest = 32'768;
+  std::wstring name(longest, L'\0');
+  const DWORD length = ::GetFinalPathNameByHandleW(opened, name.data(), longest, FILE_NAME_NORMALIZED | form);
+  name.resize(length < longest ? length : 0);
+  return name;
+}
+
 }  // namespace
 
 File::File(const std::string& path, Access access) : handle_(reinterpret_cast<std::intptr_t>(OpenFile(path, access))) {
@@ -185,16 +194,14 @@ std::optional<std::string> GetShortPathNameA(const std::string& path, std::size_
 }
 
 std::optional<std::string> GetFinalPathNameA(const std::string& path) {
-  constexpr DWORD all = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE, longest = 32'768;
+  constexpr DWORD all = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE;
   const HANDLE opened =
       ::CreateFileA(WindowsPath(path), 0, all, nullptr, OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr);
   if (opened == INVALID_HANDLE_VALUE) return std::nullopt;
-  std::wstring name(longest, L'\0');
-  const DWORD length = ::GetFinalPathNameByHandleW(opened, name.data(), longest, FILE_NAME_NORMALIZED);
+  std::wstring name = FinalName(opened, VOLUME_NAME_DOS);
+  if (name.empty()) name = FinalName(opened, VOLUME_NAME_NT);
   ::CloseHandle(opened);
-  if (length == 0 || length >= longest) return std::nullopt;
-  name.resize(length);
-  return NameToAnsi(name).Text;
+  return name.empty() ? std::nullopt : std::optional(NameToAnsi(name).Text);
 }
 
 }  // namespace platform
