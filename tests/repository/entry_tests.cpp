@@ -1,5 +1,4 @@
 #include "platform/hash.h"
-#include "repository/base64.h"
 #include "repository/chave.h"
 #include "repository/entrada.h"
 #include "tests/repository/repository.h"
@@ -149,19 +148,6 @@ TEST_F(Entry, IsNotSignedWhenNobodyWouldReadIt) {
   EXPECT_FALSE(AssinarEntrada(entry, key)) << "it would be read as another one";
   entry.Titulo.clear();
   EXPECT_FALSE(AssinarEntrada(entry, key));
-}
-
-TEST(Base64, HasOneFormForEachBytes) {
-  const std::pair<const char*, const char*> cases[] = {
-      {"", ""}, {"f", "Zg=="}, {"fo", "Zm8="}, {"foo", "Zm9v"}, {"foob", "Zm9vYg=="}, {"\xFF\xEF\xBE", "/+++"},
-  };
-  for (const auto& [bytes, text] : cases) {
-    EXPECT_EQ(EmBase64(bytes), text);
-    EXPECT_EQ(DeBase64(text), bytes) << text;
-  }
-  for (const char* wrong : {"Zh==", "Zg", "Zg=", "Zg===", "Z", "Zg==Zg==", "Zm9v\n", "Zm 9v", "_-__", "="}) {
-    EXPECT_FALSE(DeBase64(wrong)) << wrong;
-  }
 }
 
 // Made by OpenSSL 3: openssl genpkey -algorithm EC -pkeyopt ec_paramgen_curve:P-256; the fingerprint by sha256sum.
