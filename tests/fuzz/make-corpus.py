@@ -135,6 +135,8 @@ REPOSITORIES = {
     "entry-more": ENTRY.replace(b"Serie", b"Mais: x\nEspelho: https://b/\nSerie"),
     "index": GAME + b"Figura: " + HASH + b" 43 gif\nAutor: Ana\nLicenca: Livre\n\n" + GAME.replace(b"SUPER", b"Z").replace(
         b"Super", b"Zebra") + "Descricao: É dela\nVersao: 1\n".encode(),
+    "index-order": GAME.replace(b"SUPER", b"Z").replace(b"Super", b"Zebra") + b"\n" + GAME,
+    "index-twice": GAME.replace(b"SUPER", b"Z") + b"\n" + GAME.replace(b"Super", b"super"),
     "pieces": "Ação\nACAO\nAna\nLivre\nUm jogo: dela".encode(),
     "pieces-odd": b"a|b\nCON\n\xff\n\r\nx\nNome: y",
     "base64": b"Zg==",
