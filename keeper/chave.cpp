@@ -13,7 +13,7 @@ void FazerChave(const Pedido& Feito, Relato& Onde) {
   const auto impressao = chave ? ImpressaoDigital(chave->Public) : std::nullopt;
   if (!impressao) return Onde.Recusar(arquivo, Traduzir(Texto::ChaveNaoFeita));
   if (!GravarInteiro(arquivo, EscreverChave(*chave), platform::Existing::Keep)) {
-    return Onde.Recusar(arquivo, Traduzir(Texto::NaoPodeSerGravado, {arquivo}));
+    return Onde.Recusar(arquivo, Traduzir(Texto::NaoFoiGravado));
   }
   Onde.Linha(Traduzir(Texto::ImpressaoDaChave, {*impressao}));
   Onde.Linha(Traduzir(Texto::GuardeAChave));

@@ -72,7 +72,7 @@ bool Repositorio::Por(const std::string& Arquivo, std::string_view Conteudo, pla
                       Relato& Onde) const {
   const std::string caminho = Caminho(Arquivo);
   if (TemConteudo(caminho, Conteudo) || GravarInteiro(caminho, Conteudo, Existente)) return true;
-  Onde.Recusar(caminho, Traduzir(Texto::NaoPodeSerGravado, {caminho}));
+  Onde.Recusar(caminho, Traduzir(Texto::NaoFoiGravado));
   return false;
 }
 

@@ -172,6 +172,7 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "foi assinado com outra chave",
     "o índice está danificado",
     "mudou enquanto era publicado",
+    "não pode ser gravado",
     "não pode ser apagado",
     "o Tolvaris não está ao lado do tvk.exe; use --instalacao",
     "já há outro jogo com esse nome ou arquivo; --substituir o troca",

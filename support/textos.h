@@ -171,6 +171,7 @@ enum class Texto {
   DeOutraChave,
   IndiceDanificado,
   MudouAoPublicar,
+  NaoFoiGravado,
   NaoPodeSerApagado,
   SemMenu,
   JaHaOutroJogo,
