@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <memory>
+#include <new>
 
 #include "support/caminhos.h"
 #include "support/gravacao.h"
@@ -11,20 +12,39 @@
 
 namespace {
 
-Leitura Falta(Texto Qual) { return {"", Traduzir(Qual)}; }
+Texto PorQueNaoAbre(const std::string& Caminho) {
+  const auto atributos = platform::GetFileAttributesA(Caminho);
+  if (!atributos) return Texto::NaoExiste;
+  return (*atributos & platform::AttributeDirectory) != 0 ? Texto::EhUmDiretorio : Texto::NaoPodeSerLido;
+}
+
+bool DarTamanho(std::string& Texto, std::int64_t Tamanho) {
+  try {
+    Texto.resize(static_cast<std::size_t>(Tamanho));
+    return true;
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+}
 
 }  // namespace
 
-Leitura LerTudo(const std::string& Caminho) {
-  if (EhDiretorio(Caminho)) return Falta(Texto::EhUmDiretorio);
+std::string LerPara(std::string& Conteudo, const std::string& Caminho) {
   platform::File arquivo(Caminho, platform::Access::Read);
-  if (!arquivo.IsOpen() && !platform::GetFileAttributesA(Caminho)) return Falta(Texto::NaoExiste);
+  if (!arquivo.IsOpen()) return Traduzir(PorQueNaoAbre(Caminho));
   const std::int64_t tamanho = arquivo.Size();
-  if (tamanho > MaiorArquivo) return Falta(Texto::GrandeDemais);
-  auto conteudo = tamanho < 0 ? std::nullopt : LerInteiro(arquivo);
-  if (!conteudo || static_cast<std::int64_t>(conteudo->size()) != tamanho) return Falta(Texto::NaoPodeSerLido);
-  if (tamanho == 0) return Falta(Texto::EstaVazio);
-  return {std::move(*conteudo), ""};
+  if (tamanho > MaiorArquivo) return Traduzir(Texto::GrandeDemais);
+  if (tamanho == 0) return Traduzir(Texto::EstaVazio);
+  if (tamanho > 0 && !DarTamanho(Conteudo, tamanho)) return Traduzir(Texto::SemMemoria);
+  const bool lido = tamanho > 0 && arquivo.Read(0, Conteudo.data(), Conteudo.size()) == tamanho;
+  return lido ? "" : Traduzir(Texto::NaoPodeSerLido);
+}
+
+Leitura LerTudo(const std::string& Caminho) {
+  Leitura lida;
+  lida.Falta = LerPara(lida.Conteudo, Caminho);
+  if (!lida.Falta.empty()) lida.Conteudo.clear();
+  return lida;
 }
 
 Escrita GravarSeMuda(const std::string& Caminho, std::string_view Conteudo, platform::Existing Existente) {

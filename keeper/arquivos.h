@@ -17,6 +17,9 @@ struct Leitura {
 // All bytes of a file.
 Leitura LerTudo(const std::string& Caminho);
 
+// The same into a text whose memory serves for one file after the other. Why it could not be read, or the empty text.
+std::string LerPara(std::string& Conteudo, const std::string& Caminho);
+
 enum class Escrita { Feita, Igual, Outro, Falhou };  // Outro: with Keep, the file is there with another content
 
 // Makes the text a file's content, unless it is already, and then writes nothing. The directories on its way are

@@ -1,5 +1,7 @@
 #include "keeper/pacotes.h"
 
+#include <iterator>
+
 #include "keeper/arquivos.h"
 #include "support/textos.h"
 
@@ -26,36 +28,50 @@ Texto MotivoDe(DefeitoDoPacote Defeito) {
   }
 }
 
-Motivos LerEFazer(const std::string& Arquivo, std::int64_t& Tamanho, const ComPacote& Fazer) {
-  const Leitura lido = LerTudo(Arquivo);
-  Tamanho = static_cast<std::int64_t>(lido.Conteudo.size());
-  if (!lido.Falta.empty()) return {lido.Falta};
-  const auto pacote = LerPacote(lido.Conteudo);
-  if (!pacote) return {Traduzir(MotivoDe(DefeitoDe(lido.Conteudo)))};
-  return Fazer({Arquivo, Tamanho, *pacote, lido.Conteudo});
-}
+// Reads one package after the other into the same memory.
+class Leitor {
+ public:
+  explicit Leitor(const ComPacote& Fazer) : fazer_(Fazer) {}
 
-// Whatever goes wrong unexpectedly is a want of memory.
-Motivos SemExcecao(const std::string& Arquivo, std::int64_t& Tamanho, const ComPacote& Fazer) {
-  try {
-    return LerEFazer(Arquivo, Tamanho, Fazer);
-  } catch (...) {
-    return {Traduzir(Texto::SemMemoria)};
+  // Whatever goes wrong unexpectedly is a want of memory.
+  Motivos LerEFazer(const std::string& Arquivo) {
+    tamanho_ = 0;
+    try {
+      return Ler(Arquivo);
+    } catch (...) {
+      return {Traduzir(Texto::SemMemoria)};
+    }
   }
-}
+
+  std::int64_t Tamanho() const { return tamanho_; }  // bytes of the last one that could be read
+
+ private:
+  Motivos Ler(const std::string& Arquivo) {
+    const std::string falta = LerPara(conteudo_, Arquivo);
+    if (!falta.empty()) return {falta};
+    tamanho_ = std::ssize(conteudo_);
+    const auto pacote = LerPacote(conteudo_);
+    if (!pacote) return {Traduzir(MotivoDe(DefeitoDe(conteudo_)))};
+    return fazer_({Arquivo, tamanho_, *pacote, conteudo_});
+  }
+
+  const ComPacote& fazer_;
+  std::string conteudo_;
+  std::int64_t tamanho_ = 0;
+};
 
 }  // namespace
 
 void ParaCadaPacote(const Pedido& Feito, Relato& Onde, const ComPacote& Fazer, const DepoisDoPacote& Depois) {
   std::vector<std::string> pacotes;
   for (const std::string& argumento : Feito.Arquivos) AcrescentarPacotes(pacotes, argumento, Onde);
+  Leitor leitor(Fazer);
   Onde.Comecar(pacotes.size());
   for (const std::string& arquivo : pacotes) {
-    std::int64_t tamanho = 0;
-    const Motivos porque = SemExcecao(arquivo, tamanho, Fazer);
+    const Motivos porque = leitor.LerEFazer(arquivo);
     for (const std::string& cada : porque) Onde.Recusar(arquivo, cada);
     if (Depois) Depois(arquivo, porque);
-    Onde.Andar(tamanho);
+    Onde.Andar(leitor.Tamanho());
   }
   Onde.Terminar();
 }
