@@ -37,16 +37,18 @@ class Renomeacao {
 
   bool MudaAlgo() const { return !trocas_.Mudam.empty(); }
 
-  // The file to undo it is on the disk before anything changes.
-  void Fazer() {
+  // The file to undo it is on the disk before anything changes. False: it could not be done, and that is told.
+  bool Fazer() {
     if (!Substituicao(Diario(), EmTexto(mudanca_), platform::Existing::Keep).Concluir()) {
-      return onde_.Recusar(Diario(), Traduzir(Texto::NaoPodeSerFeito));
+      onde_.Recusar(Diario(), Traduzir(Texto::NaoPodeSerFeito));
+      return false;
     }
     const auto tropeco = Mudar(MovimentosDe(mudanca_), mudanca_.Antes, mudanca_.Depois);
-    if (!tropeco) return;
+    if (!tropeco) return true;
     if (tropeco->DeVolta) platform::DeleteFileA(Diario());
     onde_.Recusar(tropeco->Arquivo,
                   tropeco->DeVolta ? Traduzir(Texto::NaoPodeMudar) : Traduzir(Texto::MudouEmParte, {Diario()}));
+    return false;
   }
 
   void Contar(bool Simulada) const {
@@ -80,7 +82,6 @@ void Nomear(const Pedido& Feito, Relato& Onde) {
   if (!simular) ApagarRestos(DirPrograma);
   Renomeacao renomeacao(Onde);
   renomeacao.Preparar(Feito.Arquivos[0]);
-  if (Onde.Recusados() == 0 && !simular && renomeacao.MudaAlgo()) renomeacao.Fazer();
-  if (Onde.Recusados() > 0) return;
-  renomeacao.Contar(simular);
+  if (Onde.Recusados() > 0) return Onde.Linha(Traduzir(Texto::NadaMudou));
+  if (simular || !renomeacao.MudaAlgo() || renomeacao.Fazer()) renomeacao.Contar(simular);
 }

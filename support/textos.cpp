@@ -90,6 +90,7 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "Pacotes bons: %; recusados: %.",
     "Nomes mudados: %; figuras: %. Nomes que já eram esses: %.",
     "Nomes que mudariam: %; figuras: %. Nomes que já são esses: %.",
+    "Nada mudou.",
     "Guarde este arquivo para desfazer: %",
     "Desfeito. Figuras que voltaram: %.",
     "Tudo já estava como antes.",

@@ -89,6 +89,7 @@ enum class Texto {
   PacotesVerificados,
   NomesMudados,
   NomesMudariam,
+  NadaMudou,
   ParaDesfazer,
   Desfeito,
   NadaADesfazer,

@@ -108,7 +108,7 @@ TEST_F(Naming, OneLineThatCannotBeKeepsAllFromBeingDone) {
     PutFile(List, "dos;nome\nNOITE;Tarde\n"s + lines);
     const Files before = Standing();
     for (const Texts& more : {Texts{}, Texts{"--simular"}}) {
-      EXPECT_EQ(Name(more), (Outcome{1, "", "C:\\nomes.csv"s + refused}));
+      EXPECT_EQ(Name(more), (Outcome{1, "Nada mudou.\n", "C:\\nomes.csv"s + refused}));
       EXPECT_EQ(Standing(), before);
     }
   }
@@ -131,7 +131,7 @@ TEST_F(Naming, WhatAnotherProgramHasOpenStaysAsItIs) {
     PutCollection();
     const Files before = Standing();
     LockFile(path);
-    EXPECT_EQ(Name(), (Outcome{1, "", refused}));
+    EXPECT_EQ(Name(), (Outcome{1, "Nada mudou.\n", refused}));
     EXPECT_EQ(Standing(), before);
   }
   Renew();

@@ -119,7 +119,7 @@ TEST_F(Tvk, NamesGamesWhileNobodyHasTheCatalogueOpenAndTakesItBack) {
       "C:\\Ensaio\\tolvaris.dat: est\xC3\xA1 aberto em outro programa, ou n\xC3\xA3o pode ser gravado; "
       "feche o Tolvaris\n"};
   Start();
-  EXPECT_EQ(RunTvk(name), refused);
+  EXPECT_EQ(RunTvk(name), (Ended{1, "Nada mudou.\n", refused.Errors}));
   program.reset();
   const Ended named = RunTvk(name);
   EXPECT_EQ(named.Status, 0u) << named.Errors;
