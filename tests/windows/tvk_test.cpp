@@ -1,5 +1,6 @@
 // The keeper's tool, run as on a console, and what other programs make of its packages.
 #include <array>
+#include <cstdlib>
 #include <filesystem>
 
 #include "tests/windows/installation.h"
@@ -160,6 +161,8 @@ TEST_F(Tvk, PublishesWhatOtherProgramsConfirm) {
   EXPECT_NE(first.Output.find(" da chave: " + print), std::string::npos);
   const std::string read = Machine("python3 '" READ_REPOSITORY_PY "' r");
   EXPECT_EQ(read.substr(0, 17), "Clube S\xC3\xA3o Jo\xC3\xA3o ") << read;
+  EXPECT_LT(std::abs(std::stoll(Machine("date +%s")) - std::stoll(read.substr(17))), 60)
+      << "the serial number is the time";
   EXPECT_EQ(read.substr(read.find('\n')), "\nA\xC3\xA7\xC3\xA3o\nDois\n");
   EXPECT_EQ(Machine("cd r && for f in */*; do n=${f#*/}; sha256sum $f | grep -q ^${n%.*} || echo $f; done"), "");
 
