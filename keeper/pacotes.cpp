@@ -29,9 +29,9 @@ Texto MotivoDe(DefeitoDoPacote Defeito) {
 }
 
 // Reads one package after the other into the same memory.
-class Leitor {
+class LeitorDePacotes {
  public:
-  explicit Leitor(const ComPacote& Fazer) : fazer_(Fazer) {}
+  explicit LeitorDePacotes(const ComPacote& Fazer) : fazer_(Fazer) {}
 
   // Whatever goes wrong unexpectedly is a want of memory.
   Motivos LerEFazer(const std::string& Arquivo) {
@@ -65,7 +65,7 @@ class Leitor {
 void ParaCadaPacote(const Pedido& Feito, Relato& Onde, const ComPacote& Fazer, const DepoisDoPacote& Depois) {
   std::vector<std::string> pacotes;
   for (const std::string& argumento : Feito.Arquivos) AcrescentarPacotes(pacotes, argumento, Onde);
-  Leitor leitor(Fazer);
+  LeitorDePacotes leitor(Fazer);
   Onde.Comecar(pacotes.size());
   for (const std::string& arquivo : pacotes) {
     const Motivos porque = leitor.LerEFazer(arquivo);
