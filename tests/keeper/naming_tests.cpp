@@ -12,9 +12,13 @@ struct Naming : Keeper {
     for (const std::string& each : pictures) PutFile(Pictures + platform::FromUtf8(each), "picture " + each);
   }
 
-  // Two games that change names with each other, a chain of three, and others.
+  // Two games that change names with each other, a chain of three, one of two that have a name and a picture, and
+  // others.
   static void PutCollection() {
-    PutFile(Catalogue, "|DIA=Dia||NOITE=Noite||velho||UM=Um||DOIS=Dois||TRES=Três||OUTRO=Outro|"_ansi);
+    PutFile(Catalogue,
+            "|DIA=Dia||NOITE=Noite||velho||UM=Um||DOIS=Dois||TRES=Três||OUTRO=Outro||PAR=Par||IMPAR=Par|"_ansi);
+    PutGame("PAR", {"Par.gif"});
+    PutGame("IMPAR");
     PutGame("DIA", {"dia.GIF", "Dia.jpg"});
     PutGame("NOITE", {"Noite.gif"});
     PutGame("UM", {"Um.bmp"});
@@ -25,7 +29,7 @@ struct Naming : Keeper {
     PutFile(Target + "Saves\\DIA.srm", "saved");
     PutFile(List,
             "dos;nome\r\ndia;Noite\r\nNOITE;Dia\r\nUM;Dois\r\nDOIS;Três\r\nTRES;Quatro\r\nSEM;sem\r\n"
-            "OUTRO;Outro\r\n");
+            "OUTRO;Outro\r\nIMPAR;Impar\r\n");
   }
 
   static Outcome Name(const Texts& more = {}) {
@@ -53,7 +57,8 @@ Files Renamed(Files files) {
   for (const auto& [from, to] : moves) {
     renamed[Pictures + platform::FromUtf8(to)] = files.at(Pictures + platform::FromUtf8(from));
   }
-  renamed[Catalogue] = "|DIA=Noite||NOITE=Dia||UM=Dois||DOIS=Três||TRES=Quatro||SEM=sem||velho||OUTRO=Outro|"_ansi;
+  renamed[Catalogue] =
+      "|DIA=Noite||NOITE=Dia||UM=Dois||DOIS=Três||TRES=Quatro||SEM=sem||IMPAR=Impar||velho||OUTRO=Outro||PAR=Par|"_ansi;
   return renamed;
 }
 
@@ -67,19 +72,19 @@ TEST_F(Naming, PicturesFollowSavesStayAndAllOfItComesBack) {
   EXPECT_EQ(told.Status, 0) << told.Errors;
   EXPECT_EQ(told.Output,
             "DIA       Dia -> Noite\nNOITE     Noite -> Dia\nUM        Um -> Dois\nDOIS      Dois -> Três\n"
-            "TRES      Três -> Quatro\nSEM       SEM -> sem\n"
+            "TRES      Três -> Quatro\nSEM       SEM -> sem\nIMPAR     Par -> Impar\n"
             "          C:\\T\\Imgs\\dia.GIF -> Noite.GIF\n          C:\\T\\Imgs\\Dia.jpg -> Noite.jpg\n"
             "          C:\\T\\Imgs\\Noite.gif -> Dia.gif\n          C:\\T\\Imgs\\Um.bmp -> Dois.bmp\n"
             "          C:\\T\\Imgs\\Dois.bmp -> Três.bmp\n          C:\\T\\Imgs\\Dois.png -> Três.png\n"
             "          C:\\T\\Imgs\\Três.bmp -> Quatro.bmp\n          C:\\T\\Imgs\\SEM.jpg -> sem.jpg\n"
-            "Nomes mudados: 6; figuras: 8. Nomes que já eram esses: 1.\n"
+            "Nomes mudados: 7; figuras: 8. Nomes que já eram esses: 1.\n"
             "Guarde este arquivo para desfazer: C:\\T\\desfazer-2026-11-23.txt\n");
   const std::size_t summary = told.Output.find("Nomes mudados");
   EXPECT_EQ(
       simulated,
-      (Outcome{0, told.Output.substr(0, summary) + "Nomes que mudariam: 6; figuras: 8. Nomes que já são esses: 1.\n",
+      (Outcome{0, told.Output.substr(0, summary) + "Nomes que mudariam: 7; figuras: 8. Nomes que já são esses: 1.\n",
                ""}));
-  EXPECT_EQ(Name().Output, "Nomes mudados: 0; figuras: 0. Nomes que já eram esses: 7.\n");
+  EXPECT_EQ(Name().Output, "Nomes mudados: 0; figuras: 0. Nomes que já eram esses: 8.\n");
   EXPECT_EQ(TakeBack(), (Outcome{0, "Desfeito. Figuras que voltaram: 8.\n", ""}));
   EXPECT_EQ(WithoutUndo(Standing()), before);
   EXPECT_EQ(Name().Output.substr(told.Output.size() - 24), "desfazer-2026-11-23-2.txt\n") << "no undo file is replaced";
