@@ -3,6 +3,7 @@
 Usage: check_sources.py [BUILD...]: with build directories, every source must be compiled in one of them.
 """
 
+import collections
 import json
 import pathlib
 import re
@@ -17,6 +18,7 @@ LIBRARY = re.compile(r"^\s*tolvaris_folder\((\w+)\s+(\w+)[\w/]*([^)]*)\)", re.MU
 SYSTEM_HEADERS = re.compile(r"(platform|tests|benchmarks)/windows/|tests/contract/\w+_windows\.cpp$")
 TWIN_HEADERS = ("platform/simulated/", "tests/", "benchmarks/")
 INCLUDE = re.compile(r'^\s*#\s*include\s*[<"]([^>"]+)[>"]')
+USING = re.compile(r"^\s*using (?:\w+::)+(\w+);")
 
 
 def project_files():
@@ -61,7 +63,10 @@ def check_source(name, below):
     lines = (ROOT / name).read_text(encoding="utf-8").splitlines()
     if len(lines) > LONGEST:
         yield name, len(lines), f"is longer than {LONGEST} lines"
+    words = collections.Counter(re.findall(r"\w+", "\n".join(lines)))
     for number, line in enumerate(lines, 1):
+        if name.endswith(".cpp") and (match := USING.match(line)) and words[match[1]] < 2:
+            yield name, number, f"uses no {match[1]}"
         if match := INCLUDE.match(line):
             for fault in check_include(name, match[1], below):
                 yield name, number, fault
