@@ -11,12 +11,12 @@
 
 namespace {
 
-constexpr std::string_view PrimeiraLinha = "tvk nomear 1\r\n", FimDeLinha = "\r\n";
+constexpr std::string_view PrimeiraLinha = "tvk nomear 1\r\n", Quebra = "\r\n";
 
 std::string SomaDe(std::string_view Texto) {
   std::array<char, 16> soma{};
   std::snprintf(soma.data(), soma.size(), "%08X", static_cast<unsigned>(~CRC32::Atualizar(CRC32::Inicial, Texto)));
-  return soma.data() + std::string(FimDeLinha);
+  return soma.data() + std::string(Quebra);
 }
 
 std::int64_t TamanhoDe(const TextoDoCatalogo& Texto) { return Texto ? std::ssize(*Texto) : -1; }
@@ -71,7 +71,7 @@ class LeitorDeDiario {
 
 std::string LinhaDe(const FiguraMudada& Qual) {
   return std::to_string(Qual.Conteudo.Tamanho) + " " + std::to_string(Qual.Conteudo.Soma) + " " + Qual.De + "|" +
-         Qual.Provisorio + "|" + Qual.Para + std::string(FimDeLinha);
+         Qual.Provisorio + "|" + Qual.Para + std::string(Quebra);
 }
 
 FiguraMudada LerFigura(LeitorDeDiario& Texto) {
@@ -80,7 +80,7 @@ FiguraMudada LerFigura(LeitorDeDiario& Texto) {
   figura.Conteudo.Soma = static_cast<std::uint32_t>(Texto.Numero(" "));
   figura.De = Texto.Nome("|");
   figura.Provisorio = Texto.Nome("|");
-  figura.Para = Texto.Nome(FimDeLinha);
+  figura.Para = Texto.Nome(Quebra);
   return figura;
 }
 
@@ -89,10 +89,10 @@ FiguraMudada LerFigura(LeitorDeDiario& Texto) {
 std::string EmTexto(const Mudanca& Qual) {
   std::string texto = std::string(PrimeiraLinha) + std::to_string(TamanhoDe(Qual.Antes)) + " " +
                       std::to_string(TamanhoDe(Qual.Depois)) + " " + std::to_string(Qual.Figuras.size());
-  texto += FimDeLinha;
+  texto += Quebra;
   for (const FiguraMudada& cada : Qual.Figuras) texto += LinhaDe(cada);
   texto += Qual.Antes.value_or("") + Qual.Depois.value_or("");
-  texto += FimDeLinha;
+  texto += Quebra;
   return texto + SomaDe(texto);
 }
 
@@ -103,12 +103,12 @@ std::optional<Mudanca> DeTexto(std::string_view Texto) {
   Texto.remove_suffix(tamanhoDaSoma);
   if (SomaDe(Texto) != soma) return std::nullopt;
   LeitorDeDiario leitor(Texto.substr(PrimeiraLinha.size()));
-  const std::int64_t antes = leitor.Numero(" "), depois = leitor.Numero(" "), figuras = leitor.Numero(FimDeLinha);
+  const std::int64_t antes = leitor.Numero(" "), depois = leitor.Numero(" "), figuras = leitor.Numero(Quebra);
   Mudanca lida;
   for (std::int64_t i = 0; i < figuras && leitor.Certo(); ++i) lida.Figuras.push_back(LerFigura(leitor));
   lida.Antes = leitor.Catalogo(antes);
   lida.Depois = leitor.Catalogo(depois);
-  leitor.Nome(FimDeLinha);
+  leitor.Nome(Quebra);
   if (!leitor.Certo() || !leitor.NoFim() || !lida.Depois || lida.Depois->empty()) return std::nullopt;
   return lida;
 }

@@ -51,13 +51,13 @@ std::vector<JogoMudado> Diferencas(const std::vector<JogoPublicado>& Antes, cons
   for (const auto& [nomeDOS, jogo] : depois) {
     const auto igual = antes.find(nomeDOS);
     if (igual == antes.end()) {
-      mudados.push_back({Mudanca::Novo, nomeDOS, jogo->Nome});
+      mudados.push_back({Novidade::Novo, nomeDOS, jogo->Nome});
     } else if (*igual->second != *jogo) {
-      mudados.push_back({Mudanca::Mudou, nomeDOS, jogo->Nome});
+      mudados.push_back({Novidade::Mudou, nomeDOS, jogo->Nome});
     }
   }
   for (const auto& [nomeDOS, jogo] : antes) {
-    if (!depois.contains(nomeDOS)) mudados.push_back({Mudanca::Saiu, nomeDOS, jogo->Nome});
+    if (!depois.contains(nomeDOS)) mudados.push_back({Novidade::Saiu, nomeDOS, jogo->Nome});
   }
   std::ranges::stable_sort(mudados, {}, &JogoMudado::NomeDOS);
   return mudados;

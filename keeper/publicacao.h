@@ -26,10 +26,10 @@ std::optional<EntradaDoRepositorio> NovaEntrada(const std::optional<EntradaDoRep
 bool PodeFicar(const std::optional<EntradaDoRepositorio>& Anterior, const EntradaDoRepositorio& Nova,
                std::int64_t Agora);
 
-enum class Mudanca { Novo, Mudou, Saiu };
+enum class Novidade { Novo, Mudou, Saiu };
 
 struct JogoMudado {
-  Mudanca Como;
+  Novidade Como;
   std::string NomeDOS, Nome;  // UTF-8
 };
 

@@ -18,8 +18,6 @@
 
 namespace {
 
-constexpr const char* NomeDaEntrada = "entrada.txt";
-
 // A package that is to be published, without its bytes: only one of them is in memory at a time.
 struct Colhido {
   std::string Arquivo;
@@ -82,11 +80,11 @@ class Editora {
       linha.resize(std::max(linha.size() + 1, largura), ' ');
       onde_.Linha(linha + EmColunaDOS(mudado.NomeDOS) + platform::FromUtf8(mudado.Nome));
     }
-    const auto quantos = [&](Mudanca Como) {
+    const auto quantos = [&](Novidade Como) {
       return std::to_string(std::ranges::count(mudados_, Como, &JogoMudado::Como));
     };
-    onde_.Linha(Traduzir(Texto::JogosNoRepositorio, {std::to_string(jogos_.size()), quantos(Mudanca::Novo),
-                                                     quantos(Mudanca::Mudou), quantos(Mudanca::Saiu)}));
+    onde_.Linha(Traduzir(Texto::JogosNoRepositorio, {std::to_string(jogos_.size()), quantos(Novidade::Novo),
+                                                     quantos(Novidade::Mudou), quantos(Novidade::Saiu)}));
   }
 
   void Concluir() const {
@@ -172,7 +170,7 @@ class Editora {
     return texto && destino_.Por(NomeDaEntrada, *texto, existente, onde_);
   }
 
-  static Texto PalavraDe(Mudanca Como) {
+  static Texto PalavraDe(Novidade Como) {
     constexpr Texto palavras[] = {Texto::JogoNovo, Texto::JogoMudou, Texto::JogoSaiu};
     return palavras[static_cast<int>(Como)];
   }

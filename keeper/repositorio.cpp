@@ -13,8 +13,6 @@
 
 namespace {
 
-constexpr const char* NomeDaEntrada = "entrada.txt";
-
 // The directories of the files that are called as their hash, and how those end.
 struct Pasta {
   std::string_view Nome, Padrao;

@@ -33,7 +33,7 @@ std::vector<Passo> PassosDe(const Mudanca& Qual) {
 
 constexpr Impressao Ilegivel = {-1, 0};  // of what is there, or may be, and cannot be read
 
-std::optional<Impressao> NoDisco(const std::string& Nome) {
+std::optional<Impressao> ImpressaoNoDisco(const std::string& Nome) {
   if (!platform::FileSize(DirImgs + Nome)) return std::nullopt;
   return ImpressaoDe(DirImgs + Nome).value_or(Ilegivel);
 }
@@ -45,7 +45,7 @@ class Comparacao {
     for (const Passo& passo : passos_) {
       for (const std::string& nome : {passo.Qual.De, passo.Qual.Para}) {
         esperado_[Chave(nome)].reset();
-        if (!achado_.contains(Chave(nome))) achado_[Chave(nome)] = NoDisco(nome);
+        if (!achado_.contains(Chave(nome))) achado_[Chave(nome)] = ImpressaoNoDisco(nome);
       }
     }
     for (const FiguraMudada& cada : Qual.Figuras) esperado_[Chave(cada.De)] = cada.Conteudo;

@@ -12,6 +12,7 @@
 #include "repository/estrofes.h"
 #include "repository/valores.h"
 
+inline constexpr const char* NomeDaEntrada = "entrada.txt";
 inline constexpr std::size_t MaiorEntrada = 64 << 10, MaiorIndice = 16 << 20;  // bytes
 inline constexpr std::int64_t MaiorSerie = 999'999'999'999'999;
 inline constexpr std::size_t MaisEspelhos = 8;

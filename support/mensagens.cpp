@@ -12,7 +12,7 @@ using enum Mensagem;
 using enum platform::Buttons;
 using enum platform::Icon;
 
-constexpr DescricaoDeMensagem Tabela[] = {
+constexpr DescricaoDeMensagem TabelaDeMensagens[] = {
     {SemConfiguracao,
      "SemConfiguracao",
      {"O Tolvaris não foi configurado.", Peca::Linha, "Clique em 'Sim' para rodar o programa de auto-configuração."},
@@ -165,11 +165,11 @@ constexpr DescricaoDeMensagem Tabela[] = {
     {ErroAoGravarAjustes, "ErroAoGravarAjustes", {"Não foi possível gravar a configuração."}, "Erro", Ok, Critical},
 };
 
-const DescricaoDeMensagem& Descricao(Mensagem Qual) { return Tabela[static_cast<std::size_t>(Qual)]; }
+const DescricaoDeMensagem& Descricao(Mensagem Qual) { return TabelaDeMensagens[static_cast<std::size_t>(Qual)]; }
 
 constexpr bool EstaEmOrdem() {
-  for (std::size_t i = 0; i < std::size(Tabela); ++i) {
-    if (Tabela[i].Qual != static_cast<Mensagem>(i)) return false;
+  for (std::size_t i = 0; i < std::size(TabelaDeMensagens); ++i) {
+    if (TabelaDeMensagens[i].Qual != static_cast<Mensagem>(i)) return false;
   }
   return true;
 }
@@ -177,7 +177,7 @@ static_assert(EstaEmOrdem(), "the table is read by position");
 
 }  // namespace
 
-std::span<const DescricaoDeMensagem> TodasAsMensagens() { return Tabela; }
+std::span<const DescricaoDeMensagem> TodasAsMensagens() { return TabelaDeMensagens; }
 
 bool EhTexto(std::string_view Peca) {
   constexpr std::string_view outras[] = {"", Peca::Linha, Peca::Paragrafo, Peca::Branco, Peca::Valor};

@@ -13,14 +13,14 @@ namespace {
 
 using namespace std::string_view_literals;
 
-constexpr std::size_t TamanhoBuffer = 255;  // of the chosen path, with its closing NUL
+constexpr std::size_t TamanhoDoCaminho = 255;  // of the chosen path, with its closing NUL
 constexpr std::string_view TodosOsArquivos = "Todos os arquivos (*.*)\0*.*\0"sv;
 
 using Dialogo = bool (*)(platform::OpenFileName&);
 
 // The name with blanks behind it, so that the buffer is filled.
 std::string ComBrancos(const std::string& Nome) {
-  constexpr std::size_t maximo = TamanhoBuffer - 1;
+  constexpr std::size_t maximo = TamanhoDoCaminho - 1;
   return Nome + std::string(Nome.size() < maximo ? maximo - Nome.size() : 1, ' ');
 }
 
@@ -28,7 +28,7 @@ std::string Perguntar(Dialogo Mostrar, platform::OpenFileName Pedido, std::strin
   if (Filtro.empty()) Filtro = TodosOsArquivos;
   Pedido.Filter = Filtro;
   Pedido.File = ComBrancos(Pedido.File);
-  Pedido.FileSize = TamanhoBuffer;
+  Pedido.FileSize = TamanhoDoCaminho;
   if (!Mostrar(Pedido)) return "";
   const std::string_view escolhido = Pedido.File;
   return std::string(SemBrancos(escolhido.substr(0, escolhido.find('\0')), " "));

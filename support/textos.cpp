@@ -8,7 +8,7 @@
 
 namespace {
 
-constexpr auto Tabela = std::to_array<std::string_view>({
+constexpr auto TabelaDeTextos = std::to_array<std::string_view>({
     "Carregando...",
     "Jogador 1",
     "Jogador 2",
@@ -192,13 +192,15 @@ constexpr auto Tabela = std::to_array<std::string_view>({
     "há agora outra figura com o nome de antes",
     "a figura não está mais lá",
 });
-static_assert(Tabela.size() == static_cast<std::size_t>(Texto::FiguraSumiu) + 1, "a text for each name");
+static_assert(TabelaDeTextos.size() == static_cast<std::size_t>(Texto::FiguraSumiu) + 1, "a text for each name");
 
 }  // namespace
 
-std::span<const std::string_view> TodosOsTextos() { return Tabela; }
+std::span<const std::string_view> TodosOsTextos() { return TabelaDeTextos; }
 
-std::string Traduzir(Texto Qual) { return Traduzir(platform::FromUtf8(Tabela[static_cast<std::size_t>(Qual)])); }
+std::string Traduzir(Texto Qual) {
+  return Traduzir(platform::FromUtf8(TabelaDeTextos[static_cast<std::size_t>(Qual)]));
+}
 
 std::string Traduzir(Texto Qual, std::initializer_list<std::string> Valores) {
   std::string texto = Traduzir(Qual);

@@ -42,9 +42,7 @@ void Sleep(std::uint32_t milliseconds) { TheMachine().Slept += milliseconds; }
 namespace platform::simulated {
 
 EventLevel::EventLevel(bool pendingEventsRun)
-    : outer_(std::exchange(TheMachine().PendingEventsRun, pendingEventsRun)) {}
-
-EventLevel::~EventLevel() { TheMachine().PendingEventsRun = outer_; }
+    : pendingEventsRun_(TheMachine().PendingEventsRun), outer_(std::exchange(pendingEventsRun_, pendingEventsRun)) {}
 
 void QueueEvent(std::function<void()> event) {
   TheMachine().Events.push_back({++TheMachine().EventsQueued, std::move(event)});

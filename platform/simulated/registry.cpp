@@ -23,7 +23,7 @@ constexpr long Success = 0, NotFound = 2, AccessDenied = 5, InvalidHandle = 6, N
 constexpr std::uint32_t MayQuery = 1, MaySet = 2, FullAccess = 0xF003F;
 constexpr std::string_view ComputerName = "SIMULADO";
 
-const RegistryHandle* Opened(RegistryKey key) {
+const RegistryHandle* OpenedKey(RegistryKey key) {
   static const RegistryHandle root{"", FullAccess};
   if (key == RootKey(RootCurrentUser)) return &root;
   const auto found = TheMachine().RegistryHandles.find(key);
@@ -41,7 +41,7 @@ RegistryKey NewHandle(const std::string& path, std::uint32_t access) {
 // What can be said before an operation looks at the key itself.
 long CheckHandle(RegistryKey key, std::uint32_t access) {
   if (Fails()) return InputOutputFailed;
-  const RegistryHandle* handle = Opened(key);
+  const RegistryHandle* handle = OpenedKey(key);
   if (!handle) return InvalidHandle;
   if (!Stands(handle->Path)) return KeyDeleted;
   return (handle->Access & access) == access ? Success : AccessDenied;
@@ -91,14 +91,14 @@ long RegConnectRegistryA(const std::string& computerName, RegistryKey root, Regi
   if (const long error = CheckHandle(root, 0)) return error;
   const std::string name = CharUpperBuffA(computerName.substr(computerName.starts_with("\\\\") ? 2 : 0));
   if (!computerName.empty() && name != ComputerName) return NoSuchComputer;
-  result = NewHandle(Opened(root)->Path, FullAccess);
+  result = NewHandle(OpenedKey(root)->Path, FullAccess);
   return Success;
 }
 
 long RegOpenKeyExA(RegistryKey parent, const std::string& subkey, std::uint32_t access, RegistryKey& result) {
   if (const long error = CheckHandle(parent, 0)) return error;
   if (subkey.starts_with('\\')) return BadPath;
-  const std::string path = Below(Opened(parent)->Path, subkey);
+  const std::string path = Below(OpenedKey(parent)->Path, subkey);
   if (!Stands(path)) return NotFound;
   if (TheMachine().DeniedKeys.contains(path)) return AccessDenied;
   result = NewHandle(path, access);
@@ -108,7 +108,7 @@ long RegOpenKeyExA(RegistryKey parent, const std::string& subkey, std::uint32_t 
 long RegCreateKeyA(RegistryKey parent, const std::string& subkey, RegistryKey& result) {
   if (const long error = CheckHandle(parent, 0)) return error;
   if (subkey.starts_with('\\')) return BadPath;
-  const std::string above = Opened(parent)->Path, path = Below(above, subkey);
+  const std::string above = OpenedKey(parent)->Path, path = Below(above, subkey);
   if (TheMachine().DeniedKeys.contains(path)) return AccessDenied;
   CreateKeys(above, subkey);
   result = NewHandle(path, FullAccess);
@@ -118,7 +118,7 @@ long RegCreateKeyA(RegistryKey parent, const std::string& subkey, RegistryKey& r
 long RegQueryValueExA(RegistryKey key, const std::string& valueName, std::uint32_t& type, void* data,
                       std::uint32_t& size) {
   if (const long error = CheckHandle(key, MayQuery)) return error;
-  const auto record = TheMachine().Registry.find(Opened(key)->Path);
+  const auto record = TheMachine().Registry.find(OpenedKey(key)->Path);
   if (record == TheMachine().Registry.end()) return NotFound;
   const auto value = record->second.Values.find(CharUpperBuffA(valueName));
   if (value == record->second.Values.end()) return NotFound;
@@ -129,7 +129,7 @@ long RegQueryValueExA(RegistryKey key, const std::string& valueName, std::uint32
 long RegSetValueExA(RegistryKey key, const std::string& valueName, std::uint32_t type, const void* data,
                     std::uint32_t size) {
   if (const long error = CheckHandle(key, MaySet)) return error;
-  RegistryRecord& record = TheMachine().Registry[Opened(key)->Path];
+  RegistryRecord& record = TheMachine().Registry[OpenedKey(key)->Path];
   auto& value =
       record.Values.try_emplace(CharUpperBuffA(valueName), RegistryRecord::Value{valueName, {}}).first->second;
   value.Stored = {type, std::string(static_cast<const char*>(data), size)};
@@ -138,7 +138,7 @@ long RegSetValueExA(RegistryKey key, const std::string& valueName, std::uint32_t
 
 long RegDeleteKeyA(RegistryKey parent, const std::string& subkey) {
   if (const long error = CheckHandle(parent, 0)) return error;
-  const std::string path = Below(Opened(parent)->Path, subkey);
+  const std::string path = Below(OpenedKey(parent)->Path, subkey);
   auto& registry = TheMachine().Registry;
   const auto found = registry.find(path);
   if (found == registry.end()) return path.empty() ? AccessDenied : NotFound;

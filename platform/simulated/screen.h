@@ -37,11 +37,12 @@ void CountDroppedException();
 class EventLevel {
  public:
   explicit EventLevel(bool pendingEventsRun);
-  ~EventLevel();
+  ~EventLevel() { pendingEventsRun_ = outer_; }
   EventLevel(const EventLevel&) = delete;
   EventLevel& operator=(const EventLevel&) = delete;
 
  private:
+  bool& pendingEventsRun_;  // the machine's
   const bool outer_;
 };
 

@@ -2,8 +2,6 @@
 
 namespace {
 
-const std::string Target = "C:\\T\\", Catalogue = Target + "tolvaris.dat";
-
 struct Installing : Keeper {
   Installing() { SetUp(); }
 

@@ -15,6 +15,9 @@
 using Files = std::map<std::string, std::string>;  // contents by full path
 
 inline const std::string Picture = contract::SmallGif();
+// Another installation than the person's own.
+inline const std::string Target = "C:\\T\\", Catalogue = Target + "tolvaris.dat";
+
 inline const std::string Rom = "123456789", RomChecksum = "-873187034";
 
 struct Outcome {

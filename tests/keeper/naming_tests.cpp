@@ -3,7 +3,7 @@
 
 namespace {
 
-const std::string Target = "C:\\T\\", Catalogue = Target + "tolvaris.dat", Pictures = Target + "Imgs\\";
+const std::string Pictures = Target + "Imgs\\";
 const std::string Undo = Target + "desfazer-2026-11-23.txt", List = "C:\\nomes.csv";
 
 struct Naming : Keeper {

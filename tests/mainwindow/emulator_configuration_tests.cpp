@@ -4,7 +4,7 @@
 
 namespace {
 
-constexpr char Saves[] = "C:\\T\\Saves\\", Roms[] = "C:\\T\\Roms\\";
+constexpr char SaveDirectory[] = "C:\\T\\Saves\\", GameDirectory[] = "C:\\T\\Roms\\";
 const std::string SavesLine = "SaveDirectory = C:\\T\\Saves", RomsLine = "GameDirectory = C:\\T\\Roms";
 
 TEST(EmulatorConfiguration, KeepsItsTwoEntriesAndEveryOtherByte) {
@@ -31,9 +31,10 @@ TEST(EmulatorConfiguration, KeepsItsTwoEntriesAndEveryOtherByte) {
        head + "SaveDirectory = \r\n" + bytes + "GameDirectory = ", head + SavesLine + "\r\n" + bytes + RomsLine},
   };
   for (const auto& [name, before, after] : cases) {
-    const auto updated = ConfiguracaoAtualizada(before, Saves, Roms);
+    const auto updated = ConfiguracaoAtualizada(before, SaveDirectory, GameDirectory);
     EXPECT_EQ(updated.value_or(""), after) << name;
-    EXPECT_EQ(ConfiguracaoAtualizada(updated.value_or(before), Saves, Roms), std::nullopt) << name << ", again";
+    EXPECT_EQ(ConfiguracaoAtualizada(updated.value_or(before), SaveDirectory, GameDirectory), std::nullopt)
+        << name << ", again";
   }
 }
 

@@ -4,7 +4,6 @@
 namespace {
 
 const std::string So = "\x83\x5C", Po = "\x83\x7C";  // so, whose second byte is "\", and po, whose is "|"
-const std::string Added = Told(Mensagem::JogoAdicionado), Saved = Told(Mensagem::ArquivoSalvo);
 
 struct Japanese : Menu {
   Japanese() {
@@ -21,7 +20,7 @@ TEST_F(Japanese, GamesComeInArePlayedAndGoOutUnderTheirWholeNames) {
   ASSERT_TRUE(Start());
   for (const std::string& file : {So + ".zip", "x.tvk"s}) {
     ChooseFile(form->Command4, "C:\\Fora\\" + file);
-    EXPECT_EQ(TakeMessages(), Texts{Added}) << file;
+    EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::JogoAdicionado)}) << file;
   }
   EXPECT_EQ(EntriesOf(form->List1), So + "|A" + Po + So + "|");  // this machine orders letters as code page 1252 does
   EXPECT_EQ(Content(Mine + "RomDir\\" + So + ".zip"), Rom);
@@ -30,7 +29,7 @@ TEST_F(Japanese, GamesComeInArePlayedAndGoOutUnderTheirWholeNames) {
   Click(form->Command1);
   EXPECT_TRUE(StartedProcesses().back().CommandLine.ends_with("\\PONTO.zip")) << StartedProcesses().back().CommandLine;
   ChooseFile(form->Command5, "C:\\y.tvk");
-  EXPECT_EQ(TakeMessages(), Texts{Saved});
+  EXPECT_EQ(TakeMessages(), Texts{Told(Mensagem::ArquivoSalvo)});
   EXPECT_TRUE(ShownFileDialogs().back().File.starts_with("A" + Po + So + "  "));
   EXPECT_EQ(Content("C:\\y.tvk"), Content("C:\\Fora\\x.tvk"));
 }

@@ -3,7 +3,7 @@
 
 namespace {
 
-const std::string Path = Home + "tolvarisdownload.exe";
+const std::string DownloaderPath = Home + "tolvarisdownload.exe";
 constexpr ULONGLONG Soon = 2500;  // milliseconds: the program looks once a second, and this machine may be busy
 
 class Downloader : public Installation {};
@@ -18,7 +18,8 @@ TEST_F(Downloader, GivesTheWindowBackWithTheGamesThatItBrought) {
   Start();
   const HANDLE wake = CreateEventA(nullptr, TRUE, FALSE, "TolvarisDownload");
   Click(Download);
-  EXPECT_EQ(NextCall(Path), (Call{Path + " " + Number(*window) + "@" + Number(window->List), "C:\\Ensaio"}));
+  EXPECT_EQ(NextCall(DownloaderPath),
+            (Call{DownloaderPath + " " + Number(*window) + "@" + Number(window->List), "C:\\Ensaio"}));
   EXPECT_FALSE(window->Enabled());
   EXPECT_EQ(window->Text(), "...");
   EXPECT_EQ(Selected(), "");
