@@ -76,8 +76,7 @@ std::optional<std::string> Form1::DirSavesDoJogo() {
   if (Check1.Value() != 1) return DirSaves;
   if (EsperarDisquete()) return "A:\\";
   Check1.SetFocus();
-  Ativar(true);
-  if (List1.Selected() != -1) Ativar(false);
+  Ativar(List1.Selected() == -1);
   return std::nullopt;
 }
 

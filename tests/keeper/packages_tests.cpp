@@ -100,7 +100,7 @@ TEST_F(Packages, AreTakenApartUnderTheirNamesAndNothingOfThePersonsIsReplaced) {
   PutFile("C:\\a.tvk", Package("Um Jogo", "UM"));
   PutFile("C:\\b.tvk", Package("Dois", "DOIS", zip, contract::SmallJpeg(), "1787690592"));
   PutFile("C:\\c.tvk", Package("Mau", "MAU", "123456788"));
-  PutFile("C:\\saida\\UM.smc", "o meu");
+  PutFile("C:\\saida\\UM.smc", "123456780");  // as long as the game
   Files expected = Standing();
   expected["C:\\saida\\Um Jogo.gif"] = Picture;
   expected["C:\\saida\\DOIS.zip"] = zip;

@@ -43,6 +43,16 @@ TEST(Csv, IsReadAsPeopleAndProgramsWriteIt) {
 // Bytes that stand for the number, the lowest first.
 using contract::Low;
 
+TEST(Zip, SaysWhatIsInIt) {
+  const std::string zip = FazerZip("a.smc", std::string(1000, 'x')).value_or("");
+  ASSERT_GT(zip.size(), 100U);
+  const std::size_t end = zip.size() - 22;
+  EXPECT_EQ(zip.substr(22, 4), Low(1000, 4)) << "the length of the ROM";
+  EXPECT_EQ(zip.substr(26, 2), Low(5, 2)) << "the length of its name";
+  EXPECT_EQ(zip.substr(end + 8, 4), Low(1, 2) + Low(1, 2)) << "the number of entries";
+  EXPECT_EQ(zip.substr(end + 12, 4), Low(46 + 5, 4)) << "the length of the directory";
+}
+
 TEST(Zip, OfOthersIsTakenOnlyWholeAndItsCommentGrows) {
   const std::string made = FazerZip("a.smc", Rom).value_or("");
   EXPECT_EQ(made, FazerZip("a.smc", Rom)) << "the same bytes each time";

@@ -26,6 +26,7 @@ TEST_F(List, ShowsRomFilesUnderTheirCatalogueNames) {
   EXPECT_EQ(form->IndiceJogo("SUPER JOGO"), 2) << "the first of two rows of one name";
   EXPECT_EQ(form->IndiceJogo("aÇÃO"_ansi), 0);
   EXPECT_EQ(form->IndiceJogo("leiame"), -1);
+  for (const int noRow : {-1, 6}) EXPECT_EQ(form->CaminhoImagem(noRow), "") << noRow;
 }
 
 TEST_F(List, SelectsTheLastGamePlayedAndWithoutItLeavesOnlyTheCommandsThatNeedNoGame) {

@@ -62,6 +62,9 @@ TEST_F(Services, AProgramStartsWithItsPriorityInItsDirectory) {
     EXPECT_EQ(process.Directory, used);
     EXPECT_EQ(process.CreationFlags, priorityClass);
   }
+  std::string ofShare;  // where this machine finds nothing
+  ExecutarPrograma("C:\\Emu\\emu.exe \\\\srv\\Roms\\Um.smc", 100, false, 2, ofShare);
+  EXPECT_EQ(ofShare, "\\\\srv\\Roms\\");
   EXPECT_EQ(SleptMilliseconds(), 0U);
   EXPECT_EQ(PendingEventRuns(), 0);
 }
