@@ -45,6 +45,16 @@ TEST_F(NativeWindow, KeepsAControlsNameForReadersAlsoWhereWindowsTakesNone) {
   EXPECT_EQ(Seen(), "list | row 1, unchecked, choice 0");
 }
 
+TEST_F(NativeWindow, GivesEachControlItsFontFromTheBeginning) {
+  const auto heightOf = [](const Control& control) {
+    LOGFONTA font = {};
+    const auto handle = reinterpret_cast<HGDIOBJ>(::SendMessageA(control.State().Handle, WM_GETFONT, 0, 0));
+    return ::GetObjectA(handle, sizeof font, &font) != 0 ? font.lfHeight : 0;
+  };
+  EXPECT_EQ(heightOf(list), -::MulDiv(83, static_cast<int>(GetDpiForSystem()), 720));
+  EXPECT_EQ(heightOf(button), -::MulDiv(180, static_cast<int>(GetDpiForSystem()), 720));
+}
+
 // As beside a taskbar at the left and at the top.
 TEST_F(NativeWindow, StandsWhereItWouldWithoutATaskbar) {
   RECT before = {};
