@@ -86,7 +86,7 @@ TEST_F(Files, AreOldOrNewWhateverFailsAndWhenThePowerIsCut) {
       {"a longer one", "velho", write("conteudo novo", 1, true), "conteudo novo"},
       {"a shorter one", "conteudo velho", write("novo", 0, true), "novo"},
       {"all of it, at the end", "velho", write("novo", -1, true), "novo"},
-      {"all of it, later", "velho", write("novo", 3, true), "\0\0novo"s},
+      {"all of it, at the second byte", "velho", write("novo", 2, true), "\0novo"s},
       {"one that must not exist", std::nullopt, replace(Existing::Keep), "novo"},
       {"written without deleting", std::nullopt, write("novo", 1, false), "novo", true},
       {"at the end", "velho", write(" e novo", -1, false), "velho e novo", true},
